@@ -1,0 +1,29 @@
+/* korcontrols: custom window controls for Windows CE handhelds and Windows desktops.
+ *
+ * This header names what belongs to no single control. Each control has a header of its own:
+ *
+ *   <korcontrols/grid.h>    the spreadsheet grid
+ *   <korcontrols/header.h>  the header strip that the grid uses for its letters and numbers
+ *
+ * All headers are plain C (C90 and later) and C++. All text is UTF-16. All functions use the C
+ * calling convention and are called from the one thread that owns the controls' windows.         */
+#ifndef KORCONTROLS_KORCONTROLS_H
+#define KORCONTROLS_KORCONTROLS_H
+
+#include <windows.h>
+
+#define KORCONTROLS_API __cdecl
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+
+/* Version of the library: the two low decimal digits of its release, 49 for this one.
+ *   result  49; a host that needs a later library compares with "less than"                      */
+LONG KORCONTROLS_API KORCONTROLS_Version(void);
+
+#ifdef __cplusplus
+}
+#endif
+
+#endif /* KORCONTROLS_KORCONTROLS_H */
