@@ -1,0 +1,88 @@
+#include "grid/grid_drawing.h"
+
+#include "grid/grid_notify.h"
+#include "grid/grid_sizes.h"
+#include "grid/grid_visible.h"
+#include "platform/gdi_scopes.h"
+#include "platform/windows_helpers.h"
+#include "zoom/zoom.h"
+
+namespace kor {
+
+namespace {
+
+void DrawLine(HDC dc, int fromX, int fromY, int toX, int toY) {
+    const POINT ends[] = {{fromX, fromY}, {toX, toY}};
+    Polyline(dc, ends, 2);
+}
+
+// Client y where the vertical lines end, and x where the horizontal ones do: at the edge of the area,
+// or, with the sheet's last row or column on screen, at that row's or column's edge.
+int VerticalLinesEnd(const RECT& area) {
+    const int endRow = grid.firstVisibleRow + grid.visibleRowCount;
+    return endRow == kRowLimit ? RowTop(endRow) : area.bottom;
+}
+
+int HorizontalLinesEnd(const RECT& area) {
+    const int endColumn = grid.firstVisibleColumn + grid.visibleColumnCount;
+    return endColumn == kColumnLimit ? ColumnLeft(endColumn) : area.right;
+}
+
+void DrawVerticalLines(HDC dc, const RECT& area) {
+    const int end = VerticalLinesEnd(area);
+    int x = grid.cellsLeft;
+    for (int i = 0; i <= grid.visibleColumnCount && x < area.right; ++i) {
+        const int next = x + ColumnWidth(grid.firstVisibleColumn + i);
+        if (next >= area.left) DrawLine(dc, x, area.top, x, end);
+        x = next;
+    }
+}
+
+void DrawHorizontalLines(HDC dc, const RECT& area) {
+    const int end = HorizontalLinesEnd(area);
+    int y = grid.cellsTop;
+    for (int i = 0; i <= grid.visibleRowCount && y < area.bottom; ++i) {
+        const int next = y + RowHeight(grid.firstVisibleRow + i);
+        if (next >= area.top) DrawLine(dc, area.left, y, end, y);
+        y = next;
+    }
+}
+
+}  // namespace
+
+void DrawGridLines(HDC dc, HPEN pen, const RECT& area) {
+    PatBlt(dc, area.left, area.top, area.right - area.left, area.bottom - area.top, WHITENESS);
+    if (grid.gridLinesHidden) return;
+    SelectScope linePen(dc, pen);
+    DrawVerticalLines(dc, area);
+    DrawHorizontalLines(dc, area);
+}
+
+void InvertBlock(const GridSelection& block, Invalidate invalidate) {
+    const VisibleSpan columns =
+        SelectedSpan(ColumnAxis(), block.left, block.right, grid.firstVisibleColumn,
+                     grid.visibleColumnCount, zoomLevel);
+    const VisibleSpan rows = SelectedSpan(RowAxis(), block.top, block.bottom, grid.firstVisibleRow,
+                                          grid.visibleRowCount, zoomLevel);
+    if (!columns.touches || !rows.touches) return;
+    const int left = grid.cellsLeft + columns.offset;
+    const int top = grid.cellsTop + rows.offset;
+    PatBlt(grid.memoryDC, left, top, columns.length, rows.length, DSTINVERT);
+    if (invalidate == Invalidate::yes) {
+        InvalidateArea(grid.hwndGrid, {left, top, left + columns.length, top + rows.length});
+    }
+}
+
+void InvertSelection(Invalidate invalidate) { InvertBlock(grid.selection, invalidate); }
+
+void RedrawCells(const RECT& area) {
+    InvertSelection(Invalidate::no);
+    DrawGridLines(grid.memoryDC, grid.gridLinePen, area);
+    NotifyPaintCells();
+    InvertSelection(Invalidate::no);
+    InvalidateArea(grid.hwndGrid, area);
+}
+
+void RedrawClient() { RedrawCells(ClientRectOf(grid.hwndGrid)); }
+
+}  // namespace kor

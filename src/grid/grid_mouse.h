@@ -1,0 +1,18 @@
+// Selecting with the left button or the stylus, and scrolling while it is held near an edge.
+#pragma once
+
+#include "grid/grid_state.h"
+
+namespace kor {
+
+constexpr UINT_PTR kAutoScrollTimerId = 10101;
+
+// Client positions: `x` read unsigned, `y` signed.
+LRESULT OnGridButtonDown(WPARAM keys, int x, int y);
+LRESULT OnGridPointerMove(int x, int y);
+LRESULT OnGridButtonUp(WPARAM keys);
+
+// One step of the timer that runs while the button is down.
+void OnAutoScroll();
+
+}  // namespace kor

@@ -1,0 +1,90 @@
+// While a border is dragged, an inverted line follows it. It is drawn on the window itself, so the
+// next copy from the image removes what is left of it.
+#include "grid/grid_resize.h"
+
+#include "grid/grid_drawing.h"
+#include "grid/grid_headers.h"
+#include "grid/grid_notify.h"
+#include "grid/grid_sizes.h"
+#include "platform/gdi_scopes.h"
+#include "platform/windows_helpers.h"
+#include "zoom/zoom.h"
+
+namespace kor {
+
+namespace {
+
+void InvertColumnLine(HDC dc, const RECT& client) {
+    if (grid.resizeLinePos == kNoResizeLine) return;
+    PatBlt(dc, grid.resizeLinePos, client.top, 1, client.bottom - client.top, DSTINVERT);
+}
+
+void InvertRowLine(HDC dc, const RECT& client) {
+    if (grid.resizeLinePos == kNoResizeLine) return;
+    PatBlt(dc, client.left, grid.resizeLinePos, client.right - client.left, 1, DSTINVERT);
+}
+
+// Pixels from the first visible index to this one, as the redraw rectangles have it: without the
+// header's width or height, and exact at 100 % zoom only.
+int RedrawStart(const GridAxis& axis, int first, int index) {
+    return RoughOffset(axis, index, zoomLevel) - RoughOffset(axis, first, zoomLevel);
+}
+
+void ResizeColumn(int item, uint16_t units) {
+    const int column = grid.firstVisibleColumn + item;
+    if (item >= grid.visibleColumnCount) {
+        StoreColumnWidth(column, units);
+        return;
+    }
+    RECT area = ClientRectOf(grid.hwndGrid);
+    InvertColumnLine(grid.memoryDC, area);
+    StoreColumnWidth(column, units);
+    UpdateColumnHeader(area.right);
+    grid.resizeLinePos = kNoResizeLine;
+    area.left = RedrawStart(ColumnAxis(), grid.firstVisibleColumn, column);
+    RedrawCells(area);
+}
+
+// One row further than the visible ones is redrawn as well; columns stop at the last visible one.
+void ResizeRow(int item, uint16_t units) {
+    const int row = grid.firstVisibleRow + item;
+    if (item > grid.visibleRowCount) {
+        StoreRowHeight(row, units);
+        return;
+    }
+    RECT area = ClientRectOf(grid.hwndGrid);
+    InvertRowLine(grid.memoryDC, area);
+    StoreRowHeight(row, units);
+    UpdateRowHeaderOverCells();
+    area.top = RedrawStart(RowAxis(), grid.firstVisibleRow, row);
+    grid.resizeLinePos = kNoResizeLine;
+    RedrawCells(area);
+}
+
+}  // namespace
+
+LRESULT OnHeaderResizing(HWND header, int position) {
+    const bool isColumn = header == grid.hwndColumnHeader;
+    if (!isColumn && header != grid.hwndRowHeader) return 0;
+    const RECT client = ClientRectOf(grid.hwndGrid);
+    const auto invertLine = isColumn ? InvertColumnLine : InvertRowLine;
+    WindowDC window(grid.hwndGrid);
+    invertLine(window.get(), client);
+    grid.resizeLinePos = (isColumn ? grid.cellsLeft : grid.cellsTop) + position;
+    invertLine(window.get(), client);
+    return 0;
+}
+
+LRESULT OnHeaderResized(HWND header, int item, int units) {
+    const auto size = static_cast<uint16_t>(units);
+    if (header == grid.hwndColumnHeader) {
+        ResizeColumn(item, size);
+        NotifyColumnResized(grid.firstVisibleColumn + item, units);
+    } else if (header == grid.hwndRowHeader) {
+        ResizeRow(item, size);
+        NotifyRowResized(grid.firstVisibleRow + item, units);
+    }
+    return 0;
+}
+
+}  // namespace kor

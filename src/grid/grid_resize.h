@@ -1,0 +1,15 @@
+// What the grid does while and after a header border is dragged.
+#pragma once
+
+#include "grid/grid_state.h"
+
+namespace kor {
+
+// HCN_ITEMRESIZING: draws the tracking line. `position` is the pointer along the header strip.
+LRESULT OnHeaderResizing(HWND header, int position);
+
+// HCN_ITEMRESIZED: keeps the new size, redraws what moved and tells the parent. `item` counts from
+// the first visible column or row.
+LRESULT OnHeaderResized(HWND header, int item, int units);
+
+}  // namespace kor

@@ -1,0 +1,35 @@
+// The selected block and its anchor.
+#pragma once
+
+#include "grid/grid_state.h"
+
+namespace kor {
+
+// Whether a block lies within the sheet and is not turned round.
+constexpr bool IsValidRange(const GridSelection& block) {
+    return block.left <= block.right && block.right < kColumnLimit && block.top <= block.bottom &&
+           block.bottom < kRowLimit;
+}
+
+bool IsSame(const GridSelection& a, const GridSelection& b);
+
+// The smallest block with both cells.
+GridSelection BlockBetween(int columnA, int rowA, int columnB, int rowB);
+
+bool IsAnchored();
+void ClearAnchor();
+
+// Whether there is a current cell; there always is, unless the view's origin has become negative.
+bool HasCurrentCell();
+
+// Takes the highlight from the old block and gives it to the new one, on screen at the next paint.
+void ShowSelection(const GridSelection& block);
+
+// HCN_ITEMCLICK: selects the whole columns or rows between two items of a header, which count from
+// the first visible one. The parent is not told, and the anchor stays.
+LRESULT OnHeaderClick(HWND header, int itemA, int itemB);
+
+// The corner button.
+LRESULT SelectAll();
+
+}  // namespace kor

@@ -1,0 +1,15 @@
+#include "grid/grid_state.h"
+
+#include "zoom/zoom.h"
+
+namespace kor {
+
+constinit GridState grid;
+
+void InitialiseGridState() {
+    grid.focusWindow = grid.hwndGrid;
+    grid.cellsLeft = grid.rowHeaderWidth;
+    grid.columnHeaderHeight = 4 * zoomLevel;
+}
+
+}  // namespace kor

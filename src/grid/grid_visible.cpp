@@ -1,0 +1,61 @@
+#include "grid/grid_visible.h"
+
+#include "grid/grid_sizes.h"
+#include "platform/windows_helpers.h"
+
+namespace kor {
+
+GridVisibleRange VisibleRange() {
+    return {static_cast<WORD>(grid.firstVisibleColumn),
+            static_cast<WORD>(grid.firstVisibleColumn + grid.visibleColumnCount),
+            static_cast<WORD>(grid.firstVisibleRow),
+            static_cast<WORD>(grid.firstVisibleRow + grid.visibleRowCount)};
+}
+
+bool IsCellVisible(int column, int row) {
+    return column >= grid.firstVisibleColumn &&
+           column < grid.firstVisibleColumn + grid.visibleColumnCount &&
+           row >= grid.firstVisibleRow && row < grid.firstVisibleRow + grid.visibleRowCount;
+}
+
+bool IsCellCompletelyVisible(int column, int row) {
+    if (!IsCellVisible(column, row)) return false;
+    const bool inLastColumn = column == grid.firstVisibleColumn + grid.visibleColumnCount - 1;
+    const bool inLastRow = row == grid.firstVisibleRow + grid.visibleRowCount - 1;
+    if (!inLastColumn && !inLastRow) return true;
+    const RECT client = ClientRectOf(grid.hwndGrid);
+    const RECT box = CellBox(column, row);
+    return box.right <= client.right && box.bottom <= client.bottom;
+}
+
+int ColumnLeft(int column) {
+    return grid.cellsLeft + ColumnsWidth(grid.firstVisibleColumn, column);
+}
+
+int RowTop(int row) { return grid.cellsTop + RowsHeight(grid.firstVisibleRow, row); }
+
+RECT CellBox(int column, int row) {
+    const int left = ColumnLeft(column);
+    const int top = RowTop(row);
+    return {left, top, left + ColumnWidth(column), top + RowHeight(row)};
+}
+
+}  // namespace kor
+
+extern "C" void KORCONTROLS_API GetVisibleRange(GridVisibleRange* range) {
+    if (range) *range = kor::VisibleRange();
+}
+
+extern "C" DWORD KORCONTROLS_API GetNumberOfVisibleColumns(void) {
+    return kor::grid.visibleColumnCount;
+}
+
+extern "C" DWORD KORCONTROLS_API GetNumberOfVisibleRows(void) { return kor::grid.visibleRowCount; }
+
+extern "C" DWORD KORCONTROLS_API IsIndexVisible(CellIndex cell) {
+    return kor::IsCellVisible(KORGRID_CELLCOLUMN(cell), KORGRID_CELLROW(cell));
+}
+
+extern "C" DWORD KORCONTROLS_API IsIndexCompletelyVisible(CellIndex cell) {
+    return kor::IsCellCompletelyVisible(KORGRID_CELLCOLUMN(cell), KORGRID_CELLROW(cell));
+}

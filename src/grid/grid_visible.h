@@ -1,0 +1,24 @@
+// Which cells are visible.
+#pragma once
+
+#include "grid/grid_state.h"
+
+namespace kor {
+
+GridVisibleRange VisibleRange();
+
+// Whether a column and row lie in the visible range, a partly visible last one included.
+bool IsCellVisible(int column, int row);
+
+// Whether the cell lies whole inside the client area.
+bool IsCellCompletelyVisible(int column, int row);
+
+// A cell's box in client coordinates: right and bottom are the next cells' left and top. The cell is
+// a visible one.
+RECT CellBox(int column, int row);
+
+// Client x of a column, or y of a row, from the first visible one on.
+int ColumnLeft(int column);
+int RowTop(int row);
+
+}  // namespace kor

@@ -1,0 +1,99 @@
+#include "header/header_record.h"
+
+#include <korcontrols/header.h>
+
+#include "platform/local_heap.h"
+
+namespace kor {
+
+constinit HeaderDrag headerDrag;
+constinit HeaderPaintObjects headerPaint = {};
+
+namespace {
+
+constexpr COLORREF kFrameColour = RGB(128, 128, 128);
+
+constinit HeaderRecord* firstRecord = nullptr;
+
+void CreatePaintObjects() {
+    if (!headerPaint.framePen) headerPaint.framePen = CreatePen(PS_SOLID, 1, kFrameColour);
+    if (!headerPaint.faceBrush) {
+        headerPaint.faceBrush = CreateSolidBrush(SystemColour(COLOR_BTNFACE | kSystemColourFlag));
+    }
+}
+
+void DeletePaintObjects() {
+    if (headerPaint.framePen) DeleteObject(headerPaint.framePen);
+    if (headerPaint.faceBrush) DeleteObject(headerPaint.faceBrush);
+    headerPaint = {};
+}
+
+// Frees the arrays, the DC and the record itself. Labels may lie in any place, also past the count.
+void FreeRecord(HeaderRecord* record) {
+    if (record->texts) {
+        for (uint32_t i = 0; i <= record->capacity; ++i) {
+            if (record->texts[i]) LocalFree(record->texts[i]);
+        }
+        LocalFree(record->texts);
+    }
+    if (record->sizes) LocalFree(record->sizes);
+    if (record->states) LocalFree(record->states);
+    if (record->dc) ReleaseDC(record->window, record->dc);
+    LocalFree(record);
+}
+
+void Append(HeaderRecord* record) {
+    HeaderRecord** link = &firstRecord;
+    while (*link) link = &(*link)->next;
+    *link = record;
+}
+
+void Unlink(const HeaderRecord* record) {
+    HeaderRecord** link = &firstRecord;
+    while (*link && *link != record) link = &(*link)->next;
+    if (*link) *link = record->next;
+}
+
+}  // namespace
+
+HeaderRecord* FindHeaderRecord(HWND window) {
+    HeaderRecord* record = firstRecord;
+    while (record && record->window != window) record = record->next;
+    return record;
+}
+
+HeaderRecord* CreateHeaderRecord(const CREATESTRUCTW& creation, HWND window) {
+    CreatePaintObjects();
+    auto* record = AllocateLocal<HeaderRecord>(1);
+    if (!record) return nullptr;
+    record->window = window;
+    record->parent = creation.hwndParent;
+    record->style = static_cast<uint32_t>(creation.style);
+    record->capacity = kHeaderInitialCapacity;
+    record->dc = GetDC(window);
+    record->texts = AllocateLocal<wchar_t*>(kHeaderInitialCapacity + 1);
+    record->sizes = AllocateLocal<uint16_t>(kHeaderInitialCapacity + 1);
+    record->states = AllocateLocal<uint8_t>(kHeaderInitialCapacity + 1);
+    if (!record->texts || !record->sizes || !record->states) {
+        FreeRecord(record);
+        return nullptr;
+    }
+    Append(record);
+    return record;
+}
+
+void DestroyHeaderRecord(HeaderRecord* record) {
+    Unlink(record);
+    FreeRecord(record);
+    if (!firstRecord) DeletePaintObjects();
+}
+
+bool IsVertical(const HeaderRecord& record) { return (record.style & HCS_VERTICAL) != 0; }
+
+int ItemStart(const HeaderRecord& record, uint32_t index) {
+    int start = 0;
+    for (uint32_t i = 0; i < index; ++i) start += record.sizes[i];
+    return start;
+}
+
+}  // namespace kor

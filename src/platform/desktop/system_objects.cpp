@@ -1,0 +1,8 @@
+// System colours on the desktop, whose calls do not know the flag.
+#include "platform/platform.h"
+
+namespace kor {
+
+COLORREF SystemColour(int flaggedIndex) { return GetSysColor(flaggedIndex & ~kSystemColourFlag); }
+
+}  // namespace kor

@@ -1,0 +1,78 @@
+// Scopes for drawing: each gives back in its destructor what it took, one type per way of giving
+// back. They live for the length of a function; handles that a record keeps are plain fields.
+#pragma once
+
+#include "platform/platform.h"
+
+namespace kor {
+
+// Selects an object into a DC and puts the previous one back.
+class SelectScope {
+public:
+    SelectScope(HDC dc, HGDIOBJ object) noexcept
+        : dc_(dc), previous_(object ? SelectObject(dc, object) : nullptr) {}
+    SelectScope(HDC, HRGN) = delete;  // a region is copied in, and a number comes back
+    ~SelectScope() {
+        if (previous_) SelectObject(dc_, previous_);
+    }
+    SelectScope(const SelectScope&) = delete;
+    SelectScope& operator=(const SelectScope&) = delete;
+
+private:
+    HDC dc_;
+    HGDIOBJ previous_;
+};
+
+// A pen, brush, font or bitmap that is deleted at the end. Declare it before the SelectScope that
+// selects it, so that it is no longer selected when it goes.
+template <typename Handle>
+class LocalGdiObject {
+public:
+    explicit LocalGdiObject(Handle object) noexcept : object_(object) {}
+    ~LocalGdiObject() {
+        if (object_) DeleteObject(object_);
+    }
+    LocalGdiObject(const LocalGdiObject&) = delete;
+    LocalGdiObject& operator=(const LocalGdiObject&) = delete;
+
+    Handle get() const noexcept { return object_; }
+
+private:
+    Handle object_;
+};
+
+// A window's DC. A null window gives a null DC, not the screen's.
+class WindowDC {
+public:
+    explicit WindowDC(HWND hwnd) noexcept : hwnd_(hwnd), dc_(hwnd ? GetDC(hwnd) : nullptr) {}
+    ~WindowDC() {
+        if (dc_) ReleaseDC(hwnd_, dc_);
+    }
+    WindowDC(const WindowDC&) = delete;
+    WindowDC& operator=(const WindowDC&) = delete;
+
+    HDC get() const noexcept { return dc_; }
+
+private:
+    HWND hwnd_;
+    HDC dc_;
+};
+
+// BeginPaint and EndPaint.
+class PaintScope {
+public:
+    explicit PaintScope(HWND hwnd) noexcept : hwnd_(hwnd) { dc_ = BeginPaint(hwnd_, &paint_); }
+    ~PaintScope() { EndPaint(hwnd_, &paint_); }
+    PaintScope(const PaintScope&) = delete;
+    PaintScope& operator=(const PaintScope&) = delete;
+
+    HDC dc() const noexcept { return dc_; }
+    const RECT& area() const noexcept { return paint_.rcPaint; }
+
+private:
+    HWND hwnd_;
+    HDC dc_;
+    PAINTSTRUCT paint_;
+};
+
+}  // namespace kor

@@ -1,0 +1,26 @@
+// The platform, included by everything in src/ in place of <windows.h>, and the few calls whose
+// meaning differs between Windows CE and the desktop. Each of those is declared here once and
+// defined once per platform, in src/platform/ce or src/platform/desktop.
+#pragma once
+
+#ifndef WIN32_LEAN_AND_MEAN
+#define WIN32_LEAN_AND_MEAN
+#endif
+#ifndef NOMINMAX
+#define NOMINMAX
+#endif
+#include <windows.h>
+
+#include <cstddef>
+#include <cstdint>
+
+namespace kor {
+
+// Windows CE marks an index of a system colour with this bit where an index of something else, or
+// a handle, could be meant. The library always writes it.
+constexpr int kSystemColourFlag = 0x40000000;
+
+// The system colour of a flagged index, such as COLOR_BTNFACE | kSystemColourFlag.
+COLORREF SystemColour(int flaggedIndex);
+
+}  // namespace kor

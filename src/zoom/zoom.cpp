@@ -1,0 +1,24 @@
+#include "zoom/zoom.h"
+
+namespace kor {
+
+constinit uint32_t zoomLevel = kZoomWhole;
+
+int ZoomedFontHeight(int height, uint32_t zoom) {
+    const double scaled = (zoom * 0.25) * height;
+    // A zoom beyond all sense must not overflow the number.
+    constexpr double kLimit = 32767.0;
+    if (scaled > kLimit || scaled < -kLimit) return -32767;
+    const int truncated = static_cast<int>(scaled);
+    return truncated > 0 ? -truncated : truncated;
+}
+
+HFONT CreateZoomedFont(HFONT font) {
+    LOGFONTW description = {};
+    if (!font || !GetObjectW(font, sizeof description, &description)) return nullptr;
+    description.lfHeight = ZoomedFontHeight(description.lfHeight, zoomLevel);
+    description.lfWidth = 0;
+    return CreateFontIndirectW(&description);
+}
+
+}  // namespace kor

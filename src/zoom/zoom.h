@@ -1,0 +1,27 @@
+// The zoom of the grid and of its header strips: one level for the whole process. The grid writes
+// it, the strips only read it, and neither has to know the other for that.
+#pragma once
+
+#include "platform/platform.h"
+
+namespace kor {
+
+// Quarters: 4 is 100 %, never 0.
+extern uint32_t zoomLevel;
+
+constexpr uint32_t kZoomWhole = 4;
+
+// Pixels of a size in units (pixels at 100 %); cut to 16 bits.
+constexpr uint16_t PixelsFromUnits(uint32_t units, uint32_t zoom) {
+    return static_cast<uint16_t>((units * zoom) >> 2);
+}
+
+// Height of a font at a zoom: scaled, and always a character height (negative), which is what makes
+// the letters and not their line keep the proportion.
+int ZoomedFontHeight(int height, uint32_t zoom);
+
+// A new font: `font` at the current zoom, with its own proportions. The caller deletes it. Null when
+// `font` is null or cannot be read or made.
+HFONT CreateZoomedFont(HFONT font);
+
+}  // namespace kor
