@@ -7,11 +7,11 @@
  *
  * There is one grid in a process: the functions take no window handle and act on that grid. Create
  * it as a child window of class KORGRID_CLASS with WS_CHILD | WS_VISIBLE | WS_CLIPCHILDREN, after
- * RegisterGridControl. Positions are pixels in the grid's client area; ends of the visible range are
- * exclusive, ends of a selection inclusive. Sizes "in units" are pixels at 100 % zoom.
+ * RegisterGridControl. Positions are pixels in the grid's client area; ends of the visible range
+ * are exclusive, ends of a selection inclusive. Sizes "in units" are pixels at 100 % zoom.
  *
  * Functions called before the grid's window exists, or after it is gone, keep or return what the
- * grid knows and draw nothing.                                                                     */
+ * grid knows and draw nothing. */
 #ifndef KORCONTROLS_GRID_H
 #define KORCONTROLS_GRID_H
 
@@ -26,7 +26,7 @@ extern "C" {
 #define KORGRID_COLUMNS 256
 #define KORGRID_ROWS 16384
 
-/* ---- Types ------------------------------------------------------------------------------------ */
+/* ---- Types ---- */
 
 /* A cell: column in the low 16 bits, row in the high 16 bits. */
 typedef DWORD CellIndex;
@@ -60,38 +60,39 @@ typedef struct GridCellPair {
     WORD row;
 } GridCellPair;
 
-/* ---- Notifications to the parent --------------------------------------------------------------
+/* ---- Notifications to the parent ----
  *
  * All are sent (SendMessage), so the parent handles them before the grid goes on; their results are
  * ignored, and pointers are valid during the call only. Those marked WM_NOTIFY arrive as WM_NOTIFY
  * with the code below in wParam and the data itself in lParam: lParam is NOT an NMHDR pointer, so a
  * parent with other controls looks at wParam first. (A control's id can never be confused with a
- * code as long as ids stay below 3425.)                                                            */
+ * code as long as ids stay below 3425.) */
 
 /* WM_NOTIFY: cells must be drawn. lParam: const GridVisibleRange*. The area is white and has its
- * grid lines; draw the cells of the range, then return.                                            */
+ * grid lines; draw the cells of the range, then return. */
 #define GRIDN_PAINTCELLS 3425
 
-/* WM_NOTIFY: the left button was pressed. lParam: const GridCellPair*, the cell under the pointer. */
+/* WM_NOTIFY: the left button was pressed. lParam: const GridCellPair*, the cell under the pointer.
+ */
 #define GRIDN_CELLCLICKED 3427
 
 /* WM_NOTIFY: a column's, or row's, border was dragged and let go.
- * lParam (a value): low word the new size in units, high word the absolute column or row.          */
+ * lParam (a value): low word the new size in units, high word the absolute column or row. */
 #define GRIDN_COLUMNRESIZED 3430
 #define GRIDN_ROWRESIZED 3431
 
 /* The message itself: text was committed in the equation bar.
  *   wParam  LPCWSTR, at most 255 characters; copy what you keep
  *   lParam  low word the current ROW, high word the current COLUMN (the reverse of a CellIndex)
- * A redraw of all cells follows, so the parent only stores the text.                               */
+ * A redraw of all cells follows, so the parent only stores the text. */
 #define GRIDN_EQUATIONENTERED 3432
 
 /* The message itself: an emptied equation bar was committed. wParam 0, lParam as above. The edit's
- * modified flag stays set, so a second commit sends it again.                                      */
+ * modified flag stays set, so a second commit sends it again. */
 #define GRIDN_EQUATIONEMPTY 3433
 
-/* WM_NOTIFY: the current cell may have changed (keys; Escape or "X" in the equation bar). The parent
- * shows the cell's text with KorGrid_SetEquationText. lParam: const GridCellPair*.                 */
+/* WM_NOTIFY: the current cell may have changed (keys; Escape or "X" in the equation bar). The
+ * parent shows the cell's text with KorGrid_SetEquationText. lParam: const GridCellPair*. */
 #define GRIDN_CURRENTCELL 3434
 
 /* WM_NOTIFY: a drag changed the selection. lParam: const GridSelection*. */
@@ -104,53 +105,49 @@ typedef struct GridCellPair {
 #define GRIDN_EDITFOCUS 3437
 
 /* WM_NOTIFY: the equation edit lost the focus, and commits next. lParam: 1 when a press in the grid
- * took the focus, else 0.                                                                          */
+ * took the focus, else 0. */
 #define GRIDN_EDITKILLFOCUS 3438
 
-/* Besides these the parent receives, when "fx" is pressed, a posted WM_COMMAND with the number given
- * to SetFunctionButtonMessageID, and, when Delete is pressed in the grid, a sent WM_KEYDOWN with
- * wParam VK_DELETE and lParam 1.                                                                   */
+/* Besides these the parent receives, when "fx" is pressed, a posted WM_COMMAND with the number
+ * given to SetFunctionButtonMessageID, and, when Delete is pressed in the grid, a sent WM_KEYDOWN
+ * with wParam VK_DELETE and lParam 1. */
 
-/* ---- Messages to the grid ---------------------------------------------------------------------- */
+/* ---- Messages to the grid ---- */
 
 /* GRIDM_REDRAW: lays out the headers' items again and redraws all cells.
  *   wParam, lParam  0
- *   result          0                                                                              */
+ *   result          0 */
 #define GRIDM_REDRAW 3424
 
 /* GRIDM_SETEQUATIONTEXT: shows a text in the equation bar; nothing is committed by it.
  *   wParam  passed on to the edit, 0
  *   lParam  LPCWSTR, copied
- *   result  0                                                                                      */
+ *   result  0 */
 #define GRIDM_SETEQUATIONTEXT 3429
 
-static __inline void KorGrid_Redraw(HWND grid)
-{
-    SendMessageW(grid, GRIDM_REDRAW, 0, 0);
-}
+static __inline void KorGrid_Redraw(HWND grid) { SendMessageW(grid, GRIDM_REDRAW, 0, 0); }
 
-static __inline void KorGrid_SetEquationText(HWND grid, LPCWSTR text)
-{
+static __inline void KorGrid_SetEquationText(HWND grid, LPCWSTR text) {
     SendMessageW(grid, GRIDM_SETEQUATIONTEXT, 0, (LPARAM)text);
 }
 
-/* ---- Life -------------------------------------------------------------------------------------- */
+/* ---- Life ---- */
 
 /* Registers the grid's window class under `instance`, the host's own.
- *   result  nonzero, or 0 when the class could not be registered (it already is, for example)      */
+ *   result  nonzero, or 0 when the class could not be registered (it already is, for example) */
 DWORD KORCONTROLS_API RegisterGridControl(HINSTANCE instance);
 
 /* Forgets all column widths and row heights, scrolls to A1 and empties the equation bar. Keeps the
- * selection and the zoom, and repaints nothing: call SetFirstVisibleCell(0) afterwards.            */
+ * selection and the zoom, and repaints nothing: call SetFirstVisibleCell(0) afterwards. */
 void KORCONTROLS_API ResetGrid(void);
 
-/* ---- Drawing, inside GRIDN_PAINTCELLS ------------------------------------------------------------
+/* ---- Drawing, inside GRIDN_PAINTCELLS ----
  *
  * Each does nothing for a cell outside the visible range. A cell's box is x, y to x + width,
- * y + height; its grid lines are the box's left and top edges.                                     */
+ * y + height; its grid lines are the box's left and top edges. */
 
-/* Fills the box and the lines around it (one pixel more to the right and below). The brush stays the
- * caller's; a null brush draws nothing.                                                            */
+/* Fills the box and the lines around it (one pixel more to the right and below). The brush stays
+ * the caller's; a null brush draws nothing. */
 void KORCONTROLS_API SetCellBackGroundColor(CellIndex cell, HBRUSH brush);
 
 /* Draws the box's edges whose flags have any of the low 16 bits set. The pen stays the caller's. */
@@ -168,80 +165,80 @@ void KORCONTROLS_API SetCellBorder(CellIndex cell, HPEN pen, DWORD left, DWORD r
  *   spanRight   > 0: it ends this many columns further right; < 0: it runs past the client area
  *   fitCheck    nonzero: a text too wide for the rectangle becomes a row of "#"
  *   keepSpan    nonzero: a centred text that fits stays centred over the span, not in its own cell
- * The rectangle leaves 3 pixels free on the left and right and 1 above.                            */
+ * The rectangle leaves 3 pixels free on the left and right and 1 above. */
 void KORCONTROLS_API SetCellValue(CellIndex cell, LPCWSTR text, HFONT font, COLORREF textColour,
                                   COLORREF backColour, UINT format, LONG spanLeft, LONG spanRight,
                                   DWORD fitCheck, DWORD keepSpan);
 
 /* Shows or hides the grid lines and redraws.
- *   result  1                                                                                      */
+ *   result  1 */
 DWORD KORCONTROLS_API ToggleGridLines(void);
 
-/* ---- Sizes and zoom ----------------------------------------------------------------------------- */
+/* ---- Sizes and zoom ---- */
 
 /* Sets a size in pixels at the current zoom (the low 16 bits count). Repaints nothing.
  *   column, row  counted from the first visible one
  *   result       1; 0 when there was no memory or the column or row lies outside the sheet
- * A size larger than the cell area is cut to the area less 10 (never below 0); before the grid has a
- * window nothing is cut.                                                                           */
+ * A size larger than the cell area is cut to the area less 10 (never below 0); before the grid has
+ * a window nothing is cut. */
 DWORD KORCONTROLS_API SetColumnWidth(LONG column, LONG width);
 DWORD KORCONTROLS_API SetRowHeight(LONG row, LONG height);
 
 /* Sets the zoom in quarters (4 = 100 %), lays everything out again and redraws. 0 is refused: the
  * level stays as it was.
- *   result  nonzero when the headers are hidden                                                    */
+ *   result  nonzero when the headers are hidden */
 DWORD KORCONTROLS_API SetGridZoomLevel(DWORD level);
 
 /* Shows or hides both headers and the corner button, and lays everything out again.
- *   result  nonzero when the headers are hidden now                                                */
+ *   result  nonzero when the headers are hidden now */
 DWORD KORCONTROLS_API ToggleViewStateOfHeaders(void);
 
-/* ---- Scrolling ------------------------------------------------------------------------------------ */
+/* ---- Scrolling ---- */
 
 /* Makes `cell` the top left one and redraws. Not checked: past column 255 or row 16383 no cells are
  * shown.
- *   result  1                                                                                      */
+ *   result  1 */
 DWORD KORCONTROLS_API SetFirstVisibleCell(CellIndex cell);
 
 /* Sets how many columns, or rows, the host's data has: the scroll bar's extent, at least the number
  * of visible ones.
- *   result  the scroll bar's position; the grid's window handle when there is no bar to set        */
+ *   result  the scroll bar's position; the grid's window handle when there is no bar to set */
 LONG KORCONTROLS_API SetHorizontalDataRange(LONG columns);
 LONG KORCONTROLS_API SetVerticalDataRange(LONG rows);
 
 /* Shows or hides a scroll bar. Scrolling works without it.
- *   result  1                                                                                      */
+ *   result  1 */
 DWORD KORCONTROLS_API ToggleHorizontalScrollBar(void);
 DWORD KORCONTROLS_API ToggleVerticalScrollBar(void);
 
 /* Fills *range with the visible cells; a null pointer is ignored. */
-void KORCONTROLS_API GetVisibleRange(GridVisibleRange *range);
+void KORCONTROLS_API GetVisibleRange(GridVisibleRange* range);
 
 /* How many columns, or rows, are visible, a partly visible last one included: 0 to 255. */
 DWORD KORCONTROLS_API GetNumberOfVisibleColumns(void);
 DWORD KORCONTROLS_API GetNumberOfVisibleRows(void);
 
 /* Whether a cell is in the visible range, or whole inside the client area.
- *   result  1 or 0                                                                                 */
+ *   result  1 or 0 */
 DWORD KORCONTROLS_API IsIndexVisible(CellIndex cell);
 DWORD KORCONTROLS_API IsIndexCompletelyVisible(CellIndex cell);
 
-/* ---- Selection -------------------------------------------------------------------------------------- */
+/* ---- Selection ---- */
 
 /* Selects a block and shows it; nothing is notified and the anchor for Shift stays.
  *   columns  KORGRID_PAIR(left, right)
  *   rows     KORGRID_PAIR(top, bottom)
- *   result   nonzero, or 0 (and no change) for a block that is turned round or leaves the sheet    */
+ *   result   nonzero, or 0 (and no change) for a block that is turned round or leaves the sheet */
 DWORD KORCONTROLS_API SetSelectedRanged(DWORD columns, DWORD rows);
 
 /* Fills *selection with the selected block; a null pointer is ignored. */
-void KORCONTROLS_API GetSelectedRanged(GridSelection *selection);
+void KORCONTROLS_API GetSelectedRanged(GridSelection* selection);
 
 /* Fills *cell with the current cell.
- *   result  1, or 0 (nothing written) for a null pointer or while the view's origin is negative    */
-DWORD KORCONTROLS_API GetCurrentSelectedCell(GridCellPair *cell);
+ *   result  1, or 0 (nothing written) for a null pointer or while the view's origin is negative */
+DWORD KORCONTROLS_API GetCurrentSelectedCell(GridCellPair* cell);
 
-/* ---- Equation bar ------------------------------------------------------------------------------------- */
+/* ---- Equation bar ---- */
 
 /* The equation bar's edit control, or 0 before the grid exists. It belongs to the grid. */
 HWND KORCONTROLS_API GetHandleToEquationControl(void);
@@ -253,7 +250,7 @@ HWND KORCONTROLS_API GetControlWithFocus(void);
 void KORCONTROLS_API SetFunctionButtonMessageID(DWORD id);
 
 /* Commits the equation bar as a click on "OK" does.
- *   result  0, or 1 when nothing had been typed                                                    */
+ *   result  0, or 1 when nothing had been typed */
 LONG KORCONTROLS_API PressOKButton(void);
 
 #ifdef __cplusplus

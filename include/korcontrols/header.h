@@ -10,7 +10,7 @@
  * y for a vertical one.
  *
  * A valid index is 0 to the item count, the count itself included: a spare place past the last item
- * can be set and read but is not painted. Use indexes below the count.                             */
+ * can be set and read but is not painted. Use indexes below the count. */
 #ifndef KORCONTROLS_HEADER_H
 #define KORCONTROLS_HEADER_H
 
@@ -45,26 +45,26 @@ typedef struct HeaderItemDesc {
 /* HCM_DELETEITEM: removes an item; later items move down by one.
  *   wParam  index; the item count itself removes the last item
  *   lParam  0
- *   result  1, or 0 for a bad index, an empty strip, or a strip without a record                 */
+ *   result  1, or 0 for a bad index, an empty strip, or a strip without a record */
 #define HCM_DELETEITEM (WM_USER + 2)
 
 /* HCM_SETITEM: replaces an item's label and size; its state stays.
  *   wParam  index
  *   lParam  const HeaderItemDesc*; label and size are copied
  *   result  1, or 0 for a bad index, a null pointer, no memory (the item is unchanged then), or a
- *           strip without a record                                                                */
+ *           strip without a record */
 #define HCM_SETITEM (WM_USER + 3)
 
 /* HCM_SETITEMSTATE: adds state bits, or clears them all.
  *   wParam  index
  *   lParam  HIS_SELECTED, HIS_FRAMED or both: added to those already set; 0 clears both
- *   result  1, or 0 for a bad index or a strip without a record                                  */
+ *   result  1, or 0 for a bad index or a strip without a record */
 #define HCM_SETITEMSTATE (WM_USER + 4)
 
 /* HCM_GETITEMCOUNT: counts the items.
  *   wParam  0
  *   lParam  0
- *   result  the count, or -1 for a strip without a record                                        */
+ *   result  the count, or -1 for a strip without a record */
 #define HCM_GETITEMCOUNT (WM_USER + 5)
 
 /* HCM_GETITEM: reads one item.
@@ -72,65 +72,58 @@ typedef struct HeaderItemDesc {
  *   lParam  HeaderItemDesc* to fill; its text receives a LocalAlloc copy that the caller frees
  *           with LocalFree (an empty text for an item without a label)
  *   result  1, or 0 for a bad index, a null pointer, no memory, or a strip without a record; the
- *           structure is untouched then                                                           */
+ *           structure is untouched then */
 #define HCM_GETITEM (WM_USER + 6)
 
 /* HCM_GETITEMSIZE: reads one item's size.
  *   wParam  index
  *   lParam  0
- *   result  pixels along the strip, or -1 for a bad index or a strip without a record            */
+ *   result  pixels along the strip, or -1 for a bad index or a strip without a record */
 #define HCM_GETITEMSIZE (WM_USER + 7)
 
 /* HCN_ITEMCLICK (posted to the parent): an item was pressed, or the pointer moved onto another one
  * with the button still down.
  *   wParam  the strip's window handle
- *   lParam  low word: item where the press began; high word: item under the pointer              */
+ *   lParam  low word: item where the press began; high word: item under the pointer */
 #define HCN_ITEMCLICK (WM_USER + 587)
 
 /* HCN_ITEMRESIZING (posted to the parent): an item's border is being dragged.
  *   wParam  the strip's window handle
- *   lParam  low word: where the item begins; high word: where it now ends                        */
+ *   lParam  low word: where the item begins; high word: where it now ends */
 #define HCN_ITEMRESIZING (WM_USER + 588)
 
 /* HCN_ITEMRESIZED (posted to the parent): the border was let go.
  *   wParam  the strip's window handle
- *   lParam  low word: index of the item; high word: its size in units (pixels at 100 % zoom)     */
+ *   lParam  low word: index of the item; high word: its size in units (pixels at 100 % zoom) */
 #define HCN_ITEMRESIZED (WM_USER + 589)
 
 /* The messages as functions. */
 
-static __inline int KorHeader_InsertItem(HWND header, int index, const HeaderItemDesc *item)
-{
+static __inline int KorHeader_InsertItem(HWND header, int index, const HeaderItemDesc* item) {
     return (int)SendMessageW(header, HCM_INSERTITEM, (WPARAM)index, (LPARAM)item);
 }
 
-static __inline BOOL KorHeader_DeleteItem(HWND header, int index)
-{
+static __inline BOOL KorHeader_DeleteItem(HWND header, int index) {
     return (BOOL)SendMessageW(header, HCM_DELETEITEM, (WPARAM)index, 0);
 }
 
-static __inline BOOL KorHeader_SetItem(HWND header, int index, const HeaderItemDesc *item)
-{
+static __inline BOOL KorHeader_SetItem(HWND header, int index, const HeaderItemDesc* item) {
     return (BOOL)SendMessageW(header, HCM_SETITEM, (WPARAM)index, (LPARAM)item);
 }
 
-static __inline BOOL KorHeader_SetItemState(HWND header, int index, DWORD state)
-{
+static __inline BOOL KorHeader_SetItemState(HWND header, int index, DWORD state) {
     return (BOOL)SendMessageW(header, HCM_SETITEMSTATE, (WPARAM)index, (LPARAM)state);
 }
 
-static __inline int KorHeader_GetItemCount(HWND header)
-{
+static __inline int KorHeader_GetItemCount(HWND header) {
     return (int)SendMessageW(header, HCM_GETITEMCOUNT, 0, 0);
 }
 
-static __inline BOOL KorHeader_GetItem(HWND header, int index, HeaderItemDesc *item)
-{
+static __inline BOOL KorHeader_GetItem(HWND header, int index, HeaderItemDesc* item) {
     return (BOOL)SendMessageW(header, HCM_GETITEM, (WPARAM)index, (LPARAM)item);
 }
 
-static __inline int KorHeader_GetItemSize(HWND header, int index)
-{
+static __inline int KorHeader_GetItemSize(HWND header, int index) {
     return (int)SendMessageW(header, HCM_GETITEMSIZE, (WPARAM)index, 0);
 }
 

@@ -6,7 +6,7 @@
  *   <korcontrols/header.h>  the header strip that the grid uses for its letters and numbers
  *
  * All headers are plain C (C90 and later) and C++. All text is UTF-16. All functions use the C
- * calling convention and are called from the one thread that owns the controls' windows.         */
+ * calling convention and are called from the one thread that owns the controls' windows. */
 #ifndef KORCONTROLS_KORCONTROLS_H
 #define KORCONTROLS_KORCONTROLS_H
 
@@ -19,7 +19,7 @@ extern "C" {
 #endif
 
 /* Version of the library: the two low decimal digits of its release, 49 for this one.
- *   result  49; a host that needs a later library compares with "less than"                      */
+ *   result  49; a host that needs a later library compares with "less than" */
 LONG KORCONTROLS_API KORCONTROLS_Version(void);
 
 #ifdef __cplusplus

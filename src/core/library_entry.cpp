@@ -1,6 +1,7 @@
-#include "core/library_entry.h"
-
+// What happens when a process attaches the library: state that follows from other state gets its
+// initial value, in a fixed order, before anything else can run. Nothing is left to do at detach.
 #include "grid/grid_state.h"
+#include "platform/module.h"
 
 namespace kor {
 

@@ -1,5 +1,5 @@
-// What the host draws with while it answers GRIDN_PAINTCELLS: background, border and text of a cell,
-// straight into the off-screen image.
+// What the host draws with while it answers GRIDN_PAINTCELLS: background, border and text of a
+// cell, straight into the off-screen image.
 #include <korcontrols/grid.h>
 
 #include <algorithm>
@@ -24,7 +24,8 @@ constexpr int kHashLimit = 255;
 RECT TextArea(const RECT& box, int column, LONG spanLeft, LONG spanRight) {
     RECT area = box;
     if (spanLeft > 0) {
-        const int first = std::max<int>(grid.firstVisibleColumn, column - std::min<LONG>(spanLeft, column));
+        const int first =
+            std::max<int>(grid.firstVisibleColumn, column - std::min<LONG>(spanLeft, column));
         area.left = ColumnLeft(first);
     }
     if (spanRight > 0) {
@@ -42,7 +43,8 @@ int TextWidth(HDC dc, const wchar_t* text) {
     return measured.right - measured.left;
 }
 
-// As many "#" as fit into `width` pixels; `text` has room for kHashLimit of them and the terminator.
+// As many "#" as fit into `width` pixels; `text` has room for kHashLimit of them and the
+// terminator.
 void FillWithHashes(HDC dc, int width, wchar_t* text) {
     const int hashWidth = TextWidth(dc, L"#");
     const int count = hashWidth > 0 ? std::clamp(width / hashWidth, 0, kHashLimit) : 0;

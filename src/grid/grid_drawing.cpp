@@ -16,8 +16,8 @@ void DrawLine(HDC dc, int fromX, int fromY, int toX, int toY) {
     Polyline(dc, ends, 2);
 }
 
-// Client y where the vertical lines end, and x where the horizontal ones do: at the edge of the area,
-// or, with the sheet's last row or column on screen, at that row's or column's edge.
+// Client y where the vertical lines end, and x where the horizontal ones do: at the edge of the
+// area, or, with the sheet's last row or column on screen, at that row's or column's edge.
 int VerticalLinesEnd(const RECT& area) {
     const int endRow = grid.firstVisibleRow + grid.visibleRowCount;
     return endRow == kRowLimit ? RowTop(endRow) : area.bottom;

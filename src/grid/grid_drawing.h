@@ -5,19 +5,20 @@
 
 namespace kor {
 
-// Repaints a client rectangle: whitens it, draws its lines, lets the parent paint the visible cells,
-// draws the highlight and invalidates the rectangle. The highlight must be in the image on entry.
+// Repaints a client rectangle: whitens it, draws its lines, lets the parent paint the visible
+// cells, draws the highlight and invalidates the rectangle. The highlight must be in the image on
+// entry.
 void RedrawCells(const RECT& area);
 void RedrawClient();
 
-// Whitens a client rectangle of `dc` and draws the grid lines in it. Lines are the left and top edges
-// of cells.
+// Whitens a client rectangle of `dc` and draws the grid lines in it. Lines are the left and top
+// edges of cells.
 void DrawGridLines(HDC dc, HPEN pen, const RECT& area);
 
 enum class Invalidate { no, yes };
 
-// Inverts the visible part of a block in the image, and perhaps invalidates it. Since the highlight is
-// an inversion, each block that was drawn is taken away by the same call before anything moves.
+// Inverts the visible part of a block in the image, and perhaps invalidates it. Since the highlight
+// is an inversion, each block that was drawn is taken away by the same call before anything moves.
 void InvertBlock(const GridSelection& block, Invalidate invalidate);
 
 // The same for the selection.

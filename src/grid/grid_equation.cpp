@@ -1,5 +1,5 @@
-// Whether there is something to commit is the edit's own modified flag. Leaving the edit commits, so
-// whoever moves the focus to the grid commits by that.
+// Whether there is something to commit is the edit's own modified flag. Leaving the edit commits,
+// so whoever moves the focus to the grid commits by that.
 #include "grid/grid_equation.h"
 
 #include "grid/grid_keyboard.h"
@@ -14,8 +14,8 @@ namespace kor {
 namespace {
 
 constexpr int kCommitCapacity = 256;  // characters, with the terminator
-// WM_SETTEXT has no use for its wParam: by this one a host that subclasses the edit can tell that the
-// grid makes room for a new text.
+// WM_SETTEXT has no use for its wParam: by this one a host that subclasses the edit can tell that
+// the grid makes room for a new text.
 constexpr WPARAM kClearTextMark = 256;
 
 void SetModified(bool modified) { SendMessageW(grid.hwndEquation, EM_SETMODIFY, modified, 0); }
@@ -98,8 +98,7 @@ EditAnswer OnEditMessage(UINT message, WPARAM wParam, LPARAM lParam) {
     case WM_SETFOCUS: return OnEditFocus();
     case WM_KILLFOCUS: return OnEditKillFocus();
     case WM_KEYDOWN: return OnEditKeyDown(wParam, lParam);
-    case WM_CHAR:
-        return wParam == VK_RETURN || wParam == VK_TAB ? Answer(0) : kPassOn;
+    case WM_CHAR: return wParam == VK_RETURN || wParam == VK_TAB ? Answer(0) : kPassOn;
     case WM_LBUTTONDOWN: grid.editCaretMode = true; return kPassOn;
     default: return kPassOn;
     }
@@ -180,6 +179,4 @@ extern "C" void KORCONTROLS_API SetFunctionButtonMessageID(DWORD id) {
     grid.functionButtonMessageId = id;
 }
 
-extern "C" LONG KORCONTROLS_API PressOKButton(void) {
-    return static_cast<LONG>(CommitEquation());
-}
+extern "C" LONG KORCONTROLS_API PressOKButton(void) { return static_cast<LONG>(CommitEquation()); }

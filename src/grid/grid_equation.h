@@ -1,5 +1,5 @@
-// The equation bar: an edit with its "X", "OK" and "fx" buttons. The grid hands committed text to the
-// parent and never reads it itself.
+// The equation bar: an edit with its "X", "OK" and "fx" buttons. The grid hands committed text to
+// the parent and never reads it itself.
 #pragma once
 
 #include "grid/grid_state.h"

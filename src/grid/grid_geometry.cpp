@@ -49,8 +49,8 @@ int SizeOfRange(const GridAxis& axis, int first, int end, uint32_t zoom) {
 int RoughOffset(const GridAxis& axis, int index, uint32_t zoom) {
     const uint32_t perIndex = zoom * static_cast<uint32_t>(axis.defaultSize / 4);
     int offset = static_cast<int>(perIndex * static_cast<uint32_t>(index));
-    for (const SizeOverride* entry = axis.overrides;
-         entry != EndOf(axis) && entry->index < index; ++entry) {
+    for (const SizeOverride* entry = axis.overrides; entry != EndOf(axis) && entry->index < index;
+         ++entry) {
         offset += entry->delta;
     }
     return offset;

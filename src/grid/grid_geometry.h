@@ -41,8 +41,8 @@ uint16_t UnitsFromPixels(uint16_t pixels, uint32_t zoom);
 // less 10. (Units are compared with pixels here; it has always been so.) Never below 0.
 uint16_t UnitsWithinArea(uint16_t pixels, uint32_t zoom, int area);
 
-// How many columns or rows from `first` on it takes to fill `extent` pixels, the partly visible last
-// one included: at most 255, none at or past `limit`.
+// How many columns or rows from `first` on it takes to fill `extent` pixels, the partly visible
+// last one included: at most 255, none at or past `limit`.
 int CountVisible(const GridAxis& axis, int first, int limit, int extent, uint32_t zoom);
 
 // Which index lies at a pixel position, the first one beginning at `origin`. Past the last visible

@@ -13,8 +13,8 @@ namespace kor {
 
 namespace {
 
-// A strip gets so many items: new ones are appended empty, surplus ones taken away at the front. All
-// are labelled afterwards, so it does not matter which go.
+// A strip gets so many items: new ones are appended empty, surplus ones taken away at the front.
+// All are labelled afterwards, so it does not matter which go.
 void SetItemCount(HWND header, int wanted, int defaultSize) {
     const int count = KorHeader_GetItemCount(header);
     wchar_t empty[] = L"";

@@ -25,9 +25,7 @@ void MoveSelection(Move move) {
     ShowSelection(IsValidRange(block) ? move(block) : GridSelection{0, 0, 0, 0});
 }
 
-bool IsBelowView() {
-    return grid.selection.bottom >= grid.firstVisibleRow + grid.visibleRowCount;
-}
+bool IsBelowView() { return grid.selection.bottom >= grid.firstVisibleRow + grid.visibleRowCount; }
 
 void OnLeft() {
     MoveSelection([](GridSelection block) { return MoveLeft(block, ShiftAnchor()); });
@@ -86,9 +84,7 @@ LRESULT OnAdvance(int arrowKey) {
 
 bool IsShiftDown() { return GetKeyState(VK_SHIFT) < 0; }
 
-void PressGridKey(int key) {
-    SendMessageW(grid.hwndGrid, WM_KEYDOWN, static_cast<WPARAM>(key), 1);
-}
+void PressGridKey(int key) { SendMessageW(grid.hwndGrid, WM_KEYDOWN, static_cast<WPARAM>(key), 1); }
 
 LRESULT OnGridKeyDown(WPARAM key, LPARAM flags) {
     if (key < kFirstExaminedKey || key > kLastExaminedKey) {

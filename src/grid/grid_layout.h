@@ -15,8 +15,8 @@ void LayOutAgain(LPARAM size);
 // GRIDM_REDRAW: fills the headers again and redraws the cell area.
 void RedrawHeadersAndCells();
 
-// Follows the row numbers that a new first row brings on screen: a wider or narrower row header, and
-// then a new layout.
+// Follows the row numbers that a new first row brings on screen: a wider or narrower row header,
+// and then a new layout.
 void FitRowHeaderTo(int firstRow);
 
 }  // namespace kor

@@ -1,6 +1,6 @@
-// A press sets the anchor and starts a timer; moves span the block from the anchor to the pointer; the
-// release stops the timer and clears the anchor. The anchor alone says that a drag is under way:
-// after a release with Shift held, moves without a button go on extending.
+// A press sets the anchor and starts a timer; moves span the block from the anchor to the pointer;
+// the release stops the timer and clears the anchor. The anchor alone says that a drag is under
+// way: after a release with Shift held, moves without a button go on extending.
 #include "grid/grid_mouse.h"
 
 #include <algorithm>

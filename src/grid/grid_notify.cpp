@@ -29,9 +29,7 @@ void NotifyCurrentCell() {
     NotifyWith(GRIDN_CURRENTCELL, GridCellPair{grid.selection.left, grid.selection.top});
 }
 
-void NotifySelecting() {
-    Notify(GRIDN_SELECTING, reinterpret_cast<LPARAM>(&grid.selection));
-}
+void NotifySelecting() { Notify(GRIDN_SELECTING, reinterpret_cast<LPARAM>(&grid.selection)); }
 
 void NotifySelectionDone() {
     Notify(GRIDN_SELECTIONDONE, reinterpret_cast<LPARAM>(&grid.selection));

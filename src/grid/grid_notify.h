@@ -6,9 +6,9 @@
 
 namespace kor {
 
-void NotifyPaintCells();                         // the visible range
+void NotifyPaintCells();  // the visible range
 void NotifyCellClicked(GridCellPair cell);
-void NotifyCurrentCell();                        // the selection's top left cell
+void NotifyCurrentCell();  // the selection's top left cell
 void NotifySelecting();
 void NotifySelectionDone();
 void NotifyColumnResized(int column, int units);

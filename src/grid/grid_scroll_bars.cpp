@@ -25,7 +25,8 @@ BarView RowView() {
     return {SB_VERT, grid.firstVisibleRow, grid.visibleRowCount, grid.verticalDataRange};
 }
 
-// The first index as long as the visible ones lie within the data, else the end of the visible ones.
+// The first index as long as the visible ones lie within the data, else the end of the visible
+// ones.
 int ThumbWithinData(const BarView& view) {
     const int end = view.visibleCount + view.first;
     return end <= view.dataRange ? view.first : end;
@@ -44,9 +45,7 @@ LONG SetBar(const BarView& view, int thumb) {
 }
 
 // The grid's window handle as the number that says "nothing was done".
-LONG GridHandleAsResult() {
-    return static_cast<LONG>(reinterpret_cast<LONG_PTR>(grid.hwndGrid));
-}
+LONG GridHandleAsResult() { return static_cast<LONG>(reinterpret_cast<LONG_PTR>(grid.hwndGrid)); }
 
 void ToggleBar(bool& hidden, const BarView& view) {
     hidden = !hidden;

@@ -33,8 +33,9 @@ int RowAfterScroll(int code, int thumbPosition) {
     switch (code) {
     case SB_LINEUP: return std::max(first - 1, 0);
     case SB_LINEDOWN:
-        return grid.maxVisibleRowCount + first >= kRowLimit + 1 ? -1
-                                                                : std::min(first + 1, kRowLimit - 1);
+        return grid.maxVisibleRowCount + first >= kRowLimit + 1
+                   ? -1
+                   : std::min(first + 1, kRowLimit - 1);
     case SB_PAGEUP: return std::max(first - grid.visibleRowCount, 0);
     case SB_PAGEDOWN: return std::min(first + grid.visibleRowCount - 1, kRowLimit - 1);
     default: return thumbPosition;

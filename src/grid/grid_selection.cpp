@@ -65,8 +65,8 @@ LRESULT OnHeaderClick(HWND header, int itemA, int itemB) {
 }
 
 LRESULT SelectAll() {
-    // One past the whole sheet: no selection is ever this one, so a second press on the corner button
-    // selects everything once more.
+    // One past the whole sheet: no selection is ever this one, so a second press on the corner
+    // button selects everything once more.
     constexpr GridSelection kUnselectable = {0, kColumnLimit, 0, kRowLimit};
     if (IsSame(grid.selection, kUnselectable)) {
         InvertSelection(Invalidate::yes);

@@ -13,8 +13,8 @@ namespace {
 
 constexpr uint32_t kTableStep = 16;  // entries by which a table grows
 
-// Makes sure the table can take one entry more. A table is grown when it is one entry short of full;
-// when that fails its block is lost to the grid, and so are its entries.
+// Makes sure the table can take one entry more. A table is grown when it is one entry short of
+// full; when that fails its block is lost to the grid, and so are its entries.
 bool MakeRoom(SizeOverride*& table, uint32_t& count) {
     if (!table) {
         table = AllocateLocal<SizeOverride>(kTableStep);
@@ -55,9 +55,7 @@ int IndexFrom(int first, LONG relative) {
 
 }  // namespace
 
-GridAxis ColumnAxis() {
-    return {grid.columnWidths, grid.columnOverrideCount, kDefaultColumnWidth};
-}
+GridAxis ColumnAxis() { return {grid.columnWidths, grid.columnOverrideCount, kDefaultColumnWidth}; }
 
 GridAxis RowAxis() { return {grid.rowHeights, grid.rowOverrideCount, kDefaultRowHeight}; }
 
@@ -92,9 +90,8 @@ void ForgetSizes() {
 GridCellPair CellFromPoint(int x, int y) {
     const RECT client = ClientRectOf(grid.hwndGrid);
     if (x < client.left || y < client.top) return {0, 0};
-    const int column =
-        IndexAt(ColumnAxis(), grid.firstVisibleColumn, grid.visibleColumnCount, grid.cellsLeft,
-                std::min<int>(x, client.right), zoomLevel);
+    const int column = IndexAt(ColumnAxis(), grid.firstVisibleColumn, grid.visibleColumnCount,
+                               grid.cellsLeft, std::min<int>(x, client.right), zoomLevel);
     const int row = IndexAt(RowAxis(), grid.firstVisibleRow, grid.visibleRowCount, grid.cellsTop,
                             std::min<int>(y, client.bottom), zoomLevel);
     return {static_cast<WORD>(column), static_cast<WORD>(row)};

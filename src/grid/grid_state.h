@@ -1,5 +1,5 @@
-// The one grid of the process: everything it knows. Its zoom stands in zoom/zoom.h, where the header
-// strips read it too.
+// The one grid of the process: everything it knows. Its zoom stands in zoom/zoom.h, where the
+// header strips read it too.
 #pragma once
 
 #include <korcontrols/grid.h>
@@ -30,7 +30,7 @@ struct GridState {
     HWND hwndRowHeader = nullptr;
     WNDPROC savedEditProc = nullptr;
     WNDPROC savedButtonProc = nullptr;
-    HDC memoryDC = nullptr;  // everything is drawn here; WM_PAINT copies from it
+    HDC memoryDC = nullptr;          // everything is drawn here; WM_PAINT copies from it
     HBITMAP memoryBitmap = nullptr;  // client size, selected into memoryDC
     HGDIOBJ blankBitmap = nullptr;   // what memoryDC held at first; back before memoryBitmap goes
     HPEN gridLinePen = nullptr;
@@ -49,9 +49,9 @@ struct GridState {
     GridSelection selection = {0, 0, 0, 0};
     int32_t anchorColumn = kNoAnchor;
     int32_t anchorRow = kNoAnchor;
-    int32_t cellsLeft = 0;        // client x of the first visible column; set at load
-    int32_t cellsTop = 0;         // client y of the first visible row
-    int32_t rowHeaderWidth = 30;  // 30, 35 or 40 pixels, at any zoom
+    int32_t cellsLeft = 0;            // client x of the first visible column; set at load
+    int32_t cellsTop = 0;             // client y of the first visible row
+    int32_t rowHeaderWidth = 30;      // 30, 35 or 40 pixels, at any zoom
     uint32_t columnHeaderHeight = 0;  // pixels; set at load
     int32_t equationBarHeight = 0;    // pixels
     bool headersHidden = false;

@@ -13,8 +13,8 @@ bool IsCellVisible(int column, int row);
 // Whether the cell lies whole inside the client area.
 bool IsCellCompletelyVisible(int column, int row);
 
-// A cell's box in client coordinates: right and bottom are the next cells' left and top. The cell is
-// a visible one.
+// A cell's box in client coordinates: right and bottom are the next cells' left and top. The cell
+// is a visible one.
 RECT CellBox(int column, int row);
 
 // Client x of a column, or y of a row, from the first visible one on.

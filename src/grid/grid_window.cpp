@@ -56,7 +56,8 @@ HWND CreateBarButton(const wchar_t* text, DWORD style, ChildId id, WNDPROC proce
 }
 
 void CreateChildren(HINSTANCE instance) {
-    grid.hwndEquation = CreateChild(L"EDIT", L"", WS_BORDER | ES_AUTOHSCROLL, kEquationId, instance);
+    grid.hwndEquation =
+        CreateChild(L"EDIT", L"", WS_BORDER | ES_AUTOHSCROLL, kEquationId, instance);
     SendMessageW(grid.hwndEquation, EM_LIMITTEXT, kEquationTextLimit, 0);
     grid.savedEditProc = Subclass(grid.hwndEquation, EquationEditProc);
     grid.hwndOkButton =
@@ -75,8 +76,8 @@ void SetHeaderFont() {
     LOGFONTW description = {};
     description.lfWeight = FW_BOLD;
     description.lfCharSet = DEFAULT_CHARSET;
-    // Five bytes of an 8-bit string in a wide field name no face that exists, so the system picks its
-    // own. That is wanted: headers look the same wherever there is no such face.
+    // Five bytes of an 8-bit string in a wide field name no face that exists, so the system picks
+    // its own. That is wanted: headers look the same wherever there is no such face.
     memcpy(description.lfFaceName, "Arial", 5);
     HFONT font = CreateFontIndirectW(&description);
     if (!font) return;
@@ -97,7 +98,8 @@ void CreateImageDC() {
 // Places nothing: WM_SIZE follows and does.
 LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
     if (!creation) return 0;
-    RegisterHeaderClass(creation->hInstance);  // fails when it already is, and need not succeed then
+    RegisterHeaderClass(
+        creation->hInstance);  // fails when it already is, and need not succeed then
     grid.hwndParent = creation->hwndParent;
     grid.hwndGrid = hwnd;
     CreateChildren(creation->hInstance);

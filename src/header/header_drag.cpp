@@ -1,6 +1,6 @@
-// One press or border drag is tracked at a time, in `headerDrag`. The strip under the button has the
-// capture, so moves and the release come to it; should another strip receive them all the same, an
-// item that it has not is ignored.
+// One press or border drag is tracked at a time, in `headerDrag`. The strip under the button has
+// the capture, so moves and the release come to it; should another strip receive them all the same,
+// an item that it has not is ignored.
 #include "header/header_drag.h"
 
 #include <korcontrols/header.h>
@@ -69,9 +69,10 @@ void EndResize(const HeaderRecord& header) {
     if (!HasItem(header, resized)) return;
     const auto item = static_cast<uint32_t>(resized);
     PostToParent(header, HCN_ITEMRESIZED, resized, UnitsFromPixels(header.sizes[item], zoomLevel));
-    // The start is multiplied by the bare zoom level: usually too far along, and the parent repaints
-    // the strip anyway.
-    InvalidateFrom(header, static_cast<int>(zoomLevel * static_cast<uint32_t>(ItemStart(header, item))));
+    // The start is multiplied by the bare zoom level: usually too far along, and the parent
+    // repaints the strip anyway.
+    InvalidateFrom(header,
+                   static_cast<int>(zoomLevel * static_cast<uint32_t>(ItemStart(header, item))));
 }
 
 }  // namespace

@@ -6,9 +6,9 @@
 namespace kor {
 
 struct HeaderHit {
-    int item;         // under the pointer; -1 past all items
-    bool onBorder;    // within the grip zone of a border
-    int borderItem;   // the item that ends at that border; -1 for the strip's own start
+    int item;        // under the pointer; -1 past all items
+    bool onBorder;   // within the grip zone of a border
+    int borderItem;  // the item that ends at that border; -1 for the strip's own start
 };
 
 // The grip zone of a border: its 5 pixels before and the 6 from it onward. Where items are narrower

@@ -16,8 +16,8 @@ bool IsBadIndex(const HeaderRecord& header, int index) {
 wchar_t* CopyLabel(const wchar_t* text) {
     const size_t length = text ? wcslen(text) : 0;
     // Twice what a wide string needs; hosts have always been given this much room.
-    auto* copy = reinterpret_cast<wchar_t*>(
-        AllocateLocal<uint32_t>(static_cast<uint32_t>(length) + 1));
+    auto* copy =
+        reinterpret_cast<wchar_t*>(AllocateLocal<uint32_t>(static_cast<uint32_t>(length) + 1));
     if (copy && text) memcpy(copy, text, length * sizeof(wchar_t));
     return copy;
 }

@@ -6,13 +6,14 @@
 
 namespace kor {
 
-// Owned by the module list from WM_CREATE to WM_DESTROY. The three item arrays always have one place
-// more than `capacity` says: an index equal to the count is a valid one, even when the strip is full.
+// Owned by the module list from WM_CREATE to WM_DESTROY. The three item arrays always have one
+// place more than `capacity` says: an index equal to the count is a valid one, even when the strip
+// is full.
 struct HeaderRecord {
-    HWND window;      // the key of the list
-    HWND parent;      // receives all notifications
-    HDC dc;           // of the window, kept for its life; everything is painted with it
-    uint32_t count;   // items in use
+    HWND window;     // the key of the list
+    HWND parent;     // receives all notifications
+    HDC dc;          // of the window, kept for its life; everything is painted with it
+    uint32_t count;  // items in use
     uint32_t capacity;
     wchar_t** texts;  // labels, each a local-heap block or null
     uint16_t* sizes;  // pixels along the strip

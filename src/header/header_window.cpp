@@ -28,7 +28,8 @@ LRESULT OnDestroy(HeaderRecord& header) {
 }
 
 LRESULT OnSize(const HeaderRecord& header, WPARAM how, LPARAM size) {
-    UpdateSizeBounds(header, LowWord(static_cast<WPARAM>(size)), HighWord(static_cast<WPARAM>(size)));
+    UpdateSizeBounds(header, LowWord(static_cast<WPARAM>(size)),
+                     HighWord(static_cast<WPARAM>(size)));
     return DefWindowProcW(header.window, WM_SIZE, how, size);
 }
 

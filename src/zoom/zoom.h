@@ -20,8 +20,8 @@ constexpr uint16_t PixelsFromUnits(uint32_t units, uint32_t zoom) {
 // the letters and not their line keep the proportion.
 int ZoomedFontHeight(int height, uint32_t zoom);
 
-// A new font: `font` at the current zoom, with its own proportions. The caller deletes it. Null when
-// `font` is null or cannot be read or made.
+// A new font: `font` at the current zoom, with its own proportions. The caller deletes it. Null
+// when `font` is null or cannot be read or made.
 HFONT CreateZoomedFont(HFONT font);
 
 }  // namespace kor
