@@ -81,11 +81,17 @@ typedef struct GridCellPair {
 #define GRIDN_COLUMNRESIZED 3430
 #define GRIDN_ROWRESIZED 3431
 
+#define KORGRID_RESIZEDSIZE(lParam) LOWORD(lParam)
+#define KORGRID_RESIZEDINDEX(lParam) HIWORD(lParam)
+
 /* The message itself: text was committed in the equation bar.
  *   wParam  LPCWSTR, at most 255 characters; copy what you keep
  *   lParam  low word the current ROW, high word the current COLUMN (the reverse of a CellIndex)
  * A redraw of all cells follows, so the parent only stores the text. */
 #define GRIDN_EQUATIONENTERED 3432
+
+#define KORGRID_EQUATIONROW(lParam) LOWORD(lParam)
+#define KORGRID_EQUATIONCOLUMN(lParam) HIWORD(lParam)
 
 /* The message itself: an emptied equation bar was committed. wParam 0, lParam as above. The edit's
  * modified flag stays set, so a second commit sends it again. */
