@@ -9,6 +9,7 @@
 #include "grid/grid_visible.h"
 #include "platform/gdi_scopes.h"
 #include "platform/windows_helpers.h"
+#include "text/text_run.h"
 #include "zoom/zoom.h"
 
 namespace kor {
@@ -37,16 +38,10 @@ RECT TextArea(const RECT& box, int column, LONG spanLeft, LONG spanRight) {
     return {area.left + kTextMargin, area.top + kTextTop, area.right - kTextMargin, area.bottom};
 }
 
-int TextWidth(HDC dc, const wchar_t* text) {
-    RECT measured = {};
-    DrawTextW(dc, text, -1, &measured, DT_CALCRECT);
-    return measured.right - measured.left;
-}
-
 // As many "#" as fit into `width` pixels; `text` has room for kHashLimit of them and the
 // terminator.
 void FillWithHashes(HDC dc, int width, wchar_t* text) {
-    const int hashWidth = TextWidth(dc, L"#");
+    const int hashWidth = TextRun(dc, L"#").Width();
     const int count = hashWidth > 0 ? std::clamp(width / hashWidth, 0, kHashLimit) : 0;
     std::fill_n(text, count, L'#');
     text[count] = L'\0';
@@ -61,18 +56,19 @@ struct CellText {
 
 void DrawCellText(HDC dc, const RECT& box, RECT area, const CellText& cell) {
     const int width = area.right - area.left;
-    if (cell.fitCheck && width < TextWidth(dc, cell.text)) {
+    TextRun run(dc, cell.text);
+    if (cell.fitCheck && width < run.Width()) {
         wchar_t hashes[kHashLimit + 1];
         FillWithHashes(dc, width, hashes);
-        DrawTextW(dc, hashes, -1, &area, kDefaultFormat);
+        TextRun(dc, hashes).Draw(area, kDefaultFormat);
         return;
     }
     const bool mayShrink = !cell.fitCheck && !cell.keepSpan && (cell.format & DT_CENTER);
-    if (mayShrink && TextWidth(dc, cell.text) < width) {
+    if (mayShrink && run.Width() < width) {
         area.left = box.left + kTextMargin;
         area.right = box.right - kTextMargin;
     }
-    DrawTextW(dc, cell.text, -1, &area, cell.format);
+    run.Draw(area, cell.format);
 }
 
 }  // namespace

@@ -5,6 +5,7 @@
 
 #include "platform/gdi_scopes.h"
 #include "platform/windows_helpers.h"
+#include "text/text_run.h"
 #include "zoom/zoom.h"
 
 namespace kor {
@@ -66,10 +67,10 @@ void DrawVerticalItem(HDC dc, const RECT& client, int top, int bottom, uint32_t 
     }
 }
 
-void DrawLabel(HDC dc, const wchar_t* text, RECT box, UINT format, uint32_t states) {
+void DrawLabel(HDC dc, const wchar_t* text, const RECT& box, UINT format, uint32_t states) {
     SetBkMode(dc, TRANSPARENT);
     SetTextColor(dc, (states & HIS_SELECTED) ? kSelectedTextColour : kTextColour);
-    DrawTextW(dc, text, -1, &box, format);
+    TextRun(dc, text).Draw(box, format);
 }
 
 void DrawItem(const HeaderRecord& header, uint32_t index, const RECT& client, int start, int end,

@@ -1,0 +1,46 @@
+// Times several ways of doing things in one process, in turns, so that whatever else the machine
+// does falls on all of them alike. Only ratios of the results mean something.
+#pragma once
+
+#include <windows.h>
+
+#include <algorithm>
+#include <functional>
+#include <string>
+#include <vector>
+
+namespace bench {
+
+struct Way {
+    std::string name;
+    std::function<void()> run;
+    double median = 0;  // microseconds
+};
+
+inline double Now() {
+    LARGE_INTEGER count;
+    LARGE_INTEGER frequency;
+    QueryPerformanceCounter(&count);
+    QueryPerformanceFrequency(&frequency);
+    return 1e6 * static_cast<double>(count.QuadPart) / static_cast<double>(frequency.QuadPart);
+}
+
+// Runs every way once per round and keeps each one's median.
+inline void TimeInTurns(std::vector<Way>& ways, int rounds) {
+    std::vector<std::vector<double>> times(ways.size());
+    for (int round = -2; round < rounds; ++round) {  // two rounds to warm up
+        for (size_t i = 0; i < ways.size(); ++i) {
+            const double start = Now();
+            ways[i].run();
+            const double taken = Now() - start;
+            if (round >= 0) times[i].push_back(taken);
+        }
+    }
+    for (size_t i = 0; i < ways.size(); ++i) {
+        auto middle = times[i].begin() + static_cast<std::ptrdiff_t>(times[i].size() / 2);
+        std::nth_element(times[i].begin(), middle, times[i].end());
+        ways[i].median = *middle;
+    }
+}
+
+}  // namespace bench

@@ -1,0 +1,32 @@
+// A text on its way into a DC, drawn with the pixels of DrawTextW and usually in half its time.
+//
+// DrawTextW looks for line breaks, tabs and prefixes and measures what it draws, also when it has
+// just been asked for the measure. A short text of one line in a plain script needs none of that:
+// one call measures it and one draws it.
+#pragma once
+
+#include "platform/platform.h"
+
+namespace kor {
+
+class TextRun {
+public:
+    // `text` is zero-terminated and outlives the run; the DC's font stays selected for as long.
+    TextRun(HDC dc, const wchar_t* text) noexcept;
+
+    // Pixels, as DrawTextW measures with DT_CALCRECT alone. Measured once.
+    int Width() noexcept;
+
+    // As DrawTextW draws with these flags, clipped to the area.
+    void Draw(const RECT& area, UINT format) noexcept;
+
+private:
+    void DrawPlain(const RECT& area, UINT format) noexcept;
+
+    HDC dc_;
+    const wchar_t* text_;
+    int plainLength_;  // characters; negative when only DrawTextW will do
+    int width_ = -1;   // not yet measured
+};
+
+}  // namespace kor
