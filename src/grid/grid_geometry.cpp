@@ -46,14 +46,14 @@ int SizeOfRange(const GridAxis& axis, int first, int end, uint32_t zoom) {
     return sum;
 }
 
-int RoughOffset(const GridAxis& axis, int index, uint32_t zoom) {
-    const uint32_t perIndex = zoom * static_cast<uint32_t>(axis.defaultSize / 4);
-    int offset = static_cast<int>(perIndex * static_cast<uint32_t>(index));
-    for (const SizeOverride* entry = axis.overrides; entry != EndOf(axis) && entry->index < index;
-         ++entry) {
-        offset += entry->delta;
+int RoughDistance(const GridAxis& axis, int first, int index, uint32_t zoom) {
+    const auto indexes = static_cast<uint32_t>(index - first);
+    uint32_t distance = zoom * static_cast<uint32_t>(axis.defaultSize / 4) * indexes;
+    for (const SizeOverride* entry = LowerBound(axis, first);
+         entry != EndOf(axis) && entry->index < index; ++entry) {
+        distance += static_cast<uint32_t>(entry->delta);
     }
-    return offset;
+    return static_cast<int>(distance);
 }
 
 uint16_t UnitsFromPixels(uint16_t pixels, uint32_t zoom) {

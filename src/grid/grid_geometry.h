@@ -30,9 +30,9 @@ int SizeOf(const GridAxis& axis, int index, uint32_t zoom);
 // Pixels of all from `first` up to, not including, `end`; 0 when the range is empty.
 int SizeOfRange(const GridAxis& axis, int first, int end, uint32_t zoom);
 
-// Position of an index counted from index 0. The overrides' deltas are added unscaled, so it is
-// exact at 100 % only; it chooses how much to redraw after a resize, and nothing else.
-int RoughOffset(const GridAxis& axis, int index, uint32_t zoom);
+// Pixels from one index to a later one. The overrides' deltas are added unscaled, so it is exact at
+// 100 % only; it chooses how much to redraw after a resize, and nothing else.
+int RoughDistance(const GridAxis& axis, int first, int index, uint32_t zoom);
 
 // What a size in pixels becomes in units, cut to 16 bits.
 uint16_t UnitsFromPixels(uint16_t pixels, uint32_t zoom);

@@ -37,7 +37,7 @@ void Place(HWND child, int x, int y, int width, int height) {
 void PlaceChildren(int width, int height) {
     const int bar = grid.equationBarHeight;
     // Headers keep their height while hidden; they are just not shown.
-    const auto headerHeight = static_cast<int>(4 * zoomLevel);
+    const int headerHeight = HeaderHeightAt(zoomLevel);
     Place(grid.hwndCancelButton, 0, 0, kButtonWidth, bar);
     Place(grid.hwndOkButton, kButtonWidth, 0, kButtonWidth, bar);
     Place(grid.hwndFunctionButton, 2 * kButtonWidth, 0, kButtonWidth, bar);
@@ -53,7 +53,7 @@ LRESULT OnGridSize() {
     const RECT client = ClientRectOf(grid.hwndGrid);
     if (client.right < 1) return 0;
     ReplaceImage(client.right, client.bottom);
-    grid.cellsTop = static_cast<int32_t>(grid.columnHeaderHeight) + grid.equationBarHeight;
+    grid.cellsTop = grid.columnHeaderHeight + grid.equationBarHeight;
     PlaceChildren(client.right, client.bottom);
     UpdateColumnHeader(client.right - grid.cellsLeft);
     UpdateRowHeader(client.bottom - grid.cellsTop);

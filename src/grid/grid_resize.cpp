@@ -24,12 +24,6 @@ void InvertRowLine(HDC dc, const RECT& client) {
     PatBlt(dc, client.left, grid.resizeLinePos, client.right - client.left, 1, DSTINVERT);
 }
 
-// Pixels from the first visible index to this one, as the redraw rectangles have it: without the
-// header's width or height, and exact at 100 % zoom only.
-int RedrawStart(const GridAxis& axis, int first, int index) {
-    return RoughOffset(axis, index, zoomLevel) - RoughOffset(axis, first, zoomLevel);
-}
-
 void ResizeColumn(int item, uint16_t units) {
     const int column = grid.firstVisibleColumn + item;
     if (item >= grid.visibleColumnCount) {
@@ -41,7 +35,8 @@ void ResizeColumn(int item, uint16_t units) {
     StoreColumnWidth(column, units);
     UpdateColumnHeader(area.right);
     grid.resizeLinePos = kNoResizeLine;
-    area.left = RedrawStart(ColumnAxis(), grid.firstVisibleColumn, column);
+    // Counted from the first cell's edge, not the window's: it begins a header's width too early.
+    area.left = RoughDistance(ColumnAxis(), grid.firstVisibleColumn, column, zoomLevel);
     RedrawCells(area);
 }
 
@@ -56,7 +51,7 @@ void ResizeRow(int item, uint16_t units) {
     InvertRowLine(grid.memoryDC, area);
     StoreRowHeight(row, units);
     UpdateRowHeaderOverCells();
-    area.top = RedrawStart(RowAxis(), grid.firstVisibleRow, row);
+    area.top = RoughDistance(RowAxis(), grid.firstVisibleRow, row, zoomLevel);
     grid.resizeLinePos = kNoResizeLine;
     RedrawCells(area);
 }

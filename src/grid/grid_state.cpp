@@ -9,7 +9,7 @@ constinit GridState grid;
 void InitialiseGridState() {
     grid.focusWindow = grid.hwndGrid;
     grid.cellsLeft = grid.rowHeaderWidth;
-    grid.columnHeaderHeight = 4 * zoomLevel;
+    grid.columnHeaderHeight = HeaderHeightAt(zoomLevel);
 }
 
 }  // namespace kor

@@ -49,11 +49,11 @@ struct GridState {
     GridSelection selection = {0, 0, 0, 0};
     int32_t anchorColumn = kNoAnchor;
     int32_t anchorRow = kNoAnchor;
-    int32_t cellsLeft = 0;            // client x of the first visible column; set at load
-    int32_t cellsTop = 0;             // client y of the first visible row
-    int32_t rowHeaderWidth = 30;      // 30, 35 or 40 pixels, at any zoom
-    uint32_t columnHeaderHeight = 0;  // pixels; set at load
-    int32_t equationBarHeight = 0;    // pixels
+    int32_t cellsLeft = 0;           // client x of the first visible column; set at load
+    int32_t cellsTop = 0;            // client y of the first visible row
+    int32_t rowHeaderWidth = 30;     // 30, 35 or 40 pixels, at any zoom
+    int32_t columnHeaderHeight = 0;  // pixels; set at load
+    int32_t equationBarHeight = 0;   // pixels
     bool headersHidden = false;
     bool horizontalScrollBarHidden = false;
     bool verticalScrollBarHidden = false;

@@ -15,8 +15,8 @@ extern "C" DWORD KORCONTROLS_API ToggleViewStateOfHeaders(void) {
     ShowWindow(grid.hwndRowHeader, show);
     ShowWindow(grid.hwndCornerButton, show);
     grid.cellsLeft = grid.headersHidden ? 0 : grid.rowHeaderWidth;
-    grid.columnHeaderHeight = grid.headersHidden ? 0 : 4 * zoomLevel;
-    grid.cellsTop = grid.equationBarHeight + static_cast<int32_t>(grid.columnHeaderHeight);
+    grid.columnHeaderHeight = grid.headersHidden ? 0 : HeaderHeightAt(zoomLevel);
+    grid.cellsTop = grid.equationBarHeight + grid.columnHeaderHeight;
     const RECT client = ClientRectOf(grid.hwndGrid);
     LayOutAgain(WordPair(client.right - grid.cellsLeft, client.bottom - grid.cellsTop));
     return grid.headersHidden;

@@ -16,6 +16,12 @@ constexpr uint16_t PixelsFromUnits(uint32_t units, uint32_t zoom) {
     return static_cast<uint16_t>((units * zoom) >> 2);
 }
 
+// Height of a column header: a default row's. An absurd zoom stops at what a window can have.
+constexpr int HeaderHeightAt(uint32_t zoom) {
+    constexpr uint32_t kTallest = 0x7FFF;
+    return static_cast<int>(zoom < kTallest / 4 ? 4 * zoom : kTallest);
+}
+
 // Height of a font at a zoom: scaled, and always a character height (negative), which is what makes
 // the letters and not their line keep the proportion.
 int ZoomedFontHeight(int height, uint32_t zoom);
