@@ -1,6 +1,7 @@
 #include "grid/grid_scrolling.h"
 
 #include <algorithm>
+#include <optional>
 
 #include "grid/grid_drawing.h"
 #include "grid/grid_headers.h"
@@ -12,30 +13,35 @@ namespace kor {
 
 namespace {
 
-// The new first column of a scroll code, or -1 when the step is refused.
-int ColumnAfterScroll(int code, int thumbPosition) {
+// The new first column of a scroll code, or none when the step is refused. A page forward while
+// nothing is visible goes to -1: there is no current cell then, until something scrolls back.
+std::optional<int> ColumnAfterScroll(int code, int thumbPosition) {
     const int first = grid.firstVisibleColumn;
     const bool atStart = first < 1;
     const bool atEnd = grid.maxVisibleColumnCount + first >= kColumnLimit + 1;
+    const int page = grid.visibleColumnCount - 1;
     switch (code) {
-    case SB_LINEUP: return atStart ? -1 : first - 1;
-    case SB_LINEDOWN: return atEnd ? -1 : std::min(first + 1, kColumnLimit - 1);
-    case SB_PAGEUP: return atStart ? -1 : std::max(first - grid.visibleColumnCount + 1, 0);
+    case SB_LINEUP:
+    case SB_PAGEUP:
+        if (atStart) return std::nullopt;
+        return std::max(first - (code == SB_LINEUP ? 1 : page), 0);
+    case SB_LINEDOWN:
     case SB_PAGEDOWN:
-        return atEnd ? -1 : std::min(first + grid.visibleColumnCount - 1, kColumnLimit - 1);
+        if (atEnd) return std::nullopt;
+        return std::min(first + (code == SB_LINEDOWN ? 1 : page), kColumnLimit - 1);
     default: return thumbPosition;
     }
 }
 
 // Rows at the top are not refused upward steps: the view is redrawn where it is.
-int RowAfterScroll(int code, int thumbPosition) {
+std::optional<int> RowAfterScroll(int code, int thumbPosition) {
     const int first = grid.firstVisibleRow;
+    const bool atEnd = grid.maxVisibleRowCount + first >= kRowLimit + 1;
     switch (code) {
     case SB_LINEUP: return std::max(first - 1, 0);
     case SB_LINEDOWN:
-        return grid.maxVisibleRowCount + first >= kRowLimit + 1
-                   ? -1
-                   : std::min(first + 1, kRowLimit - 1);
+        if (atEnd) return std::nullopt;
+        return std::min(first + 1, kRowLimit - 1);
     case SB_PAGEUP: return std::max(first - grid.visibleRowCount, 0);
     case SB_PAGEDOWN: return std::min(first + grid.visibleRowCount - 1, kRowLimit - 1);
     default: return thumbPosition;
@@ -49,10 +55,10 @@ bool IsHandled(int code) { return code >= SB_LINEUP && code <= SB_THUMBPOSITION;
 
 LRESULT OnHorizontalScroll(int code, int thumbPosition) {
     if (!IsHandled(code)) return 1;
-    const int first = ColumnAfterScroll(code, thumbPosition);
-    if (first < 0) return 0;
+    const std::optional<int> first = ColumnAfterScroll(code, thumbPosition);
+    if (!first) return 0;
     InvertSelection(Invalidate::no);
-    grid.firstVisibleColumn = first;
+    grid.firstVisibleColumn = *first;
     SetColumnBarAfterScroll();
     UpdateColumnHeader(ClientRectOf(grid.hwndGrid).right);  // the full width, row header or not
     RedrawClient();
@@ -61,11 +67,11 @@ LRESULT OnHorizontalScroll(int code, int thumbPosition) {
 
 LRESULT OnVerticalScroll(int code, int thumbPosition) {
     if (!IsHandled(code)) return 1;
-    const int first = RowAfterScroll(code, thumbPosition);
-    if (first < 0) return 0;
+    const std::optional<int> first = RowAfterScroll(code, thumbPosition);
+    if (!first) return 0;
     InvertSelection(Invalidate::no);
-    FitRowHeaderTo(first);
-    grid.firstVisibleRow = first;
+    FitRowHeaderTo(*first);
+    grid.firstVisibleRow = *first;
     SetRowBarAfterScroll();
     UpdateRowHeaderOverCells();
     RedrawClient();
