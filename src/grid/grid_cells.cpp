@@ -20,6 +20,7 @@ constexpr UINT kDefaultFormat = DT_NOPREFIX | DT_VCENTER | DT_CENTER;
 constexpr int kTextMargin = 3;
 constexpr int kTextTop = 1;
 constexpr int kHashLimit = 255;
+constexpr LONG kSpanLimit = 16000;  // columns; keeps the sums within their numbers
 
 // Where a text may be drawn; `box` is its own cell's.
 RECT TextArea(const RECT& box, int column, LONG spanLeft, LONG spanRight) {
@@ -30,8 +31,8 @@ RECT TextArea(const RECT& box, int column, LONG spanLeft, LONG spanRight) {
         area.left = ColumnLeft(first);
     }
     if (spanRight > 0) {
-        const int last = column + std::min<LONG>(spanRight, kColumnLimit - 1 - column);
-        area.right = ColumnLeft(last + 1);
+        // Past the sheet's end columns go on with the default width.
+        area.right = ColumnLeft(column + std::min<LONG>(spanRight, kSpanLimit) + 1);
     } else if (spanRight < 0) {
         area.right = ClientRectOf(grid.hwndGrid).right + (box.right - box.left);
     }
