@@ -28,23 +28,31 @@ int HorizontalLinesEnd(const RECT& area) {
     return endColumn == kColumnLimit ? ColumnLeft(endColumn) : area.right;
 }
 
+// Columns that end left of the area are skipped; past the sheet's end columns have the default
+// width.
 void DrawVerticalLines(HDC dc, const RECT& area) {
     const int end = VerticalLinesEnd(area);
+    int column = grid.firstVisibleColumn;
     int x = grid.cellsLeft;
-    for (int i = 0; i <= grid.visibleColumnCount && x < area.right; ++i) {
-        const int next = x + ColumnWidth(grid.firstVisibleColumn + i);
-        if (next >= area.left) DrawLine(dc, x, area.top, x, end);
-        x = next;
+    while (x + ColumnWidth(column) < area.left) x += ColumnWidth(column++);
+    for (int lines = 0; lines <= grid.visibleColumnCount && x < area.right; ++lines) {
+        DrawLine(dc, x, area.top, x, end);
+        x += ColumnWidth(column++);
     }
 }
 
 void DrawHorizontalLines(HDC dc, const RECT& area) {
     const int end = HorizontalLinesEnd(area);
+    const int endRow = grid.firstVisibleRow + grid.visibleRowCount;
+    int row = grid.firstVisibleRow;
     int y = grid.cellsTop;
-    for (int i = 0; i <= grid.visibleRowCount && y < area.bottom; ++i) {
-        const int next = y + RowHeight(grid.firstVisibleRow + i);
-        if (next >= area.top) DrawLine(dc, area.left, y, end, y);
-        y = next;
+    while (y + RowHeight(row) < area.top) {
+        if (row == endRow) return;  // nothing visible lies in the area
+        y += RowHeight(row++);
+    }
+    for (int lines = 0; lines <= grid.visibleRowCount && y < area.bottom; ++lines) {
+        DrawLine(dc, area.left, y, end, y);
+        y += RowHeight(row++);
     }
 }
 

@@ -107,11 +107,14 @@ void DrawHeaderItems(const HeaderRecord& header, const RECT& area) {
     SelectScope pen(header.dc, headerPaint.framePen);
     SelectScope brush(header.dc, GetStockObject(NULL_BRUSH));
     int start = 0;
-    for (uint32_t i = 0; i < header.count && start <= highEdge; ++i) {
+    // The first item past the area is painted as well: the DC is not clipped to the area.
+    bool past = false;
+    for (uint32_t i = 0; i < header.count && !past; ++i) {
         const int end = start + header.sizes[i];
         if (start > lowEdge || end > lowEdge) {
             DrawItem(header, i, client, start, end, font.get());
         }
+        past = start > highEdge;
         start = end;
     }
 }
