@@ -11,6 +11,9 @@ namespace kor {
 
 namespace {
 
+// Where skipping ends even if columns have no width at all.
+constexpr int kSkipLimit = 2 * kColumnLimit;
+
 void DrawLine(HDC dc, int fromX, int fromY, int toX, int toY) {
     const POINT ends[] = {{fromX, fromY}, {toX, toY}};
     Polyline(dc, ends, 2);
@@ -34,7 +37,7 @@ void DrawVerticalLines(HDC dc, const RECT& area) {
     const int end = VerticalLinesEnd(area);
     int column = grid.firstVisibleColumn;
     int x = grid.cellsLeft;
-    while (x + ColumnWidth(column) < area.left) x += ColumnWidth(column++);
+    while (column < kSkipLimit && x + ColumnWidth(column) < area.left) x += ColumnWidth(column++);
     for (int lines = 0; lines <= grid.visibleColumnCount && x < area.right; ++lines) {
         DrawLine(dc, x, area.top, x, end);
         x += ColumnWidth(column++);
