@@ -1,0 +1,229 @@
+#include "support/import_spy.h"
+
+#include "support/import_thunk.h"
+
+#include <gtest/gtest.h>
+
+#include <utility>
+
+namespace kortest {
+namespace {
+
+ImportSpy* activeSpy = nullptr;
+
+using ImportVisitor = std::function<void(const char* dll, const char* name, ULONG_PTR* slot)>;
+
+void VisitImports(HMODULE module, const ImportVisitor& visit) {
+    auto* base = reinterpret_cast<BYTE*>(module);
+    auto* dos = reinterpret_cast<IMAGE_DOS_HEADER*>(base);
+    auto* nt = reinterpret_cast<IMAGE_NT_HEADERS*>(base + dos->e_lfanew);
+    const auto& directory = nt->OptionalHeader.DataDirectory[IMAGE_DIRECTORY_ENTRY_IMPORT];
+    if (!directory.Size) return;
+
+    auto* dll = reinterpret_cast<IMAGE_IMPORT_DESCRIPTOR*>(base + directory.VirtualAddress);
+    for (; dll->Name; ++dll) {
+        auto* name = reinterpret_cast<IMAGE_THUNK_DATA*>(base + dll->OriginalFirstThunk);
+        auto* slot = reinterpret_cast<IMAGE_THUNK_DATA*>(base + dll->FirstThunk);
+        for (; name->u1.AddressOfData; ++name, ++slot) {
+            if (IMAGE_SNAP_BY_ORDINAL(name->u1.Ordinal)) continue;
+            auto* entry = reinterpret_cast<IMAGE_IMPORT_BY_NAME*>(base + name->u1.AddressOfData);
+            visit(reinterpret_cast<const char*>(base + dll->Name),
+                  reinterpret_cast<const char*>(entry->Name),
+                  reinterpret_cast<ULONG_PTR*>(&slot->u1.Function));
+        }
+    }
+}
+
+// Address of the module's pointer to the imported function, or nullptr.
+ULONG_PTR* FindImportSlot(HMODULE module, const std::string& wanted) {
+    ULONG_PTR* found = nullptr;
+    VisitImports(module, [&](const char*, const char* name, ULONG_PTR* slot) {
+        if (wanted == name) found = slot;
+    });
+    return found;
+}
+
+void WriteSlot(ULONG_PTR* slot, ULONG_PTR value) {
+    DWORD protection = 0;
+    VirtualProtect(slot, sizeof value, PAGE_READWRITE, &protection);
+    *slot = value;
+    VirtualProtect(slot, sizeof value, protection, &protection);
+}
+
+}  // namespace
+
+struct ImportSpy::Watch {
+    std::string name;
+    int argumentCount;
+    CallingConvention convention;
+    ULONG_PTR* slot;
+    ULONG_PTR realFunction;
+    Handler handler;
+    int callsUntilFailure = 0;  // 1: the next call fails; 0: none does
+    bool failsAlways = false;
+    ULONG_PTR failureResult = 0;
+    DWORD failureError = 0;
+};
+
+HMODULE LibraryModule() { return GetModuleHandleW(L"korcontrols.dll"); }
+
+std::vector<std::string> ImportNames(HMODULE module) {
+    std::vector<std::string> names;
+    VisitImports(module, [&](const char* dll, const char* name, ULONG_PTR*) {
+        names.push_back(std::string(dll) + "!" + name);
+    });
+    return names;
+}
+
+ImportSpy::ImportSpy(HMODULE module) : module_(module) {
+    if (activeSpy) ADD_FAILURE() << "there can be one import spy at a time";
+    activeSpy = this;
+}
+
+ImportSpy::~ImportSpy() {
+    for (const auto& watch : watches_) WriteSlot(watch->slot, watch->realFunction);
+    activeSpy = nullptr;
+}
+
+bool ImportSpy::isImported(const std::string& name) const {
+    return FindImportSlot(module_, name) != nullptr;
+}
+
+bool ImportSpy::watch(const std::string& name) {
+    int argumentCount = 0;
+    auto convention = CallingConvention::Stdcall;
+    if (!FindImportSignature(name, &argumentCount, &convention)) {
+        ADD_FAILURE() << "the table of signatures lacks " << name;
+        return false;
+    }
+    return watch(name, argumentCount, convention);
+}
+
+bool ImportSpy::watch(const std::string& name, int argumentCount, CallingConvention convention) {
+    if (find(name)) return true;
+    ULONG_PTR* slot = FindImportSlot(module_, name);
+    if (!slot) return false;
+    const int index = static_cast<int>(watches_.size());
+    void* thunk = MakeThunk(&ImportSpy::dispatch, index, argumentCount, convention);
+    if (!thunk) {
+        ADD_FAILURE() << "no room to watch " << name;
+        return false;
+    }
+    auto entry = std::make_unique<Watch>();
+    entry->name = name;
+    entry->argumentCount = argumentCount;
+    entry->convention = convention;
+    entry->slot = slot;
+    entry->realFunction = *slot;
+    watches_.push_back(std::move(entry));
+    WriteSlot(slot, reinterpret_cast<ULONG_PTR>(thunk));
+    return true;
+}
+
+void ImportSpy::watchAll(const std::vector<std::string>& names) {
+    for (const std::string& name : names) {
+        if (isImported(name)) watch(name);
+    }
+}
+
+void ImportSpy::failNth(const std::string& name, int nth, ULONG_PTR result, DWORD lastError) {
+    Watch& watch = require(name);
+    watch.callsUntilFailure = nth;
+    watch.failureResult = result;
+    watch.failureError = lastError;
+}
+
+void ImportSpy::failAlways(const std::string& name, ULONG_PTR result, DWORD lastError) {
+    failNth(name, 0, result, lastError);
+    require(name).failsAlways = true;
+}
+
+void ImportSpy::stopFailing(const std::string& name) {
+    Watch& watch = require(name);
+    watch.callsUntilFailure = 0;
+    watch.failsAlways = false;
+}
+
+void ImportSpy::replace(const std::string& name, Handler handler) {
+    require(name).handler = std::move(handler);
+}
+
+void ImportSpy::restore(const std::string& name) { require(name).handler = nullptr; }
+
+ULONG_PTR ImportSpy::callReal(const std::string& name, ULONG_PTR* arguments) {
+    Watch& watch = require(name);
+    return CallWithArguments(watch.realFunction, arguments, watch.argumentCount, watch.convention);
+}
+
+std::vector<ImportCall> ImportSpy::callsOf(const std::string& name) const {
+    std::vector<ImportCall> found;
+    for (const ImportCall& call : calls_) {
+        if (call.name == name) found.push_back(call);
+    }
+    return found;
+}
+
+int ImportSpy::count(const std::string& name) const {
+    return static_cast<int>(callsOf(name).size());
+}
+
+std::string ImportSpy::sequence() const {
+    std::string text;
+    for (const ImportCall& call : calls_) {
+        if (!text.empty()) text += ' ';
+        text += call.name;
+        if (call.failed) text += '!';
+    }
+    return text;
+}
+
+void ImportSpy::clearCalls() {
+    calls_.clear();
+    ++generation_;
+}
+
+ULONG_PTR __cdecl ImportSpy::dispatch(int index, ULONG_PTR* arguments) {
+    ImportSpy& spy = *activeSpy;
+    Watch& watch = *spy.watches_[static_cast<size_t>(index)];
+    const size_t place = spy.calls_.size();
+    const int generation = spy.generation_;
+    spy.calls_.push_back({watch.name, {arguments, arguments + watch.argumentCount}, 0, false});
+
+    bool failed = false;
+    const ULONG_PTR result = spy.answer(watch, arguments, failed);
+    if (generation == spy.generation_) {
+        spy.calls_[place].result = result;
+        spy.calls_[place].failed = failed;
+    }
+    return result;
+}
+
+ULONG_PTR ImportSpy::answer(Watch& watch, ULONG_PTR* arguments, bool& failed) {
+    const bool isDue = watch.callsUntilFailure > 0 && --watch.callsUntilFailure == 0;
+    if (watch.failsAlways || isDue) {
+        failed = true;
+        if (watch.failureError) SetLastError(watch.failureError);
+        return watch.failureResult;
+    }
+    if (watch.handler) return watch.handler(arguments);
+    return CallWithArguments(watch.realFunction, arguments, watch.argumentCount, watch.convention);
+}
+
+ImportSpy::Watch* ImportSpy::find(const std::string& name) {
+    for (const auto& watch : watches_) {
+        if (watch->name == name) return watch.get();
+    }
+    return nullptr;
+}
+
+// A watch that no call ever reaches stands in for a missing one, so that the test goes on to its
+// end.
+ImportSpy::Watch& ImportSpy::require(const std::string& name) {
+    if (Watch* watch = find(name)) return *watch;
+    if (watch(name)) return *find(name);
+    ADD_FAILURE() << name << " is not imported";
+    static Watch none{name, 0, CallingConvention::Stdcall, nullptr, 0, nullptr};
+    return none;
+}
+
+}  // namespace kortest
