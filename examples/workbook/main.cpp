@@ -1,0 +1,51 @@
+// Start-up, the message loop, the end.
+#include <windows.h>
+
+#include <commctrl.h>
+#include <shellapi.h>
+
+#include <string>
+
+#include "message_routing.h"
+#include "workbook.h"
+#include "workbook_window.h"
+
+namespace {
+
+// The first argument, a CSV file to open; empty without one.
+std::wstring FileOnCommandLine() {
+    int count = 0;
+    LPWSTR* arguments = CommandLineToArgvW(GetCommandLineW(), &count);
+    if (!arguments) return {};
+    std::wstring file = count > 1 ? arguments[1] : L"";
+    LocalFree(arguments);
+    return file;
+}
+
+// The loop. Before it waits, the window catches up with what the grid does without telling.
+void RunMessageLoop(workbook::Workbook& workbook) {
+    MSG message = {};
+    for (;;) {
+        if (!PeekMessageW(&message, nullptr, 0, 0, PM_NOREMOVE)) workbook::OnIdle(workbook);
+        if (GetMessageW(&message, nullptr, 0, 0) <= 0) return;
+        if (workbook::HandleBeforeDispatch(workbook, message)) continue;
+        if (workbook::MayBecomeCharacter(message)) TranslateMessage(&message);
+        DispatchMessageW(&message);
+    }
+}
+
+}  // namespace
+
+int WINAPI WinMain(HINSTANCE instance, HINSTANCE, LPSTR, int show) {
+    const INITCOMMONCONTROLSEX controls = {sizeof controls, ICC_BAR_CLASSES};
+    InitCommonControlsEx(&controls);
+
+    workbook::Workbook workbook;
+    workbook.instance = instance;
+    if (!workbook::CreateWorkbookWindow(workbook, FileOnCommandLine(), show)) {
+        MessageBoxW(nullptr, L"The window could not be created.", L"Workbook", MB_ICONERROR);
+        return 1;
+    }
+    RunMessageLoop(workbook);
+    return 0;
+}

@@ -1,0 +1,65 @@
+// All that the program knows: its windows, the document, and how it is shown.
+#pragma once
+
+#include <windows.h>
+
+#include <korcontrols/grid.h>
+
+#include <string>
+
+#include "cell_styles.h"
+#include "column_widths.h"
+#include "model/document.h"
+#include "text_measure.h"
+
+namespace workbook {
+
+constexpr DWORD kFullZoom = 4;  // the grid counts zoom in quarters
+
+// What the View menu shows with check marks. The grid starts out like this, and tells nobody when
+// it changes, so whoever toggles something there toggles it here.
+struct ViewOptions {
+    bool headers = true;
+    bool gridLines = true;
+    bool horizontalScrollBar = true;
+    bool verticalScrollBar = true;
+    bool titleRow = false;  // row 1 in bold on a tinted background
+    DWORD zoom = kFullZoom;
+};
+
+// What the window showed last, to notice what the grid changed without a notification: its headers
+// and its corner button select silently.
+struct ShownState {
+    Block selection;
+    bool statusIsStale = true;
+    std::wstring
+        notice;  // something to tell about the last edit, shown until the selection changes
+};
+
+// The last press in the cells, to extend the selection to it with Shift.
+struct PressState {
+    CellAddress origin;  // where an extended selection begins: the last cell chosen without Shift
+    CellAddress pressed;
+    bool dragged = false;
+};
+
+struct Workbook {
+    HINSTANCE instance = nullptr;
+    HWND window = nullptr;
+    HWND grid = nullptr;
+    HWND statusBar = nullptr;
+    HACCEL keysAlways = nullptr;
+    HACCEL keysInGrid = nullptr;
+
+    Document document;
+    CellStyles styles;
+    TextMeasure measure;
+    ColumnWidths widths;
+    ViewOptions view;
+    ShownState shown;
+    PressState press;
+    int wheelDistance = 0;       // turned, but less than a notch so far
+    bool isOutOfMemory = false;  // to be told when no message is being handled
+};
+
+}  // namespace workbook

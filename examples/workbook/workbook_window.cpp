@@ -1,0 +1,186 @@
+#include "workbook_window.h"
+
+#include <shellapi.h>
+
+#include <algorithm>
+#include <new>
+
+#include "commands.h"
+#include "equation_bar.h"
+#include "file_commands.h"
+#include "grid_host.h"
+#include "resource.h"
+#include "status_line.h"
+#include "view_commands.h"
+#include "workbook.h"
+
+namespace workbook {
+
+namespace {
+
+constexpr const wchar_t* kClassName = L"korcontrols Workbook";
+constexpr int kFirstWidth = 960;
+constexpr int kFirstHeight = 680;
+constexpr int kLeastWidth = 320;
+constexpr int kLeastHeight = 240;
+constexpr DWORD kGridStyle = WS_CHILD | WS_VISIBLE | WS_CLIPCHILDREN | WS_HSCROLL | WS_VSCROLL;
+
+// ---- Birth and death ----
+
+bool OnCreate(Workbook& workbook, HWND window) {
+    workbook.window = window;
+    CreateCellStyles(workbook.styles);
+    workbook.measure.open();
+    workbook.statusBar = CreateStatusBar(window, workbook.instance);
+    workbook.grid =
+        CreateWindowExW(0, KORGRID_CLASS, nullptr, kGridStyle, 0, 0, 0, 0, window,
+                        reinterpret_cast<HMENU>(INT_PTR{IDC_GRID}), workbook.instance, nullptr);
+    if (!workbook.grid || !workbook.statusBar) return false;
+    PrepareEquationBar(workbook);
+    SetFunctionButtonMessageID(IDM_FUNCTIONS);
+    DragAcceptFiles(window, TRUE);
+    return true;
+}
+
+void OnDestroy(Workbook& workbook) {
+    workbook.measure.close();
+    DeleteCellStyles(workbook.styles);
+    workbook.grid = nullptr;
+    PostQuitMessage(0);
+}
+
+// ---- Layout and focus ----
+
+void OnSize(Workbook& workbook, WPARAM kind, int width, int height) {
+    if (kind == SIZE_MINIMIZED) return;
+    const int gridHeight = std::max(0, height - LayoutStatusBar(workbook));
+    MoveWindow(workbook.grid, 0, 0, width, gridHeight, TRUE);
+    UpdateScrollRanges(workbook);
+}
+
+// Back from another program or a dialog: on with what had the focus before.
+void OnSetFocus(const Workbook& workbook) {
+    const HWND last = GetControlWithFocus();
+    SetFocus(last ? last : workbook.grid);
+}
+
+// The grid and its headers have no cursor of their own: the one from outside, such as that of the
+// window's border, would stay.
+//   result  whether the cursor is set
+bool OnSetCursor(const Workbook& workbook, HWND window, UINT place) {
+    const bool isGrid = window == workbook.grid || IsGridHeader(workbook, window);
+    if (!isGrid || place != HTCLIENT) return false;
+    SetCursor(LoadCursorW(nullptr, IDC_ARROW));
+    return true;
+}
+
+void OnGetMinMaxInfo(MINMAXINFO& info) { info.ptMinTrackSize = {kLeastWidth, kLeastHeight}; }
+
+// ---- Dispatch ----
+
+LRESULT Dispatch(Workbook& workbook, UINT message, WPARAM wParam, LPARAM lParam) {
+    const HWND window = workbook.window;
+    switch (message) {
+    case WM_SIZE: OnSize(workbook, wParam, LOWORD(lParam), HIWORD(lParam)); return 0;
+    case WM_SETFOCUS: OnSetFocus(workbook); return 0;
+    case WM_NOTIFY:
+        if (OnGridNotify(workbook, static_cast<UINT>(wParam), lParam)) return 0;
+        break;
+    case GRIDN_EQUATIONENTERED:
+        OnEquationEntered(workbook, reinterpret_cast<const wchar_t*>(wParam), lParam);
+        return 0;
+    case GRIDN_EQUATIONEMPTY: OnEquationEmptied(workbook, lParam); return 0;
+    case WM_KEYDOWN:
+        if (wParam == VK_DELETE) OnDeleteKey(workbook);
+        return 0;
+    case WM_SETCURSOR:
+        if (OnSetCursor(workbook, reinterpret_cast<HWND>(wParam), LOWORD(lParam))) return TRUE;
+        break;
+    case WM_COMMAND: RunCommand(workbook, LOWORD(wParam)); return 0;
+    case WM_INITMENUPOPUP: PrepareMenu(workbook, reinterpret_cast<HMENU>(wParam)); return 0;
+    case WM_MOUSEWHEEL:
+        OnMouseWheel(workbook, LOWORD(wParam), static_cast<short>(HIWORD(wParam)));
+        return 0;
+    case WM_DROPFILES: OnDropFiles(workbook, reinterpret_cast<HDROP>(wParam)); return 0;
+    case WM_CLOSE:
+        if (MayDiscard(workbook)) DestroyWindow(window);
+        return 0;
+    case WM_QUERYENDSESSION: return MayDiscard(workbook);
+    case WM_DESTROY: OnDestroy(workbook); return 0;
+    default: break;
+    }
+    return DefWindowProcW(window, message, wParam, lParam);
+}
+
+// No exception may leave: the library that sent the message could not handle it.
+LRESULT CALLBACK WorkbookProc(HWND window, UINT message, WPARAM wParam, LPARAM lParam) noexcept {
+    if (message == WM_GETMINMAXINFO) OnGetMinMaxInfo(*reinterpret_cast<MINMAXINFO*>(lParam));
+    if (message == WM_CREATE) {
+        auto* const created =
+            static_cast<Workbook*>(reinterpret_cast<CREATESTRUCTW*>(lParam)->lpCreateParams);
+        SetWindowLongPtrW(window, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(created));
+        return OnCreate(*created, window) ? 0 : -1;
+    }
+    auto* const workbook = reinterpret_cast<Workbook*>(GetWindowLongPtrW(window, GWLP_USERDATA));
+    if (!workbook || !workbook->grid) return DefWindowProcW(window, message, wParam, lParam);
+    try {
+        return Dispatch(*workbook, message, wParam, lParam);
+    } catch (const std::bad_alloc&) {
+        workbook->isOutOfMemory = true;
+        return 0;
+    }
+}
+
+bool RegisterWorkbookClass(HINSTANCE instance) {
+    WNDCLASSEXW windowClass = {};
+    windowClass.cbSize = sizeof windowClass;
+    windowClass.lpfnWndProc = WorkbookProc;
+    windowClass.hInstance = instance;
+    windowClass.hIcon = LoadIconW(nullptr, IDI_APPLICATION);
+    windowClass.hCursor = LoadCursorW(nullptr, IDC_ARROW);
+    windowClass.hbrBackground = reinterpret_cast<HBRUSH>(INT_PTR{COLOR_BTNFACE + 1});
+    windowClass.lpszMenuName = MAKEINTRESOURCEW(IDR_MENU);
+    windowClass.lpszClassName = kClassName;
+    return RegisterClassExW(&windowClass) != 0;
+}
+
+}  // namespace
+
+bool CreateWorkbookWindow(Workbook& workbook, const std::wstring& file, int show) {
+    if (!RegisterGridControl(workbook.instance) || !RegisterWorkbookClass(workbook.instance)) {
+        return false;
+    }
+    workbook.keysAlways = LoadAcceleratorsW(workbook.instance, MAKEINTRESOURCEW(IDR_KEYS_ALWAYS));
+    workbook.keysInGrid = LoadAcceleratorsW(workbook.instance, MAKEINTRESOURCEW(IDR_KEYS_GRID));
+    if (!CreateWindowExW(0, kClassName, L"Workbook", WS_OVERLAPPEDWINDOW | WS_CLIPCHILDREN,
+                         CW_USEDEFAULT, CW_USEDEFAULT, kFirstWidth, kFirstHeight, nullptr, nullptr,
+                         workbook.instance, &workbook)) {
+        return false;
+    }
+    ShowDocumentFromStart(workbook);
+    ShowWindow(workbook.window, show);
+    UpdateWindow(workbook.window);
+    if (!file.empty()) OpenFile(workbook, file);
+    return true;
+}
+
+void ShowTitle(const Workbook& workbook) {
+    const Document& document = workbook.document;
+    const std::wstring title = document.name() + L" - Workbook";
+    SetWindowTextW(workbook.window, ((document.isModified() ? L"*" : L"") + title).c_str());
+}
+
+void OnIdle(Workbook& workbook) noexcept {
+    if (!workbook.grid) return;
+    try {
+        CatchUpWithGrid(workbook);
+    } catch (const std::bad_alloc&) {
+        workbook.isOutOfMemory = true;
+    }
+    if (!workbook.isOutOfMemory) return;
+    workbook.isOutOfMemory = false;
+    MessageBoxW(workbook.window, L"There is not enough memory for that.", L"Workbook",
+                MB_OK | MB_ICONWARNING);
+}
+
+}  // namespace workbook

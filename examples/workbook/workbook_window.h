@@ -1,0 +1,24 @@
+// The main window: it holds the grid and the status bar and passes messages to whoever answers
+// them.
+#pragma once
+
+#include <windows.h>
+
+#include <string>
+
+namespace workbook {
+
+struct Workbook;
+
+// Creates and shows the window and opens a file, if one is named. `workbook` must outlive the
+// window.
+//   result  whether the window exists
+bool CreateWorkbookWindow(Workbook& workbook, const std::wstring& file, int show);
+
+// "*sunspots.csv - Workbook"; the star means unsaved changes.
+void ShowTitle(const Workbook& workbook);
+
+// To be called when no message is waiting.
+void OnIdle(Workbook& workbook) noexcept;
+
+}  // namespace workbook
