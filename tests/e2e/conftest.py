@@ -1,0 +1,93 @@
+"""Fixtures: one desktop for each machine, and workbooks that are closed whatever happens.
+
+    python3 -m pytest tests/e2e [--machine i686] [--machine x86_64] [--build build]
+"""
+
+import pathlib
+import shutil
+
+import pytest
+
+from desktop import ROOT, Desktop
+from probe import Probe
+from workbook_app import Workbook, windows_path
+
+DATA = ROOT / "examples" / "workbook" / "data"
+FAILURES = ROOT / "build" / "e2e-failures"
+
+
+def pytest_addoption(parser):
+    parser.addoption("--machine", action="append", help="i686 or x86_64 (default: both)")
+    parser.addoption("--build", default=ROOT / "build", help="the folder of the presets' builds")
+
+
+def pytest_generate_tests(metafunc):
+    if "machine" in metafunc.fixturenames:
+        machines = metafunc.config.getoption("machine") or ["i686", "x86_64"]
+        metafunc.parametrize("machine", machines, scope="session")
+
+
+@pytest.hookimpl(hookwrapper=True)
+def pytest_runtest_makereport(item, call):
+    outcome = yield
+    if call.when == "call":
+        item.has_failed = outcome.get_result().failed
+
+
+@pytest.fixture(scope="session")
+def programs(machine, pytestconfig):
+    """The folder with workbook.exe and window_probe.exe."""
+    return pathlib.Path(pytestconfig.getoption("build")).absolute() / machine / "bin"
+
+
+@pytest.fixture(scope="session")
+def desktop(programs):
+    with Desktop(programs / "workbook.exe") as started:
+        yield started
+
+
+@pytest.fixture(scope="session")
+def probe(desktop, programs):
+    started = Probe(desktop, programs / "window_probe.exe")
+    yield started
+    started.close()
+
+
+@pytest.fixture
+def open_workbook(desktop, probe, programs, machine, request):
+    """open_workbook(path, ...) starts workbook.exe with these files as arguments."""
+    started = []
+
+    def open_one(*files):
+        workbook = Workbook(
+            desktop, probe, programs / "workbook.exe", *[windows_path(file) for file in files]
+        )
+        started.append(workbook)
+        return workbook
+
+    yield open_one
+    if getattr(request.node, "has_failed", False):
+        FAILURES.mkdir(parents=True, exist_ok=True)
+        desktop.picture().write_png(FAILURES / f"{request.node.originalname}-{machine}.png")
+    for workbook in started:
+        workbook.kill()
+
+
+@pytest.fixture
+def sunspots(tmp_path):
+    """A copy of the example's data."""
+    return pathlib.Path(shutil.copy(DATA / "sunspots.csv", tmp_path))
+
+
+@pytest.fixture
+def stations(tmp_path):
+    """A small file whose every cell is known."""
+    path = tmp_path / "stations.csv"
+    path.write_bytes(
+        b"Station,Height,Rain,Sun\r\n"
+        b"Harbour,4,12.5,6\r\n"
+        b"Moor,212,30.25,3\r\n"
+        b'"Mill, old",88,17,4.5\r\n'
+        b"Ridge,540,41,2\r\n"
+    )
+    return path
