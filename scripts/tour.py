@@ -32,11 +32,11 @@ def opened(programs, file):
             probe.close()
 
 
-def free_column(file):
-    """The letters of the column after the file's last, but one that is visible at first."""
+def free_column(workbook, file):
+    """The letters of the column after the file's last, or of the last one in view."""
     with open(file, newline="", encoding="utf-8", errors="replace") as lines:
-        widths = [len(row) for _, row in zip(range(100), csv.reader(lines))]
-    return column_name(min(max(widths, default=0) + 1, 6))
+        columns = max((len(row) for _, row in zip(range(100), csv.reader(lines))), default=0)
+    return column_name(min(columns, workbook.view().last_whole_column()))
 
 
 def zoom(workbook, key, percent):
@@ -61,7 +61,7 @@ def steps(workbook, file):
     expect(lambda: workbook.view().status.split()[0], "B2:B13")
     yield "block-selected"
 
-    cell = free_column(file) + "2"
+    cell = free_column(workbook, file) + "2"
     workbook.click_cell(cell)
     workbook.desktop.type("=AVERAGE(B2:B13)")
     expect(lambda: workbook.view().equation.text, "=AVERAGE(B2:B13)")

@@ -17,6 +17,8 @@ namespace {
 void AfterEdit(Workbook& workbook, EditResult result) {
     workbook.shown.notice = EditMessage(result);
     workbook.shown.statusIsStale = true;
+    // Storing usually moves on to another cell at once, so a notice would hardly be seen.
+    if (result == EditResult::NoMemory) workbook.isOutOfMemory = true;
     if (result != EditResult::Done) return;
     ShowTitle(workbook);
     UpdateScrollRanges(workbook);

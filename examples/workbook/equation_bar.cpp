@@ -59,6 +59,7 @@ void ShowCurrentCell(Workbook& workbook) {
 
 void CommitTyping(Workbook& workbook) {
     if (PressOKButton() == 0) ShowCurrentCell(workbook);
+    if (IsTyping()) SetFocus(workbook.grid);
 }
 
 bool IsTyping() { return GetFocus() == GetHandleToEquationControl(); }

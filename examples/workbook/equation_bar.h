@@ -15,7 +15,7 @@ void PrepareEquationBar(const Workbook& workbook);
 // Shows what was typed into the current cell. Anything typed in the bar is given up.
 void ShowCurrentCell(Workbook& workbook);
 
-// Stores what is being typed, as commands do before they look at the sheet.
+// Stores what is being typed and leaves the bar, as commands do before they look at the sheet.
 void CommitTyping(Workbook& workbook);
 
 bool IsTyping();

@@ -18,23 +18,23 @@ GridVisibleRange VisibleRange() {
     return range;
 }
 
-bool Touches(CellAddress cell, const GridVisibleRange& range) {
-    return IsIndexVisible(KORGRID_CELL(cell.column, range.firstRow)) &&
-           IsIndexVisible(KORGRID_CELL(range.firstColumn, cell.row));
+// Where a view of `count` columns or rows begins so that `target`, which lies behind it, comes into
+// view: a third of the way in, and not so far that the sheet's end is left.
+int OriginBefore(int target, int count, int limit) {
+    return std::max(0, std::min(target - count / 3, limit - count + 1));
 }
 
-// The first visible cell with which `cell` comes into view: the view moves only in the direction it
-// must, and a cell from farther below or right arrives a third of the way in.
+// The first visible cell with which `cell` comes into view. The view moves only as it must.
 CellAddress OriginFor(CellAddress cell, const GridVisibleRange& range) {
     CellAddress origin = {range.firstColumn, range.firstRow};
     if (cell.column < range.firstColumn) origin.column = cell.column;
     if (cell.row < range.firstRow) origin.row = cell.row;
     if (cell.column >= range.endColumn) {
-        const int columns = range.endColumn - range.firstColumn;
-        origin.column = std::max(0, cell.column - columns / 3);
+        origin.column =
+            OriginBefore(cell.column, range.endColumn - range.firstColumn, kColumnCount);
     }
     if (cell.row >= range.endRow) {
-        origin.row = std::max(0, cell.row - (range.endRow - range.firstRow) / 3);
+        origin.row = OriginBefore(cell.row, range.endRow - range.firstRow, kRowCount);
     }
     return origin;
 }
@@ -95,8 +95,7 @@ void GoTo(Workbook& workbook, const Block& block) {
 
 void MakeVisible(Workbook& workbook, CellAddress cell) {
     if (IsIndexCompletelyVisible(IndexOf(cell))) return;
-    const GridVisibleRange range = VisibleRange();
-    if (!Touches(cell, range)) ScrollTo(OriginFor(cell, range));
+    if (!IsIndexVisible(IndexOf(cell))) ScrollTo(OriginFor(cell, VisibleRange()));
     ShowWhole(cell);
     UpdateScrollRanges(workbook);
 }

@@ -158,6 +158,7 @@ bool CreateWorkbookWindow(Workbook& workbook, const std::wstring& file, int show
         return false;
     }
     ShowDocumentFromStart(workbook);
+    UpdateStatusBar(workbook);
     ShowWindow(workbook.window, show);
     UpdateWindow(workbook.window);
     if (!file.empty()) OpenFile(workbook, file);

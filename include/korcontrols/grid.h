@@ -164,7 +164,7 @@ void KORCONTROLS_API SetCellBorder(CellIndex cell, HPEN pen, DWORD left, DWORD r
  *   text        zero-terminated; null draws nothing
  *   font        font at 100 % zoom, scaled by the grid; 0: the image's current font, unscaled
  *   textColour  colour of the letters
- *   backColour  colour behind them (seen only when the host makes the image's mode opaque)
+ *   backColour  colour behind them: letters are drawn on a box of it, so pass the cell's own
  *   format      DrawTextW flags; 0 means DT_NOPREFIX | DT_VCENTER | DT_CENTER
  *   spanLeft    > 0: the text's rectangle begins this many columns further left (not before the
  *               first visible one)

@@ -1,5 +1,5 @@
-/* What the public headers promise, checked by a C compiler: sizes, offsets and numbers, and that the
- * headers can be included twice and in any order.                                                  */
+/* What the public headers promise, checked by a C compiler: sizes, offsets and numbers, and that
+ * the headers can be included twice and in any order.                                           */
 #include <korcontrols/header.h>
 #include <korcontrols/grid.h>
 #include <korcontrols/korcontrols.h>

@@ -61,7 +61,7 @@ def test_texts_formulas_and_new_rows_are_saved_as_typed(open_workbook, stations)
         b"Moor,212,30.25,0.5\r\n"
         b'"Mill, old",88,,4.5\r\n'
         b"Ridge,540,41,2\r\n"
-        b'"Both, of them",=SUM(B2:B5)\r\n'
+        b'"Both, of them",=SUM(B2:B5),,\r\n'
     )
 
 

@@ -1,5 +1,6 @@
 """The workbook as its user sees it: what it shows, where its cells and buttons are, its messages."""
 
+import itertools
 import re
 import subprocess
 import time
@@ -82,14 +83,16 @@ class View:
         return self.grid.find("Button", text=text).centre
 
     def last_whole_row(self):
-        bottom = self.grid.client[3] - self.row_header.client[1]
-        total, count = 0, 0
-        for size in self.row_header.sizes:
-            total += size
-            if total > bottom:
-                break
-            count += 1
-        return self.first_row + count - 1
+        """The last row that is not cut off, counted from 0."""
+        return self.first_row + self._whole(self.row_header, 1) - 1
+
+    def last_whole_column(self):
+        return self.first_column + self._whole(self.column_header, 0) - 1
+
+    def _whole(self, header, axis):
+        room = self.grid.client[axis + 2] - header.client[axis]
+        ends = itertools.accumulate(header.sizes)
+        return sum(1 for end in ends if end <= room)
 
     # ---- The scroll bars: what of the grid's window is not client area ----
 

@@ -80,6 +80,23 @@ TEST_F(GridCells, OnlyVisibleCellsAreDrawn) {
         }
 }
 
+// There is room in the window for a column and a row after the sheet's last ones.
+TEST_F(GridCells, NothingIsDrawnPastTheSheet) {
+    create(400, 300);
+    SetFirstVisibleCell(KORGRID_CELL(253, 16380));
+    ASSERT_EQ(VisibleRange(), (GridVisibleRange{253, 256, 16380, 16384}));
+    for (const CellIndex cell : {KORGRID_CELL(256, 16380), KORGRID_CELL(253, 16384),
+                                 KORGRID_CELL(252, 16380), KORGRID_CELL(253, 16379)}) {
+        blank();
+        SetCellBackGroundColor(cell, brush);
+        SetCellBorder(cell, pen, 1, 1, 1, 1);
+        SetCellValue(cell, L"WWWWWW", nullptr, kInk, kPaper, 0, 0, 0, 0, 0);
+        EXPECT_TRUE(untouched()) << KORGRID_CELLCOLUMN(cell) << ", " << KORGRID_CELLROW(cell);
+    }
+    SetCellBackGroundColor(KORGRID_CELL(255, 16383), brush);
+    EXPECT_EQ(image().count(kInk), 61 * 17);
+}
+
 TEST_F(GridCells, BorderDrawsEachEdgeOfTheBox) {
     create(400, 300);
     const int x0 = 90, x1 = 150;
@@ -166,7 +183,9 @@ TEST_F(GridCells, HostKeepsPenAndBrush) {
 TEST_F(GridCells, NullObjectsAreRefused) {
     create(400, 300);
     blank();
+    spy.watch("FillRect");
     SetCellBackGroundColor(KORGRID_CELL(1, 1), nullptr);
+    EXPECT_EQ(spy.count("FillRect"), 0);
     SetCellValue(KORGRID_CELL(1, 1), nullptr, nullptr, kInk, kPaper, 0, 0, 0, 0, 0);
     SetCellValue(KORGRID_CELL(1, 1), nullptr, nullptr, kInk, kPaper, 0, 2, -1, 1, 1);
     EXPECT_TRUE(untouched());

@@ -112,9 +112,8 @@ TEST_F(EquationButtons, FunctionButtonCommitsToo) {
     EXPECT_EQ(afterPress(fx()), Lines{});
     EXPECT_EQ(afterRelease(fx()), (Lines{"sent GRIDN_EQUATIONENTERED \"5\" B2", kPainted}));
     startTyping(L"6");
-    EXPECT_EQ(afterPress(fx()),
-              (Lines{"sent GRIDN_EDITKILLFOCUS 0", "sent GRIDN_EQUATIONENTERED \"6\" B2",
-                     kPainted}));
+    EXPECT_EQ(afterPress(fx()), (Lines{"sent GRIDN_EDITKILLFOCUS 0",
+                                       "sent GRIDN_EQUATIONENTERED \"6\" B2", kPainted}));
 }
 
 TEST_F(EquationButtons, FunctionButtonPassesThePressOnFirst) {

@@ -48,8 +48,8 @@ TEST_F(EquationCommit, EmptyTextStaysModifiedAndIsToldAgain) {
     EXPECT_EQ(PressOKButton(), 0);
     EXPECT_TRUE(isModified());
     EXPECT_EQ(PressOKButton(), 0);
-    EXPECT_EQ(told(), (Lines{"sent GRIDN_EQUATIONEMPTY C8", kPainted,
-                             "sent GRIDN_EQUATIONEMPTY C8", kPainted}));
+    EXPECT_EQ(told(), (Lines{"sent GRIDN_EQUATIONEMPTY C8", kPainted, "sent GRIDN_EQUATIONEMPTY C8",
+                             kPainted}));
 }
 
 TEST_F(EquationCommit, GridIsRedrawnAfterTheHostWasTold) {

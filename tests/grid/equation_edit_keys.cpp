@@ -54,9 +54,8 @@ TEST_F(EditKeys, EnterAndTabSendTheGridAnArrowKey) {
     host.leaveOut(WM_SETFOCUS);
     host.leaveOut(WM_COMMAND);
     PressKey(edit, VK_RETURN);
-    EXPECT_EQ(told(),
-              (Lines{"sent GRIDN_EDITKILLFOCUS 0", "sent GRIDN_EQUATIONENTERED \"5\" B2",
-                     "grid sent WM_KEYDOWN 40 1", "sent GRIDN_CURRENTCELL B3"}));
+    EXPECT_EQ(told(), (Lines{"sent GRIDN_EDITKILLFOCUS 0", "sent GRIDN_EQUATIONENTERED \"5\" B2",
+                             "grid sent WM_KEYDOWN 40 1", "sent GRIDN_CURRENTCELL B3"}));
 }
 
 // In the grid Tab and Enter clear the anchor; in the edit they do not.

@@ -106,10 +106,9 @@ TEST_F(EquationFocus, EmptyTextIsCommittedByEveryLoss) {
     SetFocus(grid);
     SetFocus(edit);
     SetFocus(grid);
-    EXPECT_EQ(told(),
-              (Lines{"sent GRIDN_EDITKILLFOCUS 0", "sent GRIDN_EQUATIONEMPTY B2", kPainted,
-                     "sent GRIDN_EDITFOCUS 0", "sent GRIDN_EDITKILLFOCUS 0",
-                     "sent GRIDN_EQUATIONEMPTY B2", kPainted}));
+    EXPECT_EQ(told(), (Lines{"sent GRIDN_EDITKILLFOCUS 0", "sent GRIDN_EQUATIONEMPTY B2", kPainted,
+                             "sent GRIDN_EDITFOCUS 0", "sent GRIDN_EDITKILLFOCUS 0",
+                             "sent GRIDN_EQUATIONEMPTY B2", kPainted}));
 }
 
 TEST_F(EquationFocus, SelectionMovedMeanwhileGetsTheText) {

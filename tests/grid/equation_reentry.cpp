@@ -1,5 +1,5 @@
-// Hosts that call back into the grid, or destroy it, while they are told of something. All of it runs
-// on a guarded heap.
+// Hosts that call back into the grid, or destroy it, while they are told of something. All of it
+// runs on a guarded heap.
 #include "grid/use_grid.h"
 
 namespace kortest {
@@ -98,16 +98,15 @@ protected:
 
 TEST_P(CallsBack, ForOtherCells) {
     open(330, 168);
-    const Action actions[] = {
-        [] { SetFirstVisibleCell(KORGRID_CELL(3, 3)); },
-        [] { SetFirstVisibleCell(KORGRID_CELL(300, 20000)); },
-        [] { Select(1, 3, 0, 5000); },
-        [this] { scrollRows(SB_THUMBPOSITION, 1000); },
-        [this] { PressKey(grid, VK_RIGHT); },
-        [this] { clickHeader(columnHeader, 0, 1); },
-        [this] { send(WM_COMMAND, 1); },
-        [this] { press(middleX(4), middleY(4)); },
-        [this] { release(); }};
+    const Action actions[] = {[] { SetFirstVisibleCell(KORGRID_CELL(3, 3)); },
+                              [] { SetFirstVisibleCell(KORGRID_CELL(300, 20000)); },
+                              [] { Select(1, 3, 0, 5000); },
+                              [this] { scrollRows(SB_THUMBPOSITION, 1000); },
+                              [this] { PressKey(grid, VK_RIGHT); },
+                              [this] { clickHeader(columnHeader, 0, 1); },
+                              [this] { send(WM_COMMAND, 1); },
+                              [this] { press(middleX(4), middleY(4)); },
+                              [this] { release(); }};
     for (const Action& action : actions) {
         runInside(action);
         useTheGrid();
@@ -118,23 +117,22 @@ TEST_P(CallsBack, ForOtherCells) {
 
 TEST_P(CallsBack, ForAnotherLayout) {
     open(330, 168);
-    const Action actions[] = {
-        [] { SetGridZoomLevel(2); },
-        [] { ToggleViewStateOfHeaders(); },
-        [] { ToggleViewStateOfHeaders(); },
-        [] { ToggleHorizontalScrollBar(); },
-        [] { ToggleVerticalScrollBar(); },
-        [] {
-            SetHorizontalDataRange(50);
-            SetVerticalDataRange(500);
-        },
-        [this] { resize(250, 150); },
-        [this] { resize(500, 400); },
-        [] {
-            ToggleGridLines();
-            ToggleGridLines();
-        },
-        [this] { send(GRIDM_REDRAW); }};
+    const Action actions[] = {[] { SetGridZoomLevel(2); },
+                              [] { ToggleViewStateOfHeaders(); },
+                              [] { ToggleViewStateOfHeaders(); },
+                              [] { ToggleHorizontalScrollBar(); },
+                              [] { ToggleVerticalScrollBar(); },
+                              [] {
+                                  SetHorizontalDataRange(50);
+                                  SetVerticalDataRange(500);
+                              },
+                              [this] { resize(250, 150); },
+                              [this] { resize(500, 400); },
+                              [] {
+                                  ToggleGridLines();
+                                  ToggleGridLines();
+                              },
+                              [this] { send(GRIDM_REDRAW); }};
     for (const Action& action : actions) {
         runInside(action);
         useTheGrid();
@@ -166,19 +164,18 @@ TEST_P(CallsBack, ForOtherSizes) {
 
 TEST_P(CallsBack, ForTheEquationBar) {
     open(330, 168);
-    const Action actions[] = {
-        [this] { KorGrid_SetEquationText(grid, L"other"); },
-        [] { PressOKButton(); },
-        [this] { SetFocus(edit); },
-        [this] { SetFocus(grid); },
-        [this] { SetFocus(host.window()); },
-        [this] { SetFocus(nullptr); },
-        [this] { send(WM_COMMAND, 8); },
-        [this] { TypeCharacter(grid, L'1'); },
-        [this] {
-            SetWindowTextW(edit, L"2");
-            SendMessageW(edit, EM_SETMODIFY, TRUE, 0);
-        }};
+    const Action actions[] = {[this] { KorGrid_SetEquationText(grid, L"other"); },
+                              [] { PressOKButton(); },
+                              [this] { SetFocus(edit); },
+                              [this] { SetFocus(grid); },
+                              [this] { SetFocus(host.window()); },
+                              [this] { SetFocus(nullptr); },
+                              [this] { send(WM_COMMAND, 8); },
+                              [this] { TypeCharacter(grid, L'1'); },
+                              [this] {
+                                  SetWindowTextW(edit, L"2");
+                                  SendMessageW(edit, EM_SETMODIFY, TRUE, 0);
+                              }};
     for (const Action& action : actions) {
         runInside(action);
         useTheGrid();
@@ -227,18 +224,13 @@ TEST_P(CallsBack, ToDestroyItsOwnWindow) {
 }
 
 std::string NameOf(const ::testing::TestParamInfo<UINT>& info) {
-    static const std::map<UINT, std::string> kNames{{GRIDN_PAINTCELLS, "PaintCells"},
-                                                    {GRIDN_CELLCLICKED, "CellClicked"},
-                                                    {GRIDN_SELECTING, "Selecting"},
-                                                    {GRIDN_SELECTIONDONE, "SelectionDone"},
-                                                    {GRIDN_CURRENTCELL, "CurrentCell"},
-                                                    {GRIDN_COLUMNRESIZED, "ColumnResized"},
-                                                    {GRIDN_ROWRESIZED, "RowResized"},
-                                                    {GRIDN_EQUATIONENTERED, "EquationEntered"},
-                                                    {GRIDN_EQUATIONEMPTY, "EquationEmpty"},
-                                                    {GRIDN_EDITFOCUS, "EditFocus"},
-                                                    {GRIDN_EDITKILLFOCUS, "EditKillFocus"},
-                                                    {WM_KEYDOWN, "DeleteKey"}};
+    static const std::map<UINT, std::string> kNames{
+        {GRIDN_PAINTCELLS, "PaintCells"},       {GRIDN_CELLCLICKED, "CellClicked"},
+        {GRIDN_SELECTING, "Selecting"},         {GRIDN_SELECTIONDONE, "SelectionDone"},
+        {GRIDN_CURRENTCELL, "CurrentCell"},     {GRIDN_COLUMNRESIZED, "ColumnResized"},
+        {GRIDN_ROWRESIZED, "RowResized"},       {GRIDN_EQUATIONENTERED, "EquationEntered"},
+        {GRIDN_EQUATIONEMPTY, "EquationEmpty"}, {GRIDN_EDITFOCUS, "EditFocus"},
+        {GRIDN_EDITKILLFOCUS, "EditKillFocus"}, {WM_KEYDOWN, "DeleteKey"}};
     return kNames.at(info.param);
 }
 

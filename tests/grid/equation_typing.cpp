@@ -57,9 +57,8 @@ TEST_F(TypeAhead, StepsInOrder) {
         return spy.callReal("SendMessageW", arguments);
     });
     SendMessageW(grid, WM_CHAR, L'Q', 0x00100001);
-    EXPECT_EQ(sent, (std::vector<std::vector<DWORD>>{{WM_SETTEXT, 256, 0},
-                                                     {WM_CHAR, L'Q', 0x00100001},
-                                                     {EM_SETMODIFY, 1, 0}}));
+    EXPECT_EQ(sent, (std::vector<std::vector<DWORD>>{
+                        {WM_SETTEXT, 256, 0}, {WM_CHAR, L'Q', 0x00100001}, {EM_SETMODIFY, 1, 0}}));
 }
 
 TEST_F(TypeAhead, EveryCharacterButTabAndEnter) {

@@ -59,6 +59,14 @@ TEST_F(GridOverrides, BlockGrowsAtEverySixteenthSizeLessOne) {
     EXPECT_EQ(Growths(spy, 60, [](int i) { SetRowHeight(i, 70); }), kGrowths);
 }
 
+// Setting the size that a column has anyway stores it: only a reset takes sizes away.
+TEST_F(GridOverrides, DefaultSizesAreStoredLikeOthers) {
+    create(400, 300);
+    spy.watchAll({"LocalAlloc", "LocalReAlloc"});
+    EXPECT_EQ(Growths(spy, 60, [](int i) { SetColumnWidth(i, 60); }), kGrowths);
+    EXPECT_EQ(Growths(spy, 60, [](int i) { SetRowHeight(i, 16); }), kGrowths);
+}
+
 TEST_F(GridOverrides, ResizeMessagesStoreInTheSameBlocks) {
     create(400, 300);
     spy.watch("LocalReAlloc");

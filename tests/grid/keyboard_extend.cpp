@@ -107,8 +107,8 @@ TEST_F(ExtendingKeys, WalkOutAndBackAroundTheAnchor) {
         PressKey(grid, key);
         blocks.push_back(BlockName(Selection()));
     }
-    EXPECT_EQ(blocks, (Lines{"C4:D4", "C4:E4", "C4:D4", "C4:C4", "B4:C4", "C4:C4", "C4:C5",
-                             "C4:C4", "C3:C4", "C4:C4"}));
+    EXPECT_EQ(blocks, (Lines{"C4:D4", "C4:E4", "C4:D4", "C4:C4", "B4:C4", "C4:C4", "C4:C5", "C4:C4",
+                             "C3:C4", "C4:C4"}));
 }
 
 // Only Shift keeps the anchor: the keys that move by a cell leave it, Tab and Enter clear it.
@@ -167,8 +167,8 @@ TEST_F(ExtendingKeys, HighlightFollows) {
     model.anchorColumn = 2;
     model.anchorRow = 3;
     KeyHeld shift(VK_SHIFT);
-    for (const WPARAM key : {VK_RIGHT, VK_DOWN, VK_DOWN, VK_LEFT, VK_LEFT, VK_UP, VK_UP, VK_UP,
-                             VK_RIGHT, VK_RIGHT}) {
+    for (const WPARAM key :
+         {VK_RIGHT, VK_DOWN, VK_DOWN, VK_LEFT, VK_LEFT, VK_UP, VK_UP, VK_UP, VK_RIGHT, VK_RIGHT}) {
         PressKey(grid, key);
         model.key(static_cast<int>(key), true);
         EXPECT_EQ(highlight(), expectedHighlight());

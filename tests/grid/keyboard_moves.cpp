@@ -81,8 +81,7 @@ TEST_F(ArrowKeys, OnlyOldAndNewCellAreRepainted) {
     Select(2, 2, 3, 3);
     TakeInvalid(grid);
     PressKey(grid, VK_RIGHT);
-    EXPECT_EQ(TakeInvalid(grid),
-              (RECT{30 + 120, cellsTop() + 48, 30 + 240, cellsTop() + 64}));
+    EXPECT_EQ(TakeInvalid(grid), (RECT{30 + 120, cellsTop() + 48, 30 + 240, cellsTop() + 64}));
 }
 
 // ---- Scrolling with the cell -------------------------------------------------------------------

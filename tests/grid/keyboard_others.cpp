@@ -110,8 +110,8 @@ TEST_F(OtherKeys, KeysOfTheTableAreNotTheSystems) {
     SetFocus(grid);
     host.pump();
     spy.watch("DefWindowProcW");
-    for (const WPARAM key : {VK_TAB, VK_RETURN, VK_LEFT, VK_UP, VK_RIGHT, VK_DOWN, VK_DELETE,
-                             VK_CONTROL, VK_ESCAPE}) {
+    for (const WPARAM key :
+         {VK_TAB, VK_RETURN, VK_LEFT, VK_UP, VK_RIGHT, VK_DOWN, VK_DELETE, VK_CONTROL, VK_ESCAPE}) {
         spy.clearCalls();
         PressKey(grid, key);
         for (const ImportCall& call : spy.callsOf("DefWindowProcW")) {
@@ -136,7 +136,8 @@ TEST_F(OtherKeys, ArrowKeysIgnoreTheRepeatCount) {
 
 // ---- Without a current cell ---------------------------------------------------------------------
 
-// A page down before the first size makes the view's origin negative; then there is no current cell.
+// A page down before the first size makes the view's origin negative; then there is no current
+// cell.
 class KeysWithoutACurrentCell : public GridUse {
 protected:
     void SetUp() override {

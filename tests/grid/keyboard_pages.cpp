@@ -107,8 +107,8 @@ TEST_F(PageKeys, PageUpMovesByTheVisibleRows) {
     told();
     EXPECT_EQ(PressKey(grid, VK_PRIOR), 0);
     EXPECT_EQ(Selection(), Block(2, 2, 14, 14));
-    EXPECT_EQ(told(), (Lines{"sent GRIDN_PAINTCELLS columns 0-6 rows 9-20",
-                             "sent GRIDN_CURRENTCELL C15"}));
+    EXPECT_EQ(told(),
+              (Lines{"sent GRIDN_PAINTCELLS columns 0-6 rows 9-20", "sent GRIDN_CURRENTCELL C15"}));
 }
 
 TEST_F(PageKeys, PageUpFromTheRowAfterTheFirstScreen) {
@@ -173,15 +173,12 @@ TEST_F(InvalidSelection, BecomesA1ByEveryArrowAndPageKey) {
         WPARAM key;
         Lines lines;
     } cases[] = {
-        {VK_LEFT,
-         {"sent GRIDN_PAINTCELLS columns 3-9 rows 30-41", "sent GRIDN_CURRENTCELL A1"}},
+        {VK_LEFT, {"sent GRIDN_PAINTCELLS columns 3-9 rows 30-41", "sent GRIDN_CURRENTCELL A1"}},
         {VK_UP, {"sent GRIDN_PAINTCELLS columns 4-10 rows 29-40", "sent GRIDN_CURRENTCELL A1"}},
         {VK_RIGHT, {"sent GRIDN_CURRENTCELL A1"}},
         {VK_DOWN, {"sent GRIDN_CURRENTCELL A1"}},
-        {VK_PRIOR,
-         {"sent GRIDN_PAINTCELLS columns 4-10 rows 19-30", "sent GRIDN_CURRENTCELL A1"}},
-        {VK_NEXT,
-         {"sent GRIDN_PAINTCELLS columns 4-10 rows 40-51", "sent GRIDN_CURRENTCELL A1"}}};
+        {VK_PRIOR, {"sent GRIDN_PAINTCELLS columns 4-10 rows 19-30", "sent GRIDN_CURRENTCELL A1"}},
+        {VK_NEXT, {"sent GRIDN_PAINTCELLS columns 4-10 rows 40-51", "sent GRIDN_CURRENTCELL A1"}}};
     for (const auto& one : cases) {
         SCOPED_TRACE(one.key);
         EXPECT_EQ(PressKey(grid, one.key), 0);

@@ -12,8 +12,8 @@ protected:
     int below(int end) { return static_cast<int>(random() % static_cast<unsigned>(end)); }
 
     void pressSomeKey() {
-        static constexpr int kKeys[] = {VK_LEFT, VK_UP,    VK_RIGHT, VK_DOWN,  VK_LEFT,
-                                        VK_UP,   VK_RIGHT, VK_DOWN,  VK_PRIOR, VK_NEXT,
+        static constexpr int kKeys[] = {VK_LEFT, VK_UP,     VK_RIGHT,  VK_DOWN,  VK_LEFT,
+                                        VK_UP,   VK_RIGHT,  VK_DOWN,   VK_PRIOR, VK_NEXT,
                                         VK_TAB,  VK_RETURN, VK_DELETE, VK_ESCAPE};
         // Most often one of the arrows, so that walks are long.
         const int key = kKeys[below(below(3) ? 8 : 14)];
@@ -86,8 +86,8 @@ TEST_P(RandomKeys, FollowTheModel) {
         history += what + "\n";
         EXPECT_EQ(told(), model.transcript);
         EXPECT_EQ(BlockName(Selection()), BlockName(model.selection));
-        EXPECT_EQ(VisibleRange(), Range(model.columns.first, model.columns.end(),
-                                        model.rows.first, model.rows.end()));
+        EXPECT_EQ(VisibleRange(), Range(model.columns.first, model.columns.end(), model.rows.first,
+                                        model.rows.end()));
         if (i % 50 == 0) {
             EXPECT_TRUE(isAsModel());
             if (model.isSelectionValid()) {

@@ -199,9 +199,9 @@ TEST_F(MousePress, CommitsTheEquationBarForTheOldCellFirst) {
     SendMessageW(edit, EM_SETMODIFY, TRUE, 0);
     told();
     press(middleX(3), middleY(4));
-    EXPECT_EQ(told(), (Lines{"sent GRIDN_EDITKILLFOCUS 1", "sent GRIDN_EQUATIONENTERED \"12\" B2",
-                             "sent GRIDN_PAINTCELLS columns 0-6 rows 0-11",
-                             "sent GRIDN_CELLCLICKED D5"}));
+    EXPECT_EQ(told(),
+              (Lines{"sent GRIDN_EDITKILLFOCUS 1", "sent GRIDN_EQUATIONENTERED \"12\" B2",
+                     "sent GRIDN_PAINTCELLS columns 0-6 rows 0-11", "sent GRIDN_CELLCLICKED D5"}));
     model.selection = Block(3, 3, 4, 4);
     EXPECT_EQ(highlight(), expectedHighlight());
 }

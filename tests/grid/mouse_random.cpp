@@ -11,13 +11,15 @@ protected:
     int below(int end) { return static_cast<int>(random() % static_cast<unsigned>(end)); }
 
     int someX() {
-        const int places[] = {below(clientWidth()), below(clientWidth()), below(40),
-                              clientWidth() - 20 + below(40), -1 - below(30), 30000 + below(9000)};
+        const int places[] = {
+            below(clientWidth()),           below(clientWidth()), below(40),
+            clientWidth() - 20 + below(40), -1 - below(30),       30000 + below(9000)};
         return places[below(6)];
     }
     int someY() {
-        const int places[] = {below(clientHeight()), below(clientHeight()), below(cellsTop()),
-                              clientHeight() - 20 + below(40), -1 - below(30), below(32000)};
+        const int places[] = {below(clientHeight()), below(clientHeight()),
+                              below(cellsTop()),     clientHeight() - 20 + below(40),
+                              -1 - below(30),        below(32000)};
         return places[below(6)];
     }
 
@@ -88,8 +90,8 @@ TEST_P(RandomMouse, FollowsTheModel) {
         history += what + "\n";
         EXPECT_EQ(told(), model.transcript);
         EXPECT_EQ(BlockName(Selection()), BlockName(model.selection));
-        EXPECT_EQ(VisibleRange(), Range(model.columns.first, model.columns.end(),
-                                        model.rows.first, model.rows.end()));
+        EXPECT_EQ(VisibleRange(), Range(model.columns.first, model.columns.end(), model.rows.first,
+                                        model.rows.end()));
         if (i % 20 == 0 && model.isSelectionValid()) {
             EXPECT_EQ(highlight(), expectedHighlight());
         }

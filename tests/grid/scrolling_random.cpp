@@ -158,7 +158,7 @@ protected:
 
 TEST_P(RandomScrolling, FollowsTheModel) {
     random.seed(GetParam());
-    open(330 + below(100), 168 + below(60));
+    open(330 + below(100), 168 + below(60), below(2) ? Bars::FromBegin : Bars::WhenRanged);
     if (below(2)) {
         SetHorizontalDataRange(50);
         model.setHorizontalDataRange(50);

@@ -63,10 +63,9 @@ TEST_F(SelectionCalls, RefusedBlocksRepaintNothing) {
 }
 
 TEST_F(SelectionCalls, HighlightMovesToTheNewBlock) {
-    const GridSelection blocks[] = {Block(1, 1, 1, 1),   Block(0, 3, 2, 6),
-                                    Block(2, 5, 4, 10),  Block(0, 255, 3, 3),
-                                    Block(4, 4, 0, 999), Block(0, 255, 0, 16383),
-                                    Block(20, 30, 0, 9), Block(0, 2, 200, 300)};
+    const GridSelection blocks[] = {
+        Block(1, 1, 1, 1),   Block(0, 3, 2, 6),       Block(2, 5, 4, 10),  Block(0, 255, 3, 3),
+        Block(4, 4, 0, 999), Block(0, 255, 0, 16383), Block(20, 30, 0, 9), Block(0, 2, 200, 300)};
     for (const GridSelection& block : blocks) {
         Select(block.left, block.right, block.top, block.bottom);
         ASSERT_TRUE(model.setSelection(block));
@@ -121,8 +120,7 @@ TEST_F(SelectionCalls, WriteTheirWordsAndNoMore) {
     Select(1, 2, 3, 4);
     WORD words[6] = {0xAAAA, 0xAAAA, 0xAAAA, 0xAAAA, 0xAAAA, 0xAAAA};
     GetSelectedRanged(reinterpret_cast<GridSelection*>(words + 1));
-    EXPECT_EQ(std::vector<WORD>(words, words + 6),
-              (std::vector<WORD>{0xAAAA, 1, 2, 3, 4, 0xAAAA}));
+    EXPECT_EQ(std::vector<WORD>(words, words + 6), (std::vector<WORD>{0xAAAA, 1, 2, 3, 4, 0xAAAA}));
     WORD pair[4] = {0xAAAA, 0xAAAA, 0xAAAA, 0xAAAA};
     GetCurrentSelectedCell(reinterpret_cast<GridCellPair*>(pair + 1));
     EXPECT_EQ(std::vector<WORD>(pair, pair + 4), (std::vector<WORD>{0xAAAA, 1, 3, 0xAAAA}));

@@ -50,7 +50,7 @@ TEST_F(HeaderSelection, HighlightFollows) {
         bool isColumn;
         int pressed;
         int current;
-    } clicks[] = {{true, 1, 1}, {true, 1, 3},  {false, 2, 2}, {false, 5, 2},
+    } clicks[] = {{true, 1, 1}, {true, 1, 3},   {false, 2, 2}, {false, 5, 2},
                   {true, 5, 0}, {false, 0, 10}, {true, 0, 0}};
     for (const auto& click : clicks) {
         clickHeader(click.isColumn ? columnHeader : rowHeader, click.pressed, click.current);
@@ -115,6 +115,13 @@ TEST_F(HeaderSelection, RealPressOnARow) {
     ReleaseAt(rowHeader, 10, 32 + 20);
     host.pump();
     EXPECT_EQ(Selection(), Block(0, 255, 2, 2));
+}
+
+TEST_F(HeaderSelection, OtherWindowsAreNoHeaders) {
+    for (HWND window : {edit, grid, host.window(), HWND{nullptr}}) {
+        EXPECT_EQ(clickHeader(window, 1, 2), 0);
+    }
+    EXPECT_EQ(Selection(), Block(0, 0, 0, 0));
 }
 
 TEST_F(HeaderSelection, BlocksPastTheSheetStayAsClicked) {

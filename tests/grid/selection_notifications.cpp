@@ -105,8 +105,7 @@ TEST_F(Notifications, ResizesCarrySizeAndAbsoluteIndexAsAValue) {
     told();
     SendResized(grid, columnHeader, 2, 60);
     SendResized(grid, rowHeader, 3, 16);
-    EXPECT_EQ(told(),
-              (Lines{"sent GRIDN_COLUMNRESIZED 12 60", "sent GRIDN_ROWRESIZED 703 16"}));
+    EXPECT_EQ(told(), (Lines{"sent GRIDN_COLUMNRESIZED 12 60", "sent GRIDN_ROWRESIZED 703 16"}));
 }
 
 TEST_F(Notifications, EquationEnteredCarriesTheRowInTheLowWord) {

@@ -157,6 +157,23 @@ TEST_F(GridUnknownHeader, NotificationsInAnotherNameAreHarmless) {
     EXPECT_TRUE(IsWindow(grid));
 }
 
+using GridAlone = GuardedGridTest;
+
+// Without a parent there is nobody to notify; the screen's text gives the equation bar's height.
+TEST_F(GridAlone, WindowWithoutAParentWorks) {
+    ASSERT_NE(RegisterGridControl(GetModuleHandleW(nullptr)), 0u);
+    grid = CreateWindowExW(0, KORGRID_CLASS, L"", WS_POPUP | WS_VISIBLE | WS_CLIPCHILDREN, 0, 0,
+                           300, 200, nullptr, nullptr, GetModuleHandleW(nullptr), nullptr);
+    ASSERT_NE(grid, nullptr);
+    host.pump();
+    EXPECT_EQ(ChildRect(EquationEditOf(grid)), (RECT{75, 0, 300, EquationBarHeightFor(nullptr)}));
+    SendMessageW(grid, GRIDM_REDRAW, 0, 0);
+    PressAt(grid, 100, 100);
+    ReleaseAt(grid, 100, 100);
+    SendResized(grid, ColumnHeaderOf(grid), 0, 70);
+    EXPECT_EQ(KorHeader_GetItemSize(ColumnHeaderOf(grid), 0), 70);
+}
+
 using GridTwice = GuardedGridTest;
 
 // There is one grid in a process; a second window takes its place and breaks nothing else.

@@ -72,9 +72,7 @@ TEST_F(GridLifetime, EndDeletesImageDCAndPenOnce) {
     create(400, 300);
     destroy();
     create(400, 300);
-    HGDIOBJ bitmap = GetCurrentObject(imageDC, OBJ_BITMAP);
     destroy();
-    spy.clearCalls();
 
     HPEN pen = nullptr;
     HFONT font = nullptr;
@@ -91,7 +89,7 @@ TEST_F(GridLifetime, EndDeletesImageDCAndPenOnce) {
     create(400, 300);
     ASSERT_NE(pen, nullptr);
     ASSERT_NE(font, nullptr);
-    bitmap = GetCurrentObject(imageDC, OBJ_BITMAP);
+    const HGDIOBJ bitmap = GetCurrentObject(imageDC, OBJ_BITMAP);
     DestroyWindow(grid);
     EXPECT_EQ(CountCalls(spy, "DeleteObject", bitmap), 1);
     EXPECT_EQ(CountCalls(spy, "DeleteObject", pen), 1);
@@ -99,6 +97,24 @@ TEST_F(GridLifetime, EndDeletesImageDCAndPenOnce) {
     EXPECT_EQ(CountCalls(spy, "DeleteDC", imageDC), 1);
     LOGFONTW description{};
     EXPECT_NE(GetObjectW(font, sizeof description, &description), 0);
+}
+
+// What the first grid had is gone, and its handles may be somebody else's by now.
+TEST_F(GridLifetime, SecondGridDeletesNothingOfTheFirst) {
+    create(400, 300);
+    const HGDIOBJ bitmap = GetCurrentObject(imageDC, OBJ_BITMAP);
+    const HDC dc = imageDC;
+    spy.watchAll({"DeleteObject", "DeleteDC", "SelectObject"});
+    DestroyWindow(grid);
+    EXPECT_EQ(CountCalls(spy, "DeleteObject", bitmap), 1);
+    EXPECT_EQ(CountCalls(spy, "DeleteDC", dc), 1);
+    spy.clearCalls();
+    grid = host.createGrid(400, 300);
+    resize(300, 200);
+    DestroyWindow(grid);
+    EXPECT_EQ(CountCalls(spy, "DeleteObject", bitmap), 0);
+    EXPECT_EQ(CountCalls(spy, "SelectObject", dc), 0);
+    EXPECT_EQ(CountCalls(spy, "DeleteDC", dc), 0);
 }
 
 TEST_F(GridLifetime, EndAnswersZero) {

@@ -94,8 +94,9 @@ TEST_F(GridMessages, OtherCommandsReturnOneAndDoNothing) {
 // The high word tells what a child did; the id alone counts.
 TEST_F(GridMessages, CommandsAreToldApartByTheirIds) {
     create(400, 300);
-    SendMessageW(grid, WM_COMMAND, MAKEWPARAM(1, BN_CLICKED), 0);
+    SendMessageW(grid, WM_COMMAND, MAKEWPARAM(1, BN_DOUBLECLICKED), 0);
     EXPECT_EQ(Selection(), (GridSelection{0, 255, 0, 16383}));
+    EXPECT_EQ(SendMessageW(grid, WM_COMMAND, MAKEWPARAM(6, EN_CHANGE), 0), 1) << "the edit's";
     EXPECT_EQ(SendMessageW(grid, WM_COMMAND, 7, 0), 1) << "nothing was typed";
     EXPECT_EQ(SendMessageW(grid, WM_COMMAND, 8, 0), 0);
     EXPECT_EQ(host.transcript(), (Lines{"sent GRIDN_CURRENTCELL A1"}));

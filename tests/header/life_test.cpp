@@ -178,6 +178,15 @@ TEST_F(HeaderLife, AnswersItsMessages) {
                            {WM_CREATE, 0}, {WM_PAINT, 0}, {WM_DESTROY, 0}}));
 }
 
+TEST_F(HeaderLife, LeavesOtherMessagesToTheSystem) {
+    HWND header = createHorizontal();
+    EXPECT_TRUE(SetWindowTextW(header, L"a text"));
+    EXPECT_EQ(TextOf(header), L"a text");
+    EXPECT_EQ(SendMessageW(header, WM_USER, 0, 0), 0);
+    EXPECT_EQ(SendMessageW(header, WM_USER + 8, 0, 0), 0);
+    EXPECT_EQ(KorHeader_GetItemCount(header), 0);
+}
+
 // Calls each item message on the window procedure and checks the results of a strip without a
 // record.
 void ExpectNoRecord(HWND window, const PassOn& passOn) {
@@ -240,6 +249,12 @@ TEST_F(HeaderWithoutMemory, ExistsAndAnswersWithFailures) {
         EXPECT_EQ(heap.live(), 0) << allocation << "\n" << heap.liveReport();
         DestroyWindow(header);
     }
+}
+
+TEST_F(HeaderWithoutMemory, LeavesOtherMessagesToTheSystem) {
+    HWND header = createFailingAt(1);
+    EXPECT_TRUE(SetWindowTextW(header, L"a text"));
+    EXPECT_EQ(TextOf(header), L"a text");
 }
 
 TEST_F(HeaderWithoutMemory, ReturnsOneFromCreation) {

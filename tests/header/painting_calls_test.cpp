@@ -159,6 +159,17 @@ INSTANTIATE_TEST_SUITE_P(Heights, HeaderFont,
                                            FontCase{8, -16, -32}, FontCase{1, -3, 0},
                                            FontCase{1, 3, 0}, FontCase{5, -13, -16}));
 
+// A strip does not handle WM_SETFONT: its labels keep the DC's font.
+TEST_F(HeaderPaintingCalls, KeepTheDCsFontWhenToldAnother) {
+    create(false);
+    const Picture before = ReadWindow(header);
+    HFONT large = CreateFontW(-30, 0, 0, 0, FW_BOLD, 0, 0, 0, 0, 0, 0, 0, 0, L"Arial");
+    SendMessageW(header, WM_SETFONT, reinterpret_cast<WPARAM>(large), TRUE);
+    Repaint(header);
+    EXPECT_TRUE(SamePicture(before, ReadWindow(header)));
+    DeleteObject(large);
+}
+
 TEST_F(HeaderPaintingCalls, UseTheUnscaledFontWhenNoneCanBeMade) {
     create(false);
     SetGridZoomLevel(8);

@@ -195,6 +195,17 @@ TEST_F(HeaderResize, NeverHasABoundBelowThreePixels) {
     EXPECT_EQ(SizesOf(header)[0], 4);
 }
 
+TEST_F(HeaderResize, NeverHasARowBoundBelowThreePixels) {
+    HWND rows = createVertical(300);
+    AppendSizes(rows, {60});
+    for (int height : {0, 5, 12, 13}) {
+        createVertical(height);
+        SetItem(rows, 0, L"", 60);
+        drag(rows, 58, 59);
+        EXPECT_EQ(SizesOf(rows)[0], 3) << height;
+    }
+}
+
 TEST_F(HeaderResize, TellsTheSizeAtFullZoom) {
     struct Case {
         DWORD zoom;
@@ -315,6 +326,21 @@ TEST_F(HeaderResize, SurvivesAMoveOnAStripWithFewerItems) {
     ReleaseAt(other, 60, 3);
     EXPECT_EQ(SizesOf(header), (Sizes{60, 60, 60}));
     EXPECT_EQ(SizesOf(other), (Sizes{50}));
+}
+
+TEST_F(HeaderResize, SurvivesAMoveOnAStripWithFewerPlaces) {
+    for (int i = 0; i < 3; ++i) KorHeader_DeleteItem(header, 0);
+    AppendSizes(header, Sizes(40, 9));
+    HWND other = createHorizontal();
+    AppendSizes(other, {50});
+    PressAt(header, 357, 3);  // border of item 39; the other strip has places for ten
+    MoveTo(other, 300, 3);
+    MoveTo(other, 390, 3);
+    EXPECT_EQ(heap.report(), "");
+    ReleaseAt(other, 300, 3);
+    EXPECT_EQ(heap.report(), "");
+    EXPECT_EQ(SizesOf(other), (Sizes{50}));
+    EXPECT_EQ(SizesOf(header), Sizes(40, 9));
 }
 
 }  // namespace

@@ -13,10 +13,14 @@ constexpr size_t kThunkSize = 64;
 
 // Next free place for machine code, or nullptr.
 uint8_t* NextThunkPlace() {
-    static uint8_t* code = static_cast<uint8_t*>(
-        VirtualAlloc(nullptr, kCodeSize, MEM_COMMIT | MEM_RESERVE, PAGE_EXECUTE_READWRITE));
-    static size_t used = 0;
-    if (!code || used + kThunkSize > kCodeSize) return nullptr;
+    static uint8_t* code = nullptr;
+    static size_t used = kCodeSize;
+    if (used + kThunkSize > kCodeSize) {
+        code = static_cast<uint8_t*>(
+            VirtualAlloc(nullptr, kCodeSize, MEM_COMMIT | MEM_RESERVE, PAGE_EXECUTE_READWRITE));
+        if (!code) return nullptr;
+        used = 0;
+    }
     uint8_t* place = code + used;
     used += kThunkSize;
     return place;

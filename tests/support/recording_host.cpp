@@ -49,6 +49,12 @@ RecordingHost* HostOf(HWND window) {
     return reinterpret_cast<RecordingHost*>(GetWindowLongPtrW(window, GWLP_USERDATA));
 }
 
+// The system makes a move when windows change under the resting pointer, at any time; during a
+// test's own drag it would count as part of it. A test's moves have the button down.
+bool IsTheSystemsMove(const MSG& message) {
+    return message.message == WM_MOUSEMOVE && !(message.wParam & MK_LBUTTON);
+}
+
 constexpr wchar_t kHostProperty[] = L"recording host";
 
 // Child with a control id and, where two share the id, a text.
@@ -108,6 +114,7 @@ void RecordingHost::pump() {
     int paints = 0;
     MSG message{};
     while (paints < kMostPaints && PeekMessageW(&message, nullptr, 0, 0, PM_REMOVE)) {
+        if (IsTheSystemsMove(message)) continue;
         paints += message.message == WM_PAINT;
         TranslateMessage(&message);
         dispatched_ = message;

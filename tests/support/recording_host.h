@@ -69,7 +69,8 @@ public:
     // timers, edit and text messages, and the grid's and headers' own.
     void alsoRecord(HWND window, const std::string& label);
 
-    // Dispatches what is in the queue until it is empty. A window that does not validate itself in
+    // Dispatches what is in the queue until it is empty; mouse moves without a pressed button,
+    // which the system makes by itself, are thrown away. A window that does not validate itself in
     // WM_PAINT is given up after some rounds. The second form goes on for a time, for timers.
     void pump();
     void pumpFor(DWORD milliseconds);

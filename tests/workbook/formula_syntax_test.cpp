@@ -30,8 +30,8 @@ TEST(FormulaSyntax, MissesClosingSigns) {
 
 TEST(FormulaSyntax, FindsSymbolsThatCannotStandThere) {
     for (const wchar_t* formula :
-         {L"1)", L"*2", L"1**2", L"1 2", L"A1 A2", L"1=<2", L"()", L"#REF!", L"{1}", L"1,2", L"A1:5",
-          L"1:2", L"2A", L".", L"\"a\"\"b\" \"c\"", L"%5", L"A1:B2:C3", L"@A1", L"1!"})
+         {L"1)", L"*2", L"1**2", L"1 2", L"A1 A2", L"1=<2", L"()", L"#REF!", L"{1}", L"1,2",
+          L"A1:5", L"1:2", L"2A", L".", L"\"a\"\"b\" \"c\"", L"%5", L"A1:B2:C3", L"@A1", L"1!"})
         EXPECT_EQ(ProblemOf(formula), FormulaProblem::UnexpectedSymbol) << formula;
 }
 

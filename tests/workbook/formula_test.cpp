@@ -161,8 +161,8 @@ TEST(Formula, NeverShowsANegativeZero) {
 
 // ---- Functions
 
-constexpr CellList kMixed = {{L"A1", L"1"},    {L"A2", L"2"},    {L"A3", L"text"},
-                             {L"A4", L"TRUE"}, {L"A5", L"'100"}, {L"A7", L"6"}};
+const CellList kMixed = {{L"A1", L"1"},    {L"A2", L"2"},    {L"A3", L"text"},
+                         {L"A4", L"TRUE"}, {L"A5", L"'100"}, {L"A7", L"6"}};
 
 TEST(Formula, SumsOnlyTheNumbersAmongCells) {
     EXPECT_EQ(Result(L"=SUM(A1:A9)", kMixed), L"9");
@@ -214,7 +214,7 @@ TEST(Formula, ChoosesByACondition) {
 }
 
 TEST(Formula, ChoosesBlocks) {
-    constexpr CellList cells = {{L"A1", L"1"}, {L"A2", L"2"}, {L"B1", L"10"}, {L"B2", L"20"}};
+    const CellList cells = {{L"A1", L"1"}, {L"A2", L"2"}, {L"B1", L"10"}, {L"B2", L"20"}};
     EXPECT_EQ(Result(L"=SUM(IF(TRUE,A1:A2,B1:B2))", cells), L"3");
     EXPECT_EQ(Result(L"=SUM(IF(FALSE,A1:A2,B1:B2))", cells), L"30");
 }

@@ -10,7 +10,8 @@ namespace {
 
 TEST(Functions, ListsAllInAlphabeticalOrder) {
     std::wstring names;
-    for (const FunctionDescription& function : Functions()) names += std::wstring(function.name) + L" ";
+    for (const FunctionDescription& function : Functions())
+        names += std::wstring(function.name) + L" ";
     EXPECT_EQ(names, L"AVERAGE COUNT IF MAX MIN SUM ");
 }
 

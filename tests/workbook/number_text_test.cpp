@@ -26,9 +26,10 @@ TEST(NumberText, ReadsNumbers) {
 
 TEST(NumberText, LeavesOtherTextsAlone) {
     for (const wchar_t* text :
-         {L"", L" ", L".", L"-", L"+", L"%", L"-%", L".%", L"e5", L".e5", L"1e", L"1e+", L"1,5",
-          L"1 000", L"1'000", L"--5", L"+-5", L"1.2.3", L"12%%", L"12 %", L"%12", L"0x10", L"inf",
-          L"nan", L"1f", L"1e5.5", L"- 5", L"1e309", L"\u0661", L"5\t", L"1d5"})
+         {L"",    L" ",     L".",    L"-",     L"+",      L"%",     L"-%",    L".%",
+          L"e5",  L".e5",   L"1e",   L"1e+",   L"1,5",    L"1 000", L"1'000", L"--5",
+          L"+-5", L"1.2.3", L"12%%", L"12 %",  L"%12",    L"0x10",  L"inf",   L"nan",
+          L"1f",  L"1e5.5", L"- 5",  L"1e309", L"\u0661", L"5\t",   L"1d5"})
         EXPECT_EQ(ReadNumber(text), std::nullopt) << text;
 }
 
@@ -57,6 +58,15 @@ TEST(NumberText, ShowsFractionsInElevenCharacters) {
     EXPECT_EQ(DisplayNumber(0.1 + 0.2), L"0.3");
     EXPECT_EQ(DisplayNumber(2.5), L"2.5");
     EXPECT_EQ(DisplayNumber(0.99999999999), L"1");
+    EXPECT_EQ(DisplayNumber(1e10 + 0.4), L"10000000000");
+}
+
+TEST(NumberText, RoundsHalvesUp) {
+    EXPECT_EQ(DisplayNumber(1234567892.5), L"1234567893");
+    EXPECT_EQ(DisplayNumber(-1234567892.5), L"-1234567893");
+    EXPECT_EQ(DisplayNumber(1.0000000005), L"1.000000001");
+    EXPECT_EQ(DisplayNumber(1.9999999995), L"2");
+    EXPECT_EQ(DisplayNumber(1.5e11 + 5e5), L"1.50001E+11");
 }
 
 TEST(NumberText, ShowsSmallNumbersWithAnExponent) {

@@ -9,9 +9,7 @@
 namespace workbook {
 namespace {
 
-ValueKind KindOf(std::wstring_view typed) {
-    return ValueAt(SheetOf({{L"B4", typed}}), L"B4").kind;
-}
+ValueKind KindOf(std::wstring_view typed) { return ValueAt(SheetOf({{L"B4", typed}}), L"B4").kind; }
 
 TEST(Sheet, TellsKindsByWhatWasTyped) {
     EXPECT_EQ(KindOf(L"12.5"), ValueKind::Number);
@@ -38,7 +36,8 @@ TEST(Sheet, KeepsWhatWasTyped) {
 }
 
 TEST(Sheet, ForcesTextAfterAnApostrophe) {
-    const Sheet sheet = SheetOf({{L"A1", L"'12"}, {L"A2", L"'=A1"}, {L"A3", L"'"}, {L"A4", L"''x"}});
+    const Sheet sheet =
+        SheetOf({{L"A1", L"'12"}, {L"A2", L"'=A1"}, {L"A3", L"'"}, {L"A4", L"''x"}});
     EXPECT_EQ(ValueAt(sheet, L"A1").kind, ValueKind::Text);
     EXPECT_EQ(Show(sheet, L"A1"), L"12");
     EXPECT_EQ(Show(sheet, L"A2"), L"=A1");
@@ -96,9 +95,14 @@ TEST(Sheet, RefusesCellsOutsideAndTextsTooLong) {
 }
 
 TEST(Sheet, ListsOccupiedCellsColumnByColumn) {
-    const Sheet sheet = SheetOf(
-        {{L"B1", L"1"}, {L"A64", L"1"}, {L"A65", L"1"}, {L"A2", L"1"}, {L"C700", L"1"}, {L"D1", L"1"}});
-    const std::vector<CellAddress> expected{At(L"A2"), At(L"A64"), At(L"A65"), At(L"B1"), At(L"C700")};
+    const Sheet sheet = SheetOf({{L"B1", L"1"},
+                                 {L"A64", L"1"},
+                                 {L"A65", L"1"},
+                                 {L"A2", L"1"},
+                                 {L"C700", L"1"},
+                                 {L"D1", L"1"}});
+    const std::vector<CellAddress> expected{At(L"A2"), At(L"A64"), At(L"A65"), At(L"B1"),
+                                            At(L"C700")};
     EXPECT_EQ(sheet.occupiedIn(BlockAt(L"A1:C700")), expected);
     EXPECT_EQ(sheet.occupiedIn(BlockAt(L"A3:C64")), std::vector<CellAddress>{At(L"A64")});
     EXPECT_EQ(sheet.occupiedIn(BlockAt(L"A65:A65")), std::vector<CellAddress>{At(L"A65")});

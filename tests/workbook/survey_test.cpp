@@ -8,8 +8,13 @@ namespace workbook {
 namespace {
 
 TEST(Survey, SumsUpTheNumbersOfABlock) {
-    const Sheet sheet = SheetOf({{L"A1", L"1"}, {L"A2", L"=A1+1"}, {L"B1", L"text"}, {L"B2", L"=1/0"},
-                                 {L"C9", L"-9"}, {L"A3", L"true"}, {L"D1", L"1000"}});
+    const Sheet sheet = SheetOf({{L"A1", L"1"},
+                                 {L"A2", L"=A1+1"},
+                                 {L"B1", L"text"},
+                                 {L"B2", L"=1/0"},
+                                 {L"C9", L"-9"},
+                                 {L"A3", L"true"},
+                                 {L"D1", L"1000"}});
     const BlockStatistics statistics = SurveyBlock(sheet, BlockAt(L"A1:C16384"));
     EXPECT_EQ(statistics.occupied, 6u);
     EXPECT_EQ(statistics.numbers, 3u);

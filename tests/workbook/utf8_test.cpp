@@ -53,23 +53,23 @@ TEST(Utf8, ComesBackForEveryCodePoint) {
 }
 
 TEST(Utf8, AcceptsTheEdgesOfEachLength) {
-    for (const char* bytes : {"\x7F", "\xC2\x80", "\xDF\xBF", "\xE0\xA0\x80", "\xED\x9F\xBF",
-                              "\xEE\x80\x80", "\xEF\xBF\xBF", "\xF0\x90\x80\x80",
-                              "\xF4\x8F\xBF\xBF"})
+    for (const char* bytes :
+         {"\x7F", "\xC2\x80", "\xDF\xBF", "\xE0\xA0\x80", "\xED\x9F\xBF", "\xEE\x80\x80",
+          "\xEF\xBF\xBF", "\xF0\x90\x80\x80", "\xF4\x8F\xBF\xBF"})
         EXPECT_EQ(FindInvalidUtf8(bytes), std::nullopt) << bytes;
 }
 
 TEST(Utf8, FindsWhereInvalidBytesBegin) {
     EXPECT_EQ(FindInvalidUtf8("ab\xFFz"), 2u);
-    EXPECT_EQ(FindInvalidUtf8("ab\x80"), 2u);              // continuation without a beginning
-    EXPECT_EQ(FindInvalidUtf8("a\xC3"), 1u);               // cut off at the end
+    EXPECT_EQ(FindInvalidUtf8("ab\x80"), 2u);  // continuation without a beginning
+    EXPECT_EQ(FindInvalidUtf8("a\xC3"), 1u);   // cut off at the end
     EXPECT_EQ(FindInvalidUtf8("a\xE2\x82"), 1u);
-    EXPECT_EQ(FindInvalidUtf8("\xC3(z"), 0u);              // continuation missing
-    EXPECT_EQ(FindInvalidUtf8("\xC0\xAF"), 0u);            // overlong
+    EXPECT_EQ(FindInvalidUtf8("\xC3(z"), 0u);    // continuation missing
+    EXPECT_EQ(FindInvalidUtf8("\xC0\xAF"), 0u);  // overlong
     EXPECT_EQ(FindInvalidUtf8("\xE0\x9F\xBF"), 0u);
     EXPECT_EQ(FindInvalidUtf8("\xF0\x8F\xBF\xBF"), 0u);
     EXPECT_EQ(FindInvalidUtf8("\xC3\xA9\xED\xA0\x80"), 2u);  // a surrogate
-    EXPECT_EQ(FindInvalidUtf8("\xF4\x90\x80\x80"), 0u);    // above 10FFFF
+    EXPECT_EQ(FindInvalidUtf8("\xF4\x90\x80\x80"), 0u);      // above 10FFFF
     EXPECT_EQ(FindInvalidUtf8("\xF5\x80\x80\x80"), 0u);
 }
 

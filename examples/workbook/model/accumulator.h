@@ -16,8 +16,8 @@ public:
         ++count_;
         // Neumaier's summation: what rounding cut off is collected beside the sum.
         const double next = sum_ + number;
-        lost_ += std::fabs(sum_) >= std::fabs(number) ? (sum_ - next) + number
-                                                      : (number - next) + sum_;
+        lost_ +=
+            std::fabs(sum_) >= std::fabs(number) ? (sum_ - next) + number : (number - next) + sum_;
         sum_ = next;
     }
 

@@ -69,19 +69,19 @@ std::optional<CellAddress> ParseAddress(std::wstring_view text);
 std::optional<Block> ParseBlock(std::wstring_view text);
 
 enum class ReferenceSyntax {
-    NotAReference, // "ABC", "1A", "A0x"
-    OutsideSheet,  // looks like a reference, but there is no such cell: "IW1", "A16385", "A0"
+    NotAReference,  // "ABC", "1A", "A0x"
+    OutsideSheet,   // looks like a reference, but there is no such cell: "IW1", "A16385", "A0"
     Cell
 };
 
 struct ScannedReference {
     ReferenceSyntax syntax = ReferenceSyntax::NotAReference;
-    CellAddress cell; // for ReferenceSyntax::Cell
+    CellAddress cell;  // for ReferenceSyntax::Cell
 };
 
 // Tells what the whole of `text` is; formulas answer #REF! for the second kind.
 ScannedReference ScanReference(std::wstring_view text);
 
-} // namespace workbook
+}  // namespace workbook
 
 #endif

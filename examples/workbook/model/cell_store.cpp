@@ -73,8 +73,10 @@ bool CellStore::isPending(CellAddress cell) const noexcept {
 
 void CellStore::setPending(CellAddress cell, bool pending) noexcept {
     Page* page = pageOf(cell);
-    if (pending) page->pending |= BitOf(cell);
-    else page->pending &= ~BitOf(cell);
+    if (pending)
+        page->pending |= BitOf(cell);
+    else
+        page->pending &= ~BitOf(cell);
 }
 
 bool CellStore::findPending(const Block& block, CellAddress from,

@@ -59,8 +59,8 @@ public:
     int rows() const noexcept;
     size_t occupiedCells() const noexcept { return occupied_; }
 
-    // Calls visit(CellAddress, const Cell&) for the occupied cells of a block that lies in the sheet,
-    // column by column, each from top to bottom, until it returns false.
+    // Calls visit(CellAddress, const Cell&) for the occupied cells of a block that lies in the
+    // sheet, column by column, each from top to bottom, until it returns false.
     template <typename Visit>
     void walk(const Block& block, Visit visit) const;
 

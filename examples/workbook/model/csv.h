@@ -18,7 +18,7 @@
 
 namespace workbook {
 
-constexpr size_t kLargestFile = size_t{64} << 20; // bytes
+constexpr size_t kLargestFile = size_t{64} << 20;  // bytes
 
 enum class LineEnding { CrLf, Lf, Cr };
 
@@ -26,7 +26,7 @@ enum class LineEnding { CrLf, Lf, Cr };
 struct CsvFormat {
     wchar_t separator = L',';
     bool byteOrderMark = false;
-    LineEnding lineEnding = LineEnding::CrLf; // the first one of the file counts
+    LineEnding lineEnding = LineEnding::CrLf;  // the first one of the file counts
     bool endsWithLineBreak = true;
 
     // The shape as read: how many fields each line had (0 for an empty line) and how far the
@@ -39,8 +39,8 @@ struct CsvFormat {
 enum class CsvError {
     FileTooLarge,
     NotUtf8,
-    ZeroByte,       // a binary file
-    TextAfterQuote, // "abc"d
+    ZeroByte,        // a binary file
+    TextAfterQuote,  // "abc"d
     UnterminatedQuote,
     TooManyColumns,
     TooManyRows,
@@ -50,9 +50,9 @@ enum class CsvError {
 
 struct CsvProblem {
     CsvError error;
-    size_t line = 0;       // counted from 1 as text editors do; 0: the file as a whole
-    size_t byteOffset = 0; // from the beginning of the file, for NotUtf8 and ZeroByte
-    std::wstring message;  // a sentence for the user; it names the line or the limit
+    size_t line = 0;        // counted from 1 as text editors do; 0: the file as a whole
+    size_t byteOffset = 0;  // from the beginning of the file, for NotUtf8 and ZeroByte
+    std::wstring message;   // a sentence for the user; it names the line or the limit
 };
 
 // Fills a new sheet; an open one is not touched by reading.
@@ -62,7 +62,7 @@ struct CsvDocument {
 };
 
 struct CsvResult {
-    std::optional<CsvDocument> document; // nothing when there was a problem
+    std::optional<CsvDocument> document;  // nothing when there was a problem
     std::optional<CsvProblem> problem;
 };
 
@@ -74,6 +74,6 @@ CsvResult ReadCsv(std::string_view bytes) noexcept;
 // comes out the same, unless it had needless quotes or mixed line endings. Throws std::bad_alloc.
 std::string WriteCsv(const Sheet& sheet, const CsvFormat& format);
 
-} // namespace workbook
+}  // namespace workbook
 
 #endif

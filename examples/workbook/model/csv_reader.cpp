@@ -1,6 +1,7 @@
 // Reads CSV: from bytes to a new sheet, or to a message that says where it went wrong.
 #include "csv.h"
 #include "csv_separator.h"
+#include "last_words.h"
 #include "utf8.h"
 
 #include <new>
@@ -66,7 +67,8 @@ std::optional<CsvProblem> FindFileProblem(std::string_view bytes) {
     return std::nullopt;
 }
 
-// Goes through valid UTF-8 once, from record to record. Positions are in bytes, lines counted from 1.
+// Goes through valid UTF-8 once, from record to record. Positions are in bytes, lines counted
+// from 1.
 class RecordReader {
 public:
     RecordReader(std::string_view bytes, CsvDocument& document)
@@ -183,8 +185,10 @@ CsvResult ReadUnguarded(std::string_view bytes) {
     document.format.separator = static_cast<wchar_t>(DetectSeparator(bytes).value_or(','));
 
     RecordReader reader(bytes, document);
-    if (reader.readAll()) result.document = std::move(document);
-    else result.problem = std::move(reader.problem());
+    if (reader.readAll())
+        result.document = std::move(document);
+    else
+        result.problem = std::move(reader.problem());
     return result;
 }
 
@@ -195,8 +199,9 @@ CsvResult ReadCsv(std::string_view bytes) noexcept {
         return ReadUnguarded(bytes);
     } catch (const std::bad_alloc&) {
         CsvResult result;
-        result.problem =
-            FileProblemOf(CsvError::NoMemory, L"There is not enough memory for the file.");
+        result.problem.emplace();
+        result.problem->error = CsvError::NoMemory;
+        result.problem->message = TextOrNothing(L"There is not enough memory for the file.");
         return result;
     }
 }

@@ -89,9 +89,9 @@ std::optional<char> DetectSeparator(std::string_view bytes) {
         const Score score = ScoreOf(candidate, sample.lines);
         if (score.lines == 0) continue;
         const bool beatsDecimalComma = winner == kComma && sample.isCommaBetweenDigitsOnly;
-        const bool isBetter = score.lines > best.lines ||
-                              (score.lines == best.lines &&
-                               (beatsDecimalComma || score.count > best.count));
+        const bool isBetter =
+            score.lines > best.lines ||
+            (score.lines == best.lines && (beatsDecimalComma || score.count > best.count));
         if (!isBetter) continue;
         winner = candidate;
         best = score;

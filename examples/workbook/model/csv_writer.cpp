@@ -93,8 +93,8 @@ std::string WriteCsv(const Sheet& sheet, const CsvFormat& format) {
     const std::wstring mustBeQuoted = std::wstring(L"\"\r\n") + format.separator;
     std::string bytes = WriteLines(sheet, format, mustBeQuoted);
 
-    // Texts with other separators in them may outnumber the real ones, so that reading the file would
-    // cut it up differently. Then those texts need quotes, too.
+    // Texts with other separators in them may outnumber the real ones, so that reading the file
+    // would cut it up differently. Then those texts need quotes, too.
     const auto found = DetectSeparator(bytes);
     if (found && *found != static_cast<char>(format.separator))
         bytes = WriteLines(sheet, format, L"\"\r\n,;\t");

@@ -7,8 +7,8 @@ namespace workbook {
 
 namespace {
 
-// Pieces are numbered as in a heap: 1 is everything, 2n and 2n + 1 are the halves of n, and a single
-// column (or row) c is kColumnCount + c (kRowCount + c).
+// Pieces are numbered as in a heap: 1 is everything, 2n and 2n + 1 are the halves of n, and a
+// single column (or row) c is kColumnCount + c (kRowCount + c).
 constexpr int kRowBits = 15;
 static_assert(2 * kRowCount == 1 << kRowBits);
 
@@ -71,8 +71,10 @@ void DependencyIndex::tie(FormulaCell& formula) noexcept {
 
 void DependencyIndex::untie(FormulaCell& formula) noexcept {
     for (DependencyLink& link : formula.links) {
-        if (link.previous) link.previous->next = link.next;
-        else link.node->first = link.next;
+        if (link.previous)
+            link.previous->next = link.next;
+        else
+            link.node->first = link.next;
         if (link.next) link.next->previous = link.previous;
         const std::uint32_t key = link.node->key;
         --tiesAt(key);

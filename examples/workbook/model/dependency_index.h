@@ -1,9 +1,9 @@
 // Answers which formulas read a given cell.
 //
 // Columns and rows are each halved again and again, as in a segment tree; a block that a formula
-// reads is cut into the fewest such pieces, and each piece lists its readers. A cell lies in at most
-// 9 * 15 pieces, so finding its readers takes that many look-ups, mostly far fewer, however large
-// the blocks are.
+// reads is cut into the fewest such pieces, and each piece lists its readers. A cell lies in at
+// most 9 * 15 pieces, so finding its readers takes that many look-ups, mostly far fewer, however
+// large the blocks are.
 #ifndef WORKBOOK_MODEL_DEPENDENCY_INDEX_H
 #define WORKBOOK_MODEL_DEPENDENCY_INDEX_H
 

@@ -1,5 +1,7 @@
 #include "document.h"
 
+#include "last_words.h"
+
 #include <algorithm>
 #include <new>
 #include <utility>
@@ -40,7 +42,7 @@ std::wstring FileNameOf(const std::wstring& path) {
     return slash == std::wstring::npos ? path : path.substr(slash + 1);
 }
 
-FileProblem OutOfMemory() { return {L"There is not enough memory."}; }
+FileProblem OutOfMemory() noexcept { return {TextOrNothing(L"There is not enough memory.")}; }
 
 }  // namespace
 
@@ -120,9 +122,8 @@ EditResult Document::setCells(std::vector<CellText> cells, std::wstring what) no
     if (std::ranges::any_of(cells, isTooLong)) return EditResult::TooLong;
     try {
         KeepLastOfEach(cells);
-        std::erase_if(cells, [this](const CellText& each) {
-            return sheet_.text(each.cell) == each.text;
-        });
+        std::erase_if(cells,
+                      [this](const CellText& each) { return sheet_.text(each.cell) == each.text; });
         return apply({std::move(what), std::move(cells)});
     } catch (const std::bad_alloc&) {
         return EditResult::NoMemory;
@@ -147,26 +148,14 @@ EditResult Document::apply(EditStep step) {
     return EditResult::Done;
 }
 
-// Exchanges the step's texts with those of the sheet. False when memory ran out; what had been
-// exchanged by then is put back.
+// Exchanges the step's texts with those of the sheet, or does nothing when memory runs out.
 bool Document::exchange(EditStep& step) noexcept {
-    size_t done = 0;
-    const auto exchangeOne = [this](CellText& each) {
-        std::wstring former = sheet_.text(each.cell);
-        sheet_.setText(each.cell, each.text);
-        each.text = std::move(former);
-    };
     try {
-        for (; done < step.cells.size(); ++done) exchangeOne(step.cells[done]);
+        sheet_.exchangeTexts(step.cells);
         return true;
     } catch (const std::bad_alloc&) {
+        return false;
     }
-    try {
-        while (done > 0) exchangeOne(step.cells[--done]);
-    } catch (const std::bad_alloc&) {
-        // The memory that the first half has taken was given back; this does not happen in practice.
-    }
-    return false;
 }
 
 std::wstring Document::undoText() const {

@@ -15,10 +15,10 @@ namespace workbook {
 
 enum class EditResult {
     Done,
-    Unchanged,    // the cells hold that already: no step was made
-    OutsideSheet, // some cell lies outside the sheet: nothing was changed
-    TooLong,      // some text is longer than kLongestCellText: nothing was changed
-    NoMemory      // nothing was changed
+    Unchanged,     // the cells hold that already: no step was made
+    OutsideSheet,  // some cell lies outside the sheet: nothing was changed
+    TooLong,       // some text is longer than kLongestCellText: nothing was changed
+    NoMemory       // nothing was changed
 };
 
 // A sentence for the user; empty for Done and Unchanged.
@@ -38,8 +38,8 @@ public:
     // Writes the file and makes `path` the document's own.
     std::optional<FileProblem> save(const std::wstring& path) noexcept;
 
-    const std::wstring& path() const { return path_; } // empty while unnamed
-    std::wstring name() const;                         // without folders; "Untitled" while unnamed
+    const std::wstring& path() const { return path_; }  // empty while unnamed
+    std::wstring name() const;                          // without folders; "Untitled" while unnamed
     const CsvFormat& format() const { return format_; }
 
     // Whether the sheet differs from the file. Undoing (or redoing) to the state that was saved
@@ -62,8 +62,8 @@ public:
 
     bool canUndo() const { return history_.stepToUndo() != nullptr; }
     bool canRedo() const { return history_.stepToRedo() != nullptr; }
-    std::wstring undoText() const; // "Undo typing in B4"; "Undo" when there is nothing to undo
-    std::wstring redoText() const; // "Redo typing in B4"; "Redo" likewise
+    std::wstring undoText() const;  // "Undo typing in B4"; "Undo" when there is nothing to undo
+    std::wstring redoText() const;  // "Redo typing in B4"; "Redo" likewise
 
     // The block that was changed, to be selected and shown; nothing when there was no step to take
     // (or no memory to take it, in which case the sheet is as before).
@@ -80,6 +80,6 @@ private:
     EditHistory history_;
 };
 
-} // namespace workbook
+}  // namespace workbook
 
 #endif

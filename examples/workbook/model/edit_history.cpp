@@ -20,9 +20,7 @@ void EditHistory::add(EditStep step) noexcept {
     if (saved_) --*saved_;
 }
 
-EditStep* EditHistory::stepToUndo() noexcept {
-    return done_ == 0 ? nullptr : &steps_[done_ - 1];
-}
+EditStep* EditHistory::stepToUndo() noexcept { return done_ == 0 ? nullptr : &steps_[done_ - 1]; }
 
 EditStep* EditHistory::stepToRedo() noexcept {
     return done_ == steps_.size() ? nullptr : &steps_[done_];

@@ -2,7 +2,7 @@
 #ifndef WORKBOOK_MODEL_EDIT_HISTORY_H
 #define WORKBOOK_MODEL_EDIT_HISTORY_H
 
-#include "address.h"
+#include "sheet.h"
 
 #include <cstddef>
 #include <optional>
@@ -11,15 +11,10 @@
 
 namespace workbook {
 
-struct CellText {
-    CellAddress cell;
-    std::wstring text;
-};
-
 // One edit. Each cell keeps the text that the sheet does not have at the moment: the former one
 // while the step is done, the later one while it is undone.
 struct EditStep {
-    std::wstring what; // "typing in B4"
+    std::wstring what;  // "typing in B4"
     std::vector<CellText> cells;
 };
 
@@ -50,10 +45,10 @@ public:
 
 private:
     std::vector<EditStep> steps_;
-    size_t done_ = 0;                  // steps_[0 .. done_) are done, the rest undone
-    std::optional<size_t> saved_ = 0u; // like done_; nothing when that state cannot be reached
+    size_t done_ = 0;                   // steps_[0 .. done_) are done, the rest undone
+    std::optional<size_t> saved_ = 0u;  // like done_; nothing when that state cannot be reached
 };
 
-} // namespace workbook
+}  // namespace workbook
 
 #endif

@@ -58,8 +58,10 @@ Value Evaluator::single(const Operand& operand) const {
 void Evaluator::call(FunctionId function, size_t count) {
     const Operand* arguments = stack_.data() + (stack_.size() - count);
     Operand result;
-    if (function == FunctionId::If) result = choose(arguments, count);
-    else result.value = aggregate(function, arguments, count);
+    if (function == FunctionId::If)
+        result = choose(arguments, count);
+    else
+        result.value = aggregate(function, arguments, count);
     stack_.resize(stack_.size() - count);
     stack_.push_back(std::move(result));
 }
@@ -83,14 +85,18 @@ Value Evaluator::aggregate(FunctionId function, const Operand* arguments, size_t
     for (size_t i = 0; i < count && !error; ++i) {
         if (!arguments[i].isBlock) {
             const Value number = AsNumber(arguments[i].value);
-            if (number.isNumber()) numbers.add(number.number);
-            else if (!isCount) error = number.error;
+            if (number.isNumber())
+                numbers.add(number.number);
+            else if (!isCount)
+                error = number.error;
             continue;
         }
         store_.walk(arguments[i].block, [&](CellAddress, const Cell& cell) {
             const ValueView value = ViewOf(cell);
-            if (value.kind == ValueKind::Number) numbers.add(value.number);
-            else if (value.kind == ValueKind::Error && !isCount) error = value.error;
+            if (value.kind == ValueKind::Number)
+                numbers.add(value.number);
+            else if (value.kind == ValueKind::Error && !isCount)
+                error = value.error;
             return !error;
         });
     }

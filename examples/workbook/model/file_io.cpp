@@ -1,6 +1,8 @@
 // The only file of the model that knows the operating system.
 #include "file_io.h"
 
+#include "last_words.h"
+
 #ifndef WIN32_LEAN_AND_MEAN
 #define WIN32_LEAN_AND_MEAN
 #endif
@@ -115,6 +117,11 @@ bool WriteAll(HANDLE file, std::string_view bytes) {
 }
 
 std::optional<FileProblem> ReplaceUnguarded(const std::wstring& path, std::string_view bytes) {
+    // Renaming over a write-protected file fails on some systems only.
+    const DWORD attributes = GetFileAttributesW(path.c_str());
+    if (attributes != INVALID_FILE_ATTRIBUTES && (attributes & FILE_ATTRIBUTE_READONLY) != 0)
+        return CannotWrite(path, ERROR_ACCESS_DENIED);
+
     std::wstring temporaryPath;
     FileHandle file(CreateTemporary(path, temporaryPath));
     if (!file.isOpen()) return CannotWrite(path, GetLastError());
@@ -122,9 +129,8 @@ std::optional<FileProblem> ReplaceUnguarded(const std::wstring& path, std::strin
     // Not short-circuited into one condition: the error number belongs to the step that failed.
     DWORD error = WriteAll(file.get(), bytes) ? ERROR_SUCCESS : GetLastError();
     if (!file.close() && error == ERROR_SUCCESS) error = GetLastError();
-    if (error == ERROR_SUCCESS &&
-        !MoveFileExW(temporaryPath.c_str(), path.c_str(),
-                     MOVEFILE_REPLACE_EXISTING | MOVEFILE_WRITE_THROUGH))
+    if (error == ERROR_SUCCESS && !MoveFileExW(temporaryPath.c_str(), path.c_str(),
+                                               MOVEFILE_REPLACE_EXISTING | MOVEFILE_WRITE_THROUGH))
         error = GetLastError();
     if (error == ERROR_SUCCESS) return std::nullopt;
     DeleteFileW(temporaryPath.c_str());
@@ -137,7 +143,7 @@ FileContents ReadWholeFile(const std::wstring& path, size_t largest) noexcept {
     try {
         return ReadUnguarded(path, largest);
     } catch (const std::bad_alloc&) {
-        return {{}, FileProblem{L"There is not enough memory to read the file."}};
+        return {{}, FileProblem{TextOrNothing(L"There is not enough memory to read the file.")}};
     }
 }
 
@@ -146,7 +152,7 @@ std::optional<FileProblem> ReplaceFileBytes(const std::wstring& path,
     try {
         return ReplaceUnguarded(path, bytes);
     } catch (const std::bad_alloc&) {
-        return FileProblem{L"There is not enough memory to write the file."};
+        return FileProblem{TextOrNothing(L"There is not enough memory to write the file.")};
     }
 }
 

@@ -9,12 +9,12 @@
 namespace workbook {
 
 struct FileProblem {
-    std::wstring message; // a sentence for the user: which file, and why
+    std::wstring message;  // a sentence for the user: which file, and why
 };
 
 struct FileContents {
     std::string bytes;
-    std::optional<FileProblem> problem; // when set, bytes is empty
+    std::optional<FileProblem> problem;  // when set, bytes is empty
 };
 
 // Reads a file of at most `largest` bytes.
@@ -25,6 +25,6 @@ FileContents ReadWholeFile(const std::wstring& path, size_t largest) noexcept;
 std::optional<FileProblem> ReplaceFileBytes(const std::wstring& path,
                                             std::string_view bytes) noexcept;
 
-} // namespace workbook
+}  // namespace workbook
 
 #endif

@@ -56,8 +56,8 @@ public:
 
         Program refused;
         refused.problem = program_.problem;
-        refused.instructions.push_back({Operation::PushError, FunctionId::Sum,
-                                        static_cast<std::uint32_t>(ErrorCode::Value)});
+        refused.instructions.push_back(
+            {Operation::PushError, FunctionId::Sum, static_cast<std::uint32_t>(ErrorCode::Value)});
         return refused;
     }
 
@@ -70,13 +70,10 @@ private:
     }
 
     void emit(Operation operation, size_t operand = 0, FunctionId function = FunctionId::Sum) {
-        program_.instructions.push_back(
-            {operation, function, static_cast<std::uint32_t>(operand)});
+        program_.instructions.push_back({operation, function, static_cast<std::uint32_t>(operand)});
     }
 
-    void emitError(ErrorCode error) {
-        emit(Operation::PushError, static_cast<size_t>(error));
-    }
+    void emitError(ErrorCode error) { emit(Operation::PushError, static_cast<size_t>(error)); }
 
     // Operands joined by operators of at least this strength. Recursion is bounded by the number of
     // strengths; parentheses are counted by parseNested.
@@ -203,7 +200,8 @@ private:
             ++count;
             if (token_.kind == TokenKind::Separator || token_.kind == TokenKind::Close)
                 emit(Operation::PushEmpty);
-            else if (!parseExpression(kWeakest)) return false;
+            else if (!parseExpression(kWeakest))
+                return false;
             if (token_.kind != TokenKind::Separator) return true;
         }
     }

@@ -52,9 +52,9 @@ struct Instruction {
 // Why a formula cannot be read.
 enum class FormulaProblem : unsigned char {
     None,
-    Incomplete,           // an operand is missing
-    UnexpectedSymbol,     // something stands where nothing like it can
-    MissingParenthesis,   // a closing one
+    Incomplete,          // an operand is missing
+    UnexpectedSymbol,    // something stands where nothing like it can
+    MissingParenthesis,  // a closing one
     MissingQuote,
     NumberTooLarge,
     WrongArgumentCount,

@@ -29,8 +29,8 @@ struct ReadingPosition {
     bool isInside = false;  // cell lies in the reference and is the next one to look at
 };
 
-// Lists that the calculation and the invalidation need are threaded through the formulas themselves:
-// neither needs memory, and neither uses the machine's stack.
+// Lists that the calculation and the invalidation need are threaded through the formulas
+// themselves: neither needs memory, and neither uses the machine's stack.
 struct FormulaCell {
     CellAddress cell;
     Program program;
@@ -44,7 +44,7 @@ struct FormulaCell {
     std::uint32_t order = 0;   // when the search came here, from 1; 0: it has not
     std::uint32_t lowest = 0;  // lowest order that can be reached from here
     bool readsItself = false;
-    FormulaCell* caller = nullptr;      // the formula that the search came from
+    FormulaCell* caller = nullptr;        // the formula that the search came from
     FormulaCell* belowOnStack = nullptr;  // stack of formulas not yet assigned to a ring
     ReadingPosition position;
 };

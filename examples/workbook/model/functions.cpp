@@ -33,9 +33,10 @@ constexpr wchar_t Capital(wchar_t c) {
 std::span<const FunctionDescription> Functions() { return kFunctions; }
 
 const FunctionDescription* FindFunction(std::wstring_view name) {
-    const auto found = std::ranges::find_if(kFunctions, [name](const FunctionDescription& function) {
-        return std::ranges::equal(function.name, name, {}, {}, Capital);
-    });
+    const auto found =
+        std::ranges::find_if(kFunctions, [name](const FunctionDescription& function) {
+            return std::ranges::equal(function.name, name, {}, {}, Capital);
+        });
     return found == kFunctions.end() ? nullptr : &*found;
 }
 

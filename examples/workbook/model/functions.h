@@ -12,9 +12,9 @@ enum class FunctionId : unsigned char { Sum, Average, Lowest, Highest, Count, If
 
 struct FunctionDescription {
     FunctionId id;
-    std::wstring_view name;      // "SUM"
-    std::wstring_view arguments; // "SUM(value, ...)"
-    std::wstring_view help;      // one sentence
+    std::wstring_view name;       // "SUM"
+    std::wstring_view arguments;  // "SUM(value, ...)"
+    std::wstring_view help;       // one sentence
     int fewestArguments;
     int mostArguments;
 };
@@ -27,6 +27,6 @@ const FunctionDescription* FindFunction(std::wstring_view name);
 
 const FunctionDescription& DescribeFunction(FunctionId id);
 
-} // namespace workbook
+}  // namespace workbook
 
 #endif

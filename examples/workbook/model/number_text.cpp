@@ -1,7 +1,9 @@
 #include "number_text.h"
 
+#include <algorithm>
 #include <charconv>
 #include <cmath>
+#include <cstdlib>
 #include <string>
 
 namespace workbook {
@@ -53,50 +55,86 @@ std::optional<double> ConvertUnsigned(std::wstring_view text) {
     return number;
 }
 
+// A positive number as digits: the first one stands before the point, times ten to the power.
+struct Decimal {
+    std::string digits;
+    int power = 0;
+};
+
+// The 15 digits that a double is good for.
+Decimal ToDecimal(double positive) {
+    char buffer[64];
+    const auto end =
+        std::to_chars(buffer, buffer + sizeof buffer, positive, std::chars_format::scientific, 14);
+    const std::string_view text(buffer, static_cast<size_t>(end.ptr - buffer));
+    const size_t letter = text.find('e');
+    Decimal decimal;
+    decimal.digits = text[0];
+    decimal.digits += text.substr(2, letter - 2);
+    const size_t sign = letter + 1;
+    std::from_chars(text.data() + sign + 1, text.data() + text.size(), decimal.power);
+    if (text[sign] == '-') decimal.power = -decimal.power;
+    return decimal;
+}
+
+// Keeps `count` digits (1 or more). A half goes up, as people expect, and not to the even digit.
+Decimal Round(Decimal decimal, size_t count) {
+    if (count >= decimal.digits.size()) return decimal;
+    const bool goesUp = decimal.digits[count] >= '5';
+    decimal.digits.resize(count);
+    if (!goesUp) return decimal;
+    size_t at = count;
+    while (at > 0 && decimal.digits[at - 1] == '9') decimal.digits[--at] = '0';
+    if (at > 0) {
+        ++decimal.digits[at - 1];
+    } else {
+        decimal.digits.insert(0, 1, '1');
+        decimal.digits.pop_back();
+        ++decimal.power;
+    }
+    return decimal;
+}
+
 std::string WithoutTrailingZeros(std::string digits) {
-    if (digits.find('.') == std::string::npos) return digits;
     digits.erase(digits.find_last_not_of('0') + 1);
-    if (digits.back() == '.') digits.pop_back();
     return digits;
 }
 
-std::string Fixed(double number, int decimals) {
-    char buffer[64];  // callers stay below 1E+12
-    const auto end = std::to_chars(buffer, buffer + sizeof buffer, number, std::chars_format::fixed,
-                                   decimals);
-    return {buffer, end.ptr};
+std::string WriteFixed(const Decimal& decimal) {
+    std::string digits = WithoutTrailingZeros(decimal.digits);
+    if (decimal.power < 0)
+        return "0." + std::string(static_cast<size_t>(-decimal.power - 1), '0') + digits;
+    const size_t beforePoint = static_cast<size_t>(decimal.power) + 1;
+    if (digits.size() <= beforePoint) return digits + std::string(beforePoint - digits.size(), '0');
+    return digits.insert(beforePoint, 1, '.');
 }
 
-struct Scientific {
-    std::string mantissa;
-    std::string exponent;  // "+11", "-05"
-
-    int power() const { return std::stoi(exponent); }
-};
-
-Scientific ToScientific(double number, int decimals) {
-    char buffer[64];
-    const auto end = std::to_chars(buffer, buffer + sizeof buffer, number,
-                                   std::chars_format::scientific, decimals);
-    const std::string text(buffer, end.ptr);
-    const size_t letter = text.find('e');
-    return {text.substr(0, letter), text.substr(letter + 1)};
+std::string WriteScientific(const Decimal& decimal) {
+    std::string text = WithoutTrailingZeros(decimal.digits);
+    if (text.size() > 1) text.insert(1, 1, '.');
+    const std::string exponent = std::to_string(std::abs(decimal.power));
+    text += decimal.power < 0 ? "E-" : "E+";
+    if (exponent.size() < 2) text += '0';
+    return text + exponent;
 }
 
-// `positive` > 0, in at most 11 characters.
+constexpr int kLowestPower = -4;   // smaller numbers have an exponent
+constexpr int kHighestPower = 10;  // so do larger ones
+
+bool IsForFixed(const Decimal& decimal) {
+    return decimal.power >= kLowestPower && decimal.power <= kHighestPower;
+}
+
+// In at most 11 characters.
 std::string DisplayPositive(double positive) {
-    constexpr int kLongestInteger = 11;
-    constexpr int kLowestPower = -4;
-
-    const Scientific rounded = ToScientific(positive, 5);
-    const int power = ToScientific(positive, 16).power();
-    if (power < kLongestInteger && (power >= kLowestPower || rounded.power() >= kLowestPower)) {
-        const int decimals = power < 0 ? 9 : power < 9 ? 9 - power : 0;
-        const std::string fixed = WithoutTrailingZeros(Fixed(positive, decimals));
-        // Rounding may have carried into a twelfth digit.
-        if (fixed.find('.') != std::string::npos || fixed.size() <= kLongestInteger) return fixed;
-    }
-    return WithoutTrailingZeros(rounded.mantissa) + "E" + rounded.exponent;
+    const Decimal exact = ToDecimal(positive);
+    const Decimal shortened = Round(exact, 6);
+    if (!IsForFixed(exact))
+        return IsForFixed(shortened) ? WriteFixed(shortened) : WriteScientific(shortened);
+    // 11 digits without a point, 10 with one, 9 behind "0.".
+    const int digits = exact.power < 0 ? 10 + exact.power : exact.power == 10 ? 11 : 10;
+    const Decimal rounded = Round(exact, static_cast<size_t>(digits));
+    return IsForFixed(rounded) ? WriteFixed(rounded) : WriteScientific(shortened);
 }
 
 // Never in a cell, but the sum of a selection may be too large.
@@ -132,11 +170,10 @@ std::wstring JoinNumber(double number) {
     if (!std::isfinite(number)) return std::wstring(kNoNumber);
     if (number == 0) return L"0";
     char buffer[64];
-    const auto end = std::to_chars(buffer, buffer + sizeof buffer, number,
-                                   std::chars_format::general, 15);
+    const auto end =
+        std::to_chars(buffer, buffer + sizeof buffer, number, std::chars_format::general, 15);
     std::wstring text = Widen({buffer, end.ptr});
-    const size_t letter = text.find(L'e');
-    if (letter != std::wstring::npos) text[letter] = L'E';
+    std::ranges::replace(text, L'e', L'E');
     return text;
 }
 

@@ -20,6 +20,6 @@ std::wstring DisplayNumber(double number);
 // As the joining operator writes it: up to 15 significant digits ("0.333333333333333").
 std::wstring JoinNumber(double number);
 
-} // namespace workbook
+}  // namespace workbook
 
 #endif

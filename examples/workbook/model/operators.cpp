@@ -85,9 +85,7 @@ Value FilledIn(const Value& value, ValueKind otherKind) {
 }
 
 // Numbers come before texts, texts before truth values.
-int Rank(ValueKind kind) {
-    return kind == ValueKind::Number ? 0 : kind == ValueKind::Text ? 1 : 2;
-}
+int Rank(ValueKind kind) { return kind == ValueKind::Number ? 0 : kind == ValueKind::Text ? 1 : 2; }
 
 int Compare(const Value& givenLeft, const Value& givenRight) {
     const Value left = FilledIn(givenLeft, givenRight.kind);

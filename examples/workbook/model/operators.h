@@ -1,5 +1,5 @@
-// What the operators of formulas do with two values. Operands are values, never references; an error
-// among them is the result (the left one's first).
+// What the operators of formulas do with two values. Operands are values, never references; an
+// error among them is the result (the left one's first).
 #ifndef WORKBOOK_MODEL_OPERATORS_H
 #define WORKBOOK_MODEL_OPERATORS_H
 

@@ -20,16 +20,16 @@ bool EqualsIgnoringCase(std::wstring_view text, std::wstring_view capitals) {
 
 bool IsFormulaText(std::wstring_view typed) { return typed.size() > 1 && typed.front() == L'='; }
 
-// Numbers, truth values and texts; formulas are made by the caller.
-void Classify(Cell& cell) {
+// For numbers, truth values and texts.
+void Classify(Cell& cell, std::wstring_view typed) {
     cell.kind = ValueKind::Text;
-    if (cell.typed.front() == L'\'') return;
-    if (const auto number = ReadNumber(cell.typed)) {
+    if (typed.front() == L'\'') return;
+    if (const auto number = ReadNumber(typed)) {
         cell.kind = ValueKind::Number;
         cell.number = *number;
-    } else if (EqualsIgnoringCase(cell.typed, L"TRUE") || EqualsIgnoringCase(cell.typed, L"FALSE")) {
+    } else if (EqualsIgnoringCase(typed, L"TRUE") || EqualsIgnoringCase(typed, L"FALSE")) {
         cell.kind = ValueKind::Boolean;
-        cell.number = cell.typed.size() == 4 ? 1 : 0;
+        cell.number = typed.size() == 4 ? 1 : 0;
     }
 }
 
@@ -43,27 +43,55 @@ Sheet& Sheet::operator=(Sheet&& other) noexcept = default;
 
 void Sheet::setText(CellAddress cell, std::wstring text) {
     if (!IsInSheet(cell) || text.size() > kLongestCellText) return;
+    Cell content = prepare(cell, text);
+    if (content.formula) dependents_->tie(*content.formula);
+    commit(cell, std::move(content), text);
+}
 
-    // All that needs memory comes first.
+void Sheet::exchangeTexts(std::vector<CellText>& cells) {
+    // Emptied cells go last: taking a page's last cell throws the page away, and another cell of
+    // this exchange may count on its room.
+    std::ranges::partition(cells, [](const CellText& each) { return !each.text.empty(); });
+
+    std::vector<Cell> contents;
+    contents.reserve(cells.size());
+    try {
+        for (CellText& each : cells) contents.push_back(prepare(each.cell, each.text));
+    } catch (...) {
+        for (size_t i = 0; i < contents.size(); ++i) cells[i].text = std::move(contents[i].typed);
+        throw;
+    }
+    // All new formulas are tied before the first old one is untied.
+    for (Cell& content : contents)
+        if (content.formula) dependents_->tie(*content.formula);
+    for (size_t i = 0; i < cells.size(); ++i)
+        commit(cells[i].cell, std::move(contents[i]), cells[i].text);
+}
+
+// All that needs memory. The text is taken only when nothing can fail any more.
+Cell Sheet::prepare(CellAddress cell, std::wstring& text) {
     Cell content;
-    content.typed = std::move(text);
-    if (IsFormulaText(content.typed)) {
+    if (IsFormulaText(text)) {
         content.formula = std::make_unique<FormulaCell>();
         content.formula->cell = cell;
-        content.formula->program = CompileFormula(std::wstring_view(content.typed).substr(1));
+        content.formula->program = CompileFormula(std::wstring_view(text).substr(1));
         dependents_->prepare(*content.formula);
-    } else if (!content.typed.empty()) {
-        Classify(content);
+    } else if (!text.empty()) {
+        Classify(content, text);
     }
-    if (!content.typed.empty()) store_->makeRoom(cell);
+    if (!text.empty()) store_->makeRoom(cell);
+    content.typed = std::move(text);
+    return content;
+}
 
+// For prepared content whose formula is tied.
+void Sheet::commit(CellAddress cell, Cell content, std::wstring& formerText) noexcept {
     dependents_->invalidateReadersOf(cell, *store_);
-    FormulaCell* formula = content.formula.get();
-    if (formula) dependents_->tie(*formula);
-    const Cell old = content.typed.empty() ? store_->take(cell)
-                                           : store_->put(cell, std::move(content));
+    const bool isFormula = content.formula != nullptr;
+    Cell old = content.typed.empty() ? store_->take(cell) : store_->put(cell, std::move(content));
     if (old.formula) dependents_->untie(*old.formula);
-    if (formula) store_->setPending(cell, true);
+    if (isFormula) store_->setPending(cell, true);
+    formerText = std::move(old.typed);
 }
 
 const std::wstring& Sheet::text(CellAddress cell) const {

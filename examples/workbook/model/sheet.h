@@ -24,11 +24,17 @@
 
 namespace workbook {
 
+struct Cell;
 class CellStore;
 class DependencyIndex;
 
 // The longest text a cell takes, in UTF-16 units.
 constexpr size_t kLongestCellText = 32767;
+
+struct CellText {
+    CellAddress cell;
+    std::wstring text;
+};
 
 // How many columns and rows, counted from A1, the occupied cells reach over.
 struct SheetExtent {
@@ -49,6 +55,11 @@ public:
     // the text not longer than kLongestCellText, or nothing happens. Throws std::bad_alloc without
     // having changed anything. (Edits with undo go through Document.)
     void setText(CellAddress cell, std::wstring text);
+
+    // Gives each cell its text, and each text becomes the one that the cell had before. All cells
+    // must be different ones in the sheet, and no text too long; their order may change. Throws
+    // std::bad_alloc without having changed anything.
+    void exchangeTexts(std::vector<CellText>& cells);
 
     // What was typed, as the equation bar shows it; empty for an empty cell.
     const std::wstring& text(CellAddress cell) const;
@@ -76,17 +87,20 @@ public:
     // The occupied cells of a block, column by column from the left, each from top to bottom.
     std::vector<CellAddress> occupiedIn(const Block& block) const;
 
-    // Calls visit(cell, value) for them in that order until it returns false. It must not change the
-    // sheet; it may read other cells.
+    // Calls visit(cell, value) for them in that order until it returns false. It must not change
+    // the sheet; it may read other cells.
     void visit(const Block& block,
                const std::function<bool(CellAddress, const ValueView&)>& visit) const;
 
 private:
+    Cell prepare(CellAddress cell, std::wstring& text);
+    void commit(CellAddress cell, Cell content, std::wstring& formerText) noexcept;
+
     // Cells with formulas keep their results here, so reading changes it.
     std::unique_ptr<CellStore> store_;
     std::unique_ptr<DependencyIndex> dependents_;
 };
 
-} // namespace workbook
+}  // namespace workbook
 
 #endif

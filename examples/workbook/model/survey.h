@@ -8,10 +8,10 @@
 namespace workbook {
 
 struct BlockStatistics {
-    size_t occupied = 0; // cells with anything in them
-    size_t numbers = 0;  // cells with a number; the figures below are about these
+    size_t occupied = 0;  // cells with anything in them
+    size_t numbers = 0;   // cells with a number; the figures below are about these
     double sum = 0;
-    double average = 0; // 0 without numbers
+    double average = 0;  // 0 without numbers
     double lowest = 0;
     double highest = 0;
 };
@@ -23,6 +23,6 @@ BlockStatistics SurveyBlock(const Sheet& sheet, const Block& block);
 // least one, and row 2 has a number.
 bool FirstRowIsHeader(const Sheet& sheet);
 
-} // namespace workbook
+}  // namespace workbook
 
 #endif

@@ -39,7 +39,8 @@ bool StartsWithSequence(std::string_view bytes, const Lead& lead) {
 std::uint32_t Decode(std::string_view sequence) {
     constexpr unsigned char kLeadBits[] = {0, 0x7F, 0x1F, 0x0F, 0x07};
     std::uint32_t code = static_cast<unsigned char>(sequence[0]) & kLeadBits[sequence.size()];
-    for (const char byte : sequence.substr(1)) code = code << 6 | (static_cast<unsigned char>(byte) & 0x3Fu);
+    for (const char byte : sequence.substr(1))
+        code = code << 6 | (static_cast<unsigned char>(byte) & 0x3Fu);
     return code;
 }
 

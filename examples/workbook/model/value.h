@@ -10,20 +10,20 @@ namespace workbook {
 enum class ValueKind : unsigned char { Empty, Number, Text, Boolean, Error };
 
 enum class ErrorCode : unsigned char {
-    Circular,       // #CIRC!   the cell depends on itself
-    DivisionByZero, // #DIV/0!
-    Reference,      // #REF!    a reference outside the sheet
-    Name,           // #NAME?   an unknown function or name
-    Value,          // #VALUE!  an operand of the wrong kind, or a formula that cannot be read
-    Number          // #NUM!    a result that is no number: too large, or a root of a negative one
+    Circular,        // #CIRC!   the cell depends on itself
+    DivisionByZero,  // #DIV/0!
+    Reference,       // #REF!    a reference outside the sheet
+    Name,            // #NAME?   an unknown function or name
+    Value,           // #VALUE!  an operand of the wrong kind, or a formula that cannot be read
+    Number           // #NUM!    a result that is no number: too large, or a root of a negative one
 };
 
 // A value without owning its text: `text` lives as long as the cell it came from is not changed.
 struct ValueView {
     ValueKind kind = ValueKind::Empty;
-    ErrorCode error = ErrorCode::Value; // for ValueKind::Error
-    double number = 0;                  // for Number; 1 or 0 for Boolean
-    std::wstring_view text;             // for Text
+    ErrorCode error = ErrorCode::Value;  // for ValueKind::Error
+    double number = 0;                   // for Number; 1 or 0 for Boolean
+    std::wstring_view text;              // for Text
 };
 
 struct Value {
@@ -53,6 +53,6 @@ std::wstring_view ErrorName(ErrorCode error);
 // FALSE, the error's name, a text as it is, and nothing for an empty one.
 std::wstring DisplayText(const ValueView& value);
 
-} // namespace workbook
+}  // namespace workbook
 
 #endif

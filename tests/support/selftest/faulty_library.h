@@ -8,7 +8,7 @@
 extern "C" {
 #endif
 
-/* Writes, or reads, `offset` bytes from the begin of a LocalAlloc block of `size`, then frees it. */
+/* Writes, or reads, `offset` bytes from the begin of a LocalAlloc block, then frees it. */
 void FaultyWrite(size_t size, ptrdiff_t offset);
 int FaultyRead(size_t size, ptrdiff_t offset);
 
@@ -19,7 +19,7 @@ void FaultyWrongFamily(void);
 /* Never freed. */
 void *FaultyLeak(size_t size);
 
-/* Resizes a block of 10 bytes, counting from 1, to `size`; the result is its sum, -1 without memory. */
+/* Resizes a block of 10 bytes, which count from 1; the result is their sum, -1 without memory. */
 int FaultyGrow(size_t size, UINT flags);
 
 int FaultyMalloc(void); /* malloc, realloc, calloc and free as they should be used */

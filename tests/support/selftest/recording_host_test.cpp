@@ -117,6 +117,22 @@ TEST_F(RecordingHostTest, LetsTimersRunWhilePumpingForATime) {
     EXPECT_GE(timerTicks, 3);
 }
 
+TEST_F(RecordingHostTest, ThrowsAwayMovesThatNoTestMade) {
+    HWND edit = CreateWindowExW(0, L"EDIT", L"select", WS_CHILD | WS_VISIBLE, 0, 0, 90, 20,
+                                host.window(), nullptr, nullptr, nullptr);
+    SendMessageW(edit, WM_LBUTTONDOWN, MK_LBUTTON, MAKELPARAM(2, 5));
+    PostMessageW(edit, WM_MOUSEMOVE, 0, MAKELPARAM(60, 5));
+    host.pump();
+    DWORD end = 0;
+    SendMessageW(edit, EM_GETSEL, 0, reinterpret_cast<LPARAM>(&end));
+    EXPECT_EQ(end, 0u);
+    PostMessageW(edit, WM_MOUSEMOVE, MK_LBUTTON, MAKELPARAM(60, 5));
+    host.pump();
+    SendMessageW(edit, EM_GETSEL, 0, reinterpret_cast<LPARAM>(&end));
+    EXPECT_EQ(end, 6u);
+    SendMessageW(edit, WM_LBUTTONUP, 0, MAKELPARAM(60, 5));
+}
+
 TEST_F(RecordingHostTest, GivesUpOnAWindowThatStaysInvalid) {
     HWND stubborn = CreateWindowExW(0, L"STATIC", L"", WS_CHILD | WS_VISIBLE, 0, 0, 50, 20,
                                     host.window(), nullptr, nullptr, nullptr);
