@@ -69,6 +69,7 @@ def open_workbook(desktop, probe, programs, machine, request):
     if getattr(request.node, "has_failed", False):
         FAILURES.mkdir(parents=True, exist_ok=True)
         desktop.picture().write_png(FAILURES / f"{request.node.originalname}-{machine}.png")
+    desktop.release_button()  # a test that fails in the middle of a drag leaves it pressed
     for workbook in started:
         workbook.kill()
 

@@ -147,14 +147,18 @@ INSTANTIATE_TEST_SUITE_P(Seeds, GridSenselessMessages, ::testing::Range(1u, 17u)
 
 using GridUnknownHeader = GuardedGridTest;
 
-TEST_F(GridUnknownHeader, NotificationsInAnotherNameAreHarmless) {
+TEST_F(GridUnknownHeader, NotificationsInAnotherNameDoNothing) {
     create(200, 120);
+    const Picture before = ReadWindow(grid);
     for (const WPARAM sender :
          {WPARAM{0}, reinterpret_cast<WPARAM>(grid), reinterpret_cast<WPARAM>(edit), WPARAM{1}})
         for (const UINT message :
-             {UINT{HCN_ITEMCLICK}, UINT{HCN_ITEMRESIZING}, UINT{HCN_ITEMRESIZED}})
-            SendMessageW(grid, message, sender, MAKELPARAM(1, 1));
-    EXPECT_TRUE(IsWindow(grid));
+             {UINT{HCN_ITEMRESIZING}, UINT{HCN_ITEMRESIZED}, UINT{HCN_ITEMCLICK}})
+            SendMessageW(grid, message, sender, MAKELPARAM(1, 40));
+    EXPECT_TRUE(SamePicture(before, ReadWindow(grid)));
+    SetFirstVisibleCell(0);
+    for (const int size : HeaderSizes(columnHeader)) EXPECT_EQ(size, 60);
+    for (const int size : HeaderSizes(rowHeader)) EXPECT_EQ(size, 16);
 }
 
 using GridAlone = GuardedGridTest;
