@@ -53,6 +53,17 @@ TEST_F(OtherKeys, TabAndEnterSendAnArrowKey) {
     EXPECT_EQ(Selection(), Block(2, 2, 4, 4));
 }
 
+// The anchor is gone before the arrow key comes, so Shift does not extend.
+TEST_F(OtherKeys, TabAndEnterWithShiftMoveAlsoWithAnAnchor) {
+    anchorAt(2, 3);
+    KeyHeld shift(VK_SHIFT);
+    PressKey(grid, VK_TAB);
+    EXPECT_EQ(Selection(), Block(1, 1, 3, 3));
+    anchorAt(2, 3);
+    PressKey(grid, VK_RETURN);
+    EXPECT_EQ(Selection(), Block(2, 2, 4, 4));
+}
+
 TEST_F(OtherKeys, TabAndEnterTakeTheFocus) {
     SetFocus(edit);
     told();

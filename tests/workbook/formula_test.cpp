@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include <cmath>
 #include <string>
 
 namespace workbook {
@@ -63,7 +64,10 @@ TEST(Formula, ReadsCells) {
 TEST(Formula, ComparesNumbers) {
     EXPECT_EQ(Result(L"=1=1"), L"TRUE");
     EXPECT_EQ(Result(L"=1<>1"), L"FALSE");
+    EXPECT_EQ(Result(L"=1=2"), L"FALSE");
+    EXPECT_EQ(Result(L"=1<>2"), L"TRUE");
     EXPECT_EQ(Result(L"=1<2"), L"TRUE");
+    EXPECT_EQ(Result(L"=2<2"), L"FALSE");
     EXPECT_EQ(Result(L"=2<=2"), L"TRUE");
     EXPECT_EQ(Result(L"=2>2"), L"FALSE");
     EXPECT_EQ(Result(L"=2>=2"), L"TRUE");
@@ -81,6 +85,7 @@ TEST(Formula, TakesNumbersForEqualThatDifferInTheLastBits) {
 
 TEST(Formula, ComparesTextsWithoutRegardToCapitals) {
     EXPECT_EQ(Result(L"=\"abc\"=\"ABC\""), L"TRUE");
+    EXPECT_EQ(Result(L"=\"ABC\"=\"abc\""), L"TRUE");
     EXPECT_EQ(Result(L"=\"\u00E4\"=\"\u00C4\""), L"TRUE");
     EXPECT_EQ(Result(L"=\"abc\"<\"ABD\""), L"TRUE");
     EXPECT_EQ(Result(L"=\"ab\"<\"abc\""), L"TRUE");
@@ -154,7 +159,8 @@ TEST(Formula, PassesErrorsOn) {
     EXPECT_EQ(Result(L"=nothing+1/0"), L"#NAME?");
 }
 
-TEST(Formula, NeverShowsANegativeZero) {
+TEST(Formula, NeverGivesANegativeZero) {
+    EXPECT_FALSE(std::signbit(ValueAt(SheetOf({{L"A1", L"=-0"}}), L"A1").number));
     EXPECT_EQ(Result(L"=-0"), L"0");
     EXPECT_EQ(Result(L"=0*-5&\"\""), L"0");
 }
