@@ -23,4 +23,7 @@ constexpr int kSystemColourFlag = 0x40000000;
 // The system colour of a flagged index, such as COLOR_BTNFACE | kSystemColourFlag.
 COLORREF SystemColour(int flaggedIndex);
 
+// The stock brush of a flagged index. It is never deleted.
+HBRUSH SystemStockBrush(int flaggedIndex);
+
 }  // namespace kor

@@ -41,6 +41,7 @@ constexpr LPARAM WordPair(int lowWord, int highWord) {
 // which the unsigned reading turns into a very large one.
 constexpr int LowWord(WPARAM parameter) { return static_cast<uint16_t>(parameter); }
 constexpr int HighWord(WPARAM parameter) { return static_cast<uint16_t>(parameter >> 16); }
+constexpr int SignedLowWord(LPARAM parameter) { return static_cast<int16_t>(parameter); }
 constexpr int SignedHighWord(LPARAM parameter) { return static_cast<int16_t>(parameter >> 16); }
 
 }  // namespace kor

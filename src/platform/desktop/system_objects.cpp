@@ -5,4 +5,8 @@ namespace kor {
 
 COLORREF SystemColour(int flaggedIndex) { return GetSysColor(flaggedIndex & ~kSystemColourFlag); }
 
+HBRUSH SystemStockBrush(int flaggedIndex) {
+    return GetSysColorBrush(flaggedIndex & ~kSystemColourFlag);
+}
+
 }  // namespace kor

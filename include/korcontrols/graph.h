@@ -1,0 +1,351 @@
+/* The chart: line, area, bar, column and pie charts of numeric series.
+ *
+ * Create it as a child window of class KORGRAPH_CLASS (or GetGraphControlClassName()) after
+ * RegisterGraphControl, and drive it with the messages below. The chart keeps copies of all data
+ * and texts it is given and draws into an off-screen image that WM_PAINT copies to the window.
+ *
+ * Changes of data, ranges, options and titles scale the axes again but draw nothing: make all
+ * changes, then send GN_REDRAW once. A change of size, zoom or chart type draws by itself.
+ *
+ * Codes GN_... act only inside WM_NOTIFY (code in wParam, argument in lParam, no NMHDR); sent as
+ * messages of their own they do nothing. The chart sends nothing to its parent.
+ *
+ * Point k of a series, counted from 0, stands at k + 1 on the category axis. A null pointer where a
+ * message needs one changes nothing and stores nothing; the result is 0 then, and 1 from
+ * GM_ADDSERIES.
+ *
+ * A chart whose record could not be made still exists as a window and passes every message on to
+ * default processing. */
+#ifndef KORCONTROLS_GRAPH_H
+#define KORCONTROLS_GRAPH_H
+
+#include <korcontrols/korcontrols.h>
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+
+#define KORGRAPH_CLASS L"KORVANE Corporation GraphControl"
+
+/* ---- Types ---- */
+
+/* Chart types. */
+#define KORGRAPH_LINE 0
+#define KORGRAPH_AREA 1
+#define KORGRAPH_BAR 2 /* horizontal bars: categories along y, values along x */
+#define KORGRAPH_COLUMN 3
+#define KORGRAPH_PIE 4 /* of the first series */
+
+/* Options; all but live mode are on at first. */
+#define KORGRAPH_HORIZONTALGRID 0x001
+#define KORGRAPH_VERTICALGRID 0x002
+#define KORGRAPH_XTICKS 0x004
+#define KORGRAPH_YTICKS 0x008
+#define KORGRAPH_TITLE 0x010
+#define KORGRAPH_XLABELS 0x020
+#define KORGRAPH_YLABELS 0x040
+#define KORGRAPH_XTITLE 0x080
+#define KORGRAPH_YTITLE 0x100
+#define KORGRAPH_PERCENTAGES 0x200 /* at the slices of a pie */
+#define KORGRAPH_LIVE 0x400        /* set it before the series are added */
+
+/* Zoom indexes. */
+#define KORGRAPH_ZOOM25 0
+#define KORGRAPH_ZOOM50 1
+#define KORGRAPH_ZOOM100 2
+#define KORGRAPH_ZOOM200 3
+
+/* Live modes. */
+#define KORGRAPH_SWEEP 0   /* each live update is one new sample */
+#define KORGRAPH_REPLACE 1 /* each live update replaces a series' values */
+
+/* Axes. */
+#define KORGRAPH_X 0
+#define KORGRAPH_Y 1
+
+/* A series as the host hands it over. 16 bytes on 32-bit systems, 32 on 64-bit ones. */
+typedef struct GraphSeriesData {
+    LONG pointCount;      /* at least 1 */
+    LPCWSTR name;         /* copied; may be null or empty; not read by the replacing codes */
+    const double* values; /* pointCount numbers, copied */
+    LONG seriesIndex;     /* which series; read by the replacing codes only */
+} GraphSeriesData;
+
+/* One value. 16 bytes. */
+typedef struct GraphValue {
+    LONG seriesIndex;
+    LONG pointIndex;
+    double value;
+} GraphValue;
+
+/* The range of an axis, in data units. 24 bytes. */
+typedef struct GraphRange {
+    LONG axis; /* KORGRAPH_X or KORGRAPH_Y */
+    LONG reserved;
+    double min;
+    double max;
+} GraphRange;
+
+/* ---- Messages ---- */
+
+/* GM_ADDSERIES: adds a series; its colour is the next one of the palette.
+ *   wParam  0
+ *   lParam  const GraphSeriesData*
+ *   result  0, or 1 for a null pointer, a count below 1 or no memory (nothing is added then) */
+#define GM_ADDSERIES (WM_USER + 6000)
+
+/* GM_SETTITLE, GM_SETXTITLE, GM_SETYTITLE: set the chart's and the axes' titles.
+ *   wParam  0
+ *   lParam  LPCWSTR, copied; null or empty removes the title
+ *   result  0 */
+#define GM_SETTITLE (WM_USER + 6001)
+#define GM_SETXTITLE (WM_USER + 6002)
+#define GM_SETYTITLE (WM_USER + 6004)
+
+/* GM_GETTITLE, GM_GETXTITLE, GM_GETYTITLE: read them.
+ *   wParam  0
+ *   lParam  LPCWSTR*; receives the chart's own text, null without one. It is valid until the title
+ *           is set again or the chart goes.
+ *   result  0 */
+#define GM_GETTITLE (WM_USER + 6005)
+#define GM_GETXTITLE (WM_USER + 6006)
+#define GM_GETYTITLE (WM_USER + 6007)
+
+/* GM_SETCATEGORIES: names the points; label i stands at point i.
+ *   wParam  count; below 1 removes all labels
+ *   lParam  const LPCWSTR*, count texts, copied; single ones may be null
+ *   result  0, or 1 when there was no memory (the labels copied so far stay) */
+#define GM_SETCATEGORIES (WM_USER + 6008)
+
+/* GM_SETTYPE: changes the chart type and draws. Between Bar and the others the axes trade places.
+ *   wParam  0
+ *   lParam  KORGRAPH_LINE to KORGRAPH_PIE; another number is kept and draws nothing
+ *   result  0 */
+#define GM_SETTYPE (WM_USER + 6009)
+
+/* GM_GETTYPE: reads the chart type.
+ *   wParam  0
+ *   lParam  LONG*
+ *   result  0 */
+#define GM_GETTYPE (WM_USER + 6010)
+
+/* GM_SETRANGE: fixes an axis. Equal ends show one unit. The category axis of a bar chart (y)
+ * ignores the ends given and follows the number of points. wParam  0 lParam  const GraphRange*
+ *   result  0 */
+#define GM_SETRANGE (WM_USER + 6011)
+
+/* GM_AUTORANGE: lets an axis follow the data again.
+ *   wParam  0
+ *   lParam  KORGRAPH_X or KORGRAPH_Y
+ *   result  0 */
+#define GM_AUTORANGE (WM_USER + 6012)
+
+/* GM_SETZOOM: sets the zoom and draws.
+ *   wParam  0
+ *   lParam  KORGRAPH_ZOOM25 to KORGRAPH_ZOOM200; other numbers are ignored
+ *   result  0 */
+#define GM_SETZOOM (WM_USER + 6013)
+
+/* GM_TOGGLEOPTIONS: turns options on or off.
+ *   wParam  0
+ *   lParam  options to turn over
+ *   result  0 */
+#define GM_TOGGLEOPTIONS (WM_USER + 6014)
+
+/* GM_GETOPTIONS: reads the options.
+ *   wParam  0
+ *   lParam  DWORD*
+ *   result  0 */
+#define GM_GETOPTIONS (WM_USER + 6015)
+
+/* GN_RESET, inside WM_NOTIFY: removes all series and labels.
+ *   lParam  nonzero also returns the ranges to automatic and 0 to 1; the zoom stays
+ *   result  0 */
+#define GN_RESET (WM_USER + 6016)
+
+/* GN_SETVALUE, inside WM_NOTIFY: sets one value.
+ *   lParam  const GraphValue*; bad indexes are ignored
+ *   result  0 */
+#define GN_SETVALUE (WM_USER + 6018)
+
+/* GN_REDRAW, inside WM_NOTIFY: draws the chart; it reaches the screen with the next paint.
+ *   lParam  0
+ *   result  0 */
+#define GN_REDRAW (WM_USER + 6019)
+
+/* GN_LIVEUPDATE, inside WM_NOTIFY: one step of live mode.
+ *   lParam  in sweep mode a whole number, the new sample; in replace mode const GraphSeriesData*
+ *   result  0 */
+#define GN_LIVEUPDATE (WM_USER + 6021)
+
+/* GN_REPLACESERIES, inside WM_NOTIFY: replaces a series' values. The series keeps its own number of
+ * points: surplus values are dropped, missing ones are 0.
+ *   lParam  const GraphSeriesData*
+ *   result  default processing's */
+#define GN_REPLACESERIES (WM_USER + 6022)
+
+/* GN_CLEAR, inside WM_NOTIFY: removes all series and labels; ranges stay.
+ *   lParam  0
+ *   result  0 */
+#define GN_CLEAR (WM_USER + 6023)
+
+/* GM_SETDATAMODE: chooses what a live update does.
+ *   wParam  0
+ *   lParam  KORGRAPH_SWEEP or KORGRAPH_REPLACE
+ *   result  0 */
+#define GM_SETDATAMODE (WM_USER + 6024)
+
+/* GM_SHOWLEGEND: creates the legend and shows it; ignored while there is one. Its height is rounded
+ * up to whole lines.
+ *   wParam  0
+ *   lParam  const RECT*, in the chart's client coordinates
+ *   result  0 */
+#define GM_SHOWLEGEND (WM_USER + 6025)
+
+/* GM_GETSERIESCOLOR: reads the colour of a series, or of a slice while the chart is a pie.
+ *   wParam  index
+ *   lParam  COLORREF*; receives 0 for a bad index
+ *   result  0 */
+#define GM_GETSERIESCOLOR (WM_USER + 6026)
+
+/* GM_SETBKCOLOR: sets the background colour, for the next redraw.
+ *   wParam  0
+ *   lParam  COLORREF
+ *   result  0 */
+#define GM_SETBKCOLOR (WM_USER + 6027)
+
+/* GM_GETZOOM: reads the zoom index.
+ *   wParam  0
+ *   lParam  LONG*
+ *   result  0 */
+#define GM_GETZOOM (WM_USER + 6028)
+
+/* GM_GETRANGE: reads an axis' range as it is shown at 100 %.
+ *   wParam  0
+ *   lParam  GraphRange*; its axis is read (any number but KORGRAPH_X means y), min and max are set
+ *   result  0 */
+#define GM_GETRANGE (WM_USER + 6029)
+
+/* ---- Functions ---- */
+
+/* Registers the chart's window class under `instance`, the host's own, once per process.
+ *   result  nonzero; 0 when the first call could not register it (it is not tried again: later
+ *           calls answer 1) */
+DWORD KORCONTROLS_API RegisterGraphControl(HINSTANCE instance);
+
+/* The chart's class name; it belongs to the library. */
+LPCWSTR KORCONTROLS_API GetGraphControlClassName(void);
+
+/* ---- The messages as functions ---- */
+
+static __inline LRESULT KorGraph_Notify(HWND graph, UINT code, LPARAM argument) {
+    return SendMessageW(graph, WM_NOTIFY, (WPARAM)code, argument);
+}
+
+static __inline BOOL KorGraph_AddSeries(HWND graph, const GraphSeriesData* series) {
+    return SendMessageW(graph, GM_ADDSERIES, 0, (LPARAM)series) == 0;
+}
+
+static __inline void KorGraph_SetTitle(HWND graph, LPCWSTR text) {
+    SendMessageW(graph, GM_SETTITLE, 0, (LPARAM)text);
+}
+
+static __inline void KorGraph_SetXTitle(HWND graph, LPCWSTR text) {
+    SendMessageW(graph, GM_SETXTITLE, 0, (LPARAM)text);
+}
+
+static __inline void KorGraph_SetYTitle(HWND graph, LPCWSTR text) {
+    SendMessageW(graph, GM_SETYTITLE, 0, (LPARAM)text);
+}
+
+static __inline BOOL KorGraph_SetCategories(HWND graph, LONG count, const LPCWSTR* labels) {
+    return SendMessageW(graph, GM_SETCATEGORIES, (WPARAM)count, (LPARAM)labels) == 0;
+}
+
+static __inline void KorGraph_SetType(HWND graph, LONG type) {
+    SendMessageW(graph, GM_SETTYPE, 0, (LPARAM)type);
+}
+
+static __inline LONG KorGraph_GetType(HWND graph) {
+    LONG type = 0;
+    SendMessageW(graph, GM_GETTYPE, 0, (LPARAM)&type);
+    return type;
+}
+
+static __inline void KorGraph_SetRange(HWND graph, LONG axis, double low, double high) {
+    GraphRange range;
+    range.axis = axis;
+    range.reserved = 0;
+    range.min = low;
+    range.max = high;
+    SendMessageW(graph, GM_SETRANGE, 0, (LPARAM)&range);
+}
+
+static __inline void KorGraph_AutoRange(HWND graph, LONG axis) {
+    SendMessageW(graph, GM_AUTORANGE, 0, (LPARAM)axis);
+}
+
+static __inline void KorGraph_SetZoom(HWND graph, LONG zoomIndex) {
+    SendMessageW(graph, GM_SETZOOM, 0, (LPARAM)zoomIndex);
+}
+
+static __inline LONG KorGraph_GetZoom(HWND graph) {
+    LONG zoomIndex = 0;
+    SendMessageW(graph, GM_GETZOOM, 0, (LPARAM)&zoomIndex);
+    return zoomIndex;
+}
+
+static __inline void KorGraph_ToggleOptions(HWND graph, DWORD options) {
+    SendMessageW(graph, GM_TOGGLEOPTIONS, 0, (LPARAM)options);
+}
+
+static __inline DWORD KorGraph_GetOptions(HWND graph) {
+    DWORD options = 0;
+    SendMessageW(graph, GM_GETOPTIONS, 0, (LPARAM)&options);
+    return options;
+}
+
+static __inline void KorGraph_SetDataMode(HWND graph, LONG mode) {
+    SendMessageW(graph, GM_SETDATAMODE, 0, (LPARAM)mode);
+}
+
+static __inline void KorGraph_ShowLegend(HWND graph, const RECT* place) {
+    SendMessageW(graph, GM_SHOWLEGEND, 0, (LPARAM)place);
+}
+
+static __inline COLORREF KorGraph_GetSeriesColour(HWND graph, LONG index) {
+    COLORREF colour = 0;
+    SendMessageW(graph, GM_GETSERIESCOLOR, (WPARAM)index, (LPARAM)&colour);
+    return colour;
+}
+
+static __inline void KorGraph_SetBackgroundColour(HWND graph, COLORREF colour) {
+    SendMessageW(graph, GM_SETBKCOLOR, 0, (LPARAM)colour);
+}
+
+static __inline void KorGraph_Redraw(HWND graph) { KorGraph_Notify(graph, GN_REDRAW, 0); }
+
+static __inline void KorGraph_Clear(HWND graph) { KorGraph_Notify(graph, GN_CLEAR, 0); }
+
+static __inline void KorGraph_Reset(HWND graph, BOOL ranges) {
+    KorGraph_Notify(graph, GN_RESET, (LPARAM)ranges);
+}
+
+static __inline void KorGraph_SetValue(HWND graph, LONG seriesIndex, LONG pointIndex,
+                                       double value) {
+    GraphValue point;
+    point.seriesIndex = seriesIndex;
+    point.pointIndex = pointIndex;
+    point.value = value;
+    KorGraph_Notify(graph, GN_SETVALUE, (LPARAM)&point);
+}
+
+static __inline void KorGraph_ReplaceSeries(HWND graph, const GraphSeriesData* series) {
+    KorGraph_Notify(graph, GN_REPLACESERIES, (LPARAM)series);
+}
+
+#ifdef __cplusplus
+}
+#endif
+
+#endif /* KORCONTROLS_GRAPH_H */

@@ -1,0 +1,198 @@
+#include "graph/children/legend.h"
+
+#include <korcontrols/legend.h>
+
+#include <algorithm>
+
+#include "graph/graph_entries.h"
+#include "platform/gdi_scopes.h"
+#include "platform/records.h"
+#include "platform/windows_helpers.h"
+
+namespace kor {
+
+namespace {
+
+constexpr int kLineGap = 5;
+constexpr int kTextLeft = 16;
+constexpr int kTextTop = 5;
+constexpr int kTextRightGap = 3;
+constexpr int kSwatchLeft = 3;
+constexpr int kSwatchSide = 10;
+constexpr int kNeverPainted = -1;
+
+constinit wchar_t className[] = KORLEGEND_CLASS;
+constinit bool registered = false;
+
+struct LegendRecord {
+    HINSTANCE instance;
+    HWND window;
+    const GraphRecord* graph;  // not owned; null before attachment and after the chart has gone
+    int32_t firstEntry;
+    int32_t entryCount;  // at the last paint
+};
+
+int LineHeight(HDC dc) {
+    RECT measured = {};
+    DrawTextW(dc, L"M", -1, &measured, DT_CALCRECT);
+    return measured.bottom;
+}
+
+void DrawSwatch(HDC dc, int top, COLORREF colour) {
+    LocalGdiObject<HBRUSH> brush(CreateSolidBrush(colour));
+    SelectScope selected(dc, brush.get());
+    Rectangle(dc, kSwatchLeft, top, kSwatchLeft + kSwatchSide, top + kSwatchSide);
+}
+
+// Entries without a name take no line.
+void DrawEntries(const LegendRecord& legend, HDC dc, int clientWidth, int lineHeight) {
+    int top = kTextTop;
+    for (int i = legend.firstEntry; i < legend.entryCount; ++i) {
+        wchar_t number[kDecimalCapacity];
+        const wchar_t* name = EntryName(*legend.graph, i, number);
+        if (!name) continue;
+        DrawSwatch(dc, top, EntryColour(*legend.graph, i));
+        RECT text = {kTextLeft, top, clientWidth - kTextRightGap, top + lineHeight};
+        DrawTextW(dc, name, -1, &text, 0);
+        top = text.bottom + kLineGap;
+    }
+}
+
+// The count differs from the last paint's: the list begins at its start again.
+bool TakeEntryCount(LegendRecord& legend) {
+    const int count = EntryCount(*legend.graph);
+    if (count == legend.entryCount) return false;
+    legend.entryCount = count;
+    legend.firstEntry = 0;
+    return true;
+}
+
+// A pie's range is one longer than that of the other types, and so is the refresh a stronger one.
+void SetUpScrollBar(const LegendRecord& legend, int clientHeight, int pitch) {
+    const bool pie = IsPieChart(*legend.graph);
+    if (pitch * legend.entryCount > clientHeight) {
+        SCROLLINFO info = {};
+        info.cbSize = sizeof info;
+        info.fMask = SIF_RANGE | SIF_PAGE | SIF_POS | SIF_DISABLENOSCROLL;
+        info.nMax = pie ? legend.entryCount : legend.entryCount - 1;
+        info.nPage = static_cast<UINT>(std::max(clientHeight / pitch, 1));
+        SetScrollInfo(legend.window, SB_VERT, &info, TRUE);
+        SetScrollPos(legend.window, SB_VERT, 0, TRUE);
+    } else {
+        SetScrollRange(legend.window, SB_VERT, 0, 1, TRUE);
+    }
+    if (pie) {
+        InvalidateRect(legend.window, nullptr, TRUE);
+    } else {
+        UpdateWindow(legend.window);
+    }
+}
+
+// Default processing may erase what is invalid and take the invalidation away, so it comes before
+// the scroll bar is set up, which may invalidate anew.
+LRESULT OnPaint(LegendRecord& legend, WPARAM wParam, LPARAM lParam) {
+    bool changed = false;
+    int lineHeight = 0;
+    {
+        PaintScope paint(legend.window);
+        const RECT& area = paint.area();
+        BitBlt(paint.dc(), area.left, area.top, area.right - area.left, area.bottom - area.top,
+               paint.dc(), area.left, area.top, WHITENESS);
+        if (legend.graph) {
+            lineHeight = LineHeight(paint.dc());
+            changed = TakeEntryCount(legend);
+            DrawEntries(legend, paint.dc(), ClientRectOf(legend.window).right, lineHeight);
+        }
+    }
+    const LRESULT result = DefWindowProcW(legend.window, WM_PAINT, wParam, lParam);
+    if (changed) {
+        SetUpScrollBar(legend, ClientRectOf(legend.window).bottom, lineHeight + kLineGap);
+    }
+    return result;
+}
+
+LRESULT OnScroll(LegendRecord& legend, int request) {
+    switch (request) {
+    case SB_LINEUP:
+    case SB_PAGEUP:
+        if (legend.firstEntry >= 1) --legend.firstEntry;
+        break;
+    case SB_LINEDOWN:
+    case SB_PAGEDOWN:
+        if (legend.firstEntry < legend.entryCount - 1) ++legend.firstEntry;
+        break;
+    case SB_THUMBPOSITION:  // the thumb always leads back to the start
+    case SB_THUMBTRACK:
+    case SB_TOP: legend.firstEntry = 0; break;
+    default: break;
+    }
+    InvalidateRect(legend.window, nullptr, TRUE);
+    UpdateWindow(legend.window);
+    return 0;
+}
+
+LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
+    auto* legend = NewRecord<LegendRecord>();
+    if (!legend) return 1;
+    legend->entryCount = kNeverPainted;
+    SetUserData(hwnd, legend);
+    if (!creation || !creation->hInstance || !creation->hwndParent) return 1;
+    legend->instance = creation->hInstance;
+    legend->window = hwnd;
+    ShowWindow(hwnd, SW_SHOW);
+    return 0;
+}
+
+void OnDestroy(HWND hwnd, LegendRecord* legend) {
+    SetUserData(hwnd, nullptr);
+    DeleteRecord(legend);
+}
+
+LRESULT CALLBACK LegendProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
+    auto* legend = UserDataOf<LegendRecord>(hwnd);
+    if (message == WM_CREATE && !legend) {
+        return OnCreate(hwnd, reinterpret_cast<CREATESTRUCTW*>(lParam));
+    }
+    if (!legend) return DefWindowProcW(hwnd, message, wParam, lParam);
+    switch (message) {
+    case WM_DESTROY: OnDestroy(hwnd, legend); break;
+    case WM_PAINT:
+        if (legend->window) return OnPaint(*legend, wParam, lParam);
+        break;
+    case WM_HSCROLL: return 0;
+    case WM_VSCROLL: return OnScroll(*legend, LowWord(wParam));
+    default: break;
+    }
+    return DefWindowProcW(hwnd, message, wParam, lParam);
+}
+
+}  // namespace
+
+bool RegisterLegendClass(HINSTANCE instance) {
+    if (registered) return true;
+    registered = true;
+    WNDCLASSW windowClass = {};
+    windowClass.style = CS_VREDRAW | CS_HREDRAW;
+    windowClass.lpfnWndProc = LegendProc;
+    windowClass.hInstance = instance;
+    windowClass.hbrBackground = SystemStockBrush(COLOR_WINDOW | kSystemColourFlag);
+    windowClass.lpszClassName = className;
+    return RegisterClassW(&windowClass) != 0;
+}
+
+bool AttachLegend(HWND hwnd, const GraphRecord* graph) {
+    auto* legend = UserDataOf<LegendRecord>(hwnd);
+    if (!legend || !graph) return false;
+    legend->graph = graph;
+    return true;
+}
+
+void DetachLegend(HWND hwnd) {
+    if (!IsWindow(hwnd)) return;
+    auto* legend = UserDataOf<LegendRecord>(hwnd);
+    if (legend) legend->graph = nullptr;
+}
+
+int LegendLinePitch(HDC dc) { return LineHeight(dc) + kLineGap; }
+
+}  // namespace kor

@@ -1,0 +1,62 @@
+#include "graph/graph_lines.h"
+
+#include "graph/graph_frame.h"
+#include "graph/graph_points.h"
+#include "graph/graph_scale.h"
+#include "platform/gdi_scopes.h"
+
+namespace kor {
+
+namespace {
+
+bool HasValues(const GraphSeries* series) { return series && series->values; }
+
+void DrawLineSeries(const GraphRecord& graph, HDC dc, const GraphSeries& series) {
+    LocalGdiObject<HPEN> pen(CreatePen(PS_SOLID, 1, series.colour));
+    SelectScope selected(dc, pen.get());
+    const RECT view = PlotClip(graph);
+    SeriesPoints points;
+    if (!points.Make(graph, series, view.left - 1, view.right + 1, LastPosition::whole, 0)) return;
+    if (points.count() > 1) Polyline(dc, points.begin(), points.count());
+    if (graph.chartType == kLine) DrawSeriesMarkers(graph, dc, series);
+}
+
+// The polygon goes down to the zero line below the first and the last point.
+void DrawAreaSeries(const GraphRecord& graph, HDC dc, const GraphSeries& series) {
+    LocalGdiObject<HBRUSH> brush(CreateSolidBrush(series.colour));
+    SelectScope selected(dc, brush.get());
+    const RECT view = PlotClip(graph);
+    constexpr int kBasePoint = 1;
+    SeriesPoints points;
+    if (!points.Make(graph, series, view.left - 1, view.right + 1, LastPosition::summarised,
+                     kBasePoint)) {
+        return;
+    }
+    const int base = yPixel(graph, 0);
+    POINT* corners = points.begin() - kBasePoint;
+    const int count = points.count() + 2 * kBasePoint;
+    corners[0] = {xPixel(graph, 1), base};
+    corners[count - 1] = {xPixel(graph, series.pointCount), base};
+    Polygon(dc, corners, count);
+}
+
+}  // namespace
+
+void DrawLineChart(GraphRecord& graph, HDC dc) {
+    DrawInFrame(graph, dc, [&] {
+        for (int i = 0; i < graph.seriesCount; ++i) {
+            if (HasValues(graph.series[i])) DrawLineSeries(graph, dc, *graph.series[i]);
+        }
+    });
+}
+
+// The first series lies on top.
+void DrawAreaChart(GraphRecord& graph, HDC dc) {
+    DrawInFrame(graph, dc, [&] {
+        for (int i = graph.seriesCount - 1; i >= 0; --i) {
+            if (HasValues(graph.series[i])) DrawAreaSeries(graph, dc, *graph.series[i]);
+        }
+    });
+}
+
+}  // namespace kor

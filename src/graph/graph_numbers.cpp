@@ -1,0 +1,36 @@
+#include "graph/graph_numbers.h"
+
+#include "platform/runtime.h"
+
+namespace kor {
+
+namespace {
+
+// Platforms print exponents with two digits or three: of three the first goes if it is 0.
+void ShortenExponent(wchar_t* text) {
+    wchar_t* exponent = wcschr(text, L'E');
+    if (!exponent) return;
+    ++exponent;
+    if (*exponent == L'-' || *exponent == L'+') ++exponent;
+    const size_t digits = wcslen(exponent);
+    if (*exponent == L'0' && digits >= 3) memmove(exponent, exponent + 1, digits * sizeof(wchar_t));
+}
+
+}  // namespace
+
+int TruncateToInt(double value) {
+    if (value >= kPixelLimit) return kPixelLimit;
+    if (value <= -kPixelLimit) return -kPixelLimit;
+    return value == value ? static_cast<int>(value) : 0;
+}
+
+int FormatGraphNumber(double value, wchar_t* buffer, int precision) {
+    if (!buffer) return 0;
+    wchar_t text[kNumberTextCapacity];
+    FormatSignificant(value, precision, text);
+    ShortenExponent(text);
+    memcpy(buffer, text, (wcslen(text) + 1) * sizeof(wchar_t));
+    return 1;
+}
+
+}  // namespace kor

@@ -1,0 +1,166 @@
+#include "graph/graph_scale.h"
+
+#include <korcontrols/graph.h>
+
+#include <algorithm>
+#include <cmath>
+#include <limits>
+
+#include "graph/graph_numbers.h"
+
+namespace kor {
+
+namespace {
+
+constexpr double kXTickPixels = 50.0;
+constexpr double kYTickPixels = 25.0;
+
+// One axis' part of the mapping.
+struct AxisScale {
+    double centre;
+    double unitsPerPixelBase;
+    double unitsPerPixel;
+    double tickStep;  // may be 0
+    int barSize;
+};
+
+// A range as wide as numbers go has no width that is one; half of it has.
+double HalfRange(double low, double high) { return high * 0.5 - low * 0.5; }
+
+double TickStep(double range, double unitsPerPixelBase, double zoom, double tickPixels) {
+    double step;
+    if (range < 1.0) {
+        step = 1.0 / std::pow(10.0, std::ceil(std::log10(1.0 / std::fabs(range))));
+    } else {
+        step = std::fabs(std::ceil((1.0 / zoom) * tickPixels * unitsPerPixelBase));
+    }
+    return IsFinite(step) ? step : 1.0;
+}
+
+AxisScale ScaleAxis(double low, double high, int extent, const GraphRecord& graph,
+                    double tickPixels) {
+    const double range = high - low;
+    const int pixels = std::max(extent, 1);  // a window smaller than its margins
+    AxisScale scale;
+    if (IsFinite(range)) {
+        scale.centre = range * 0.5 + low;
+        scale.unitsPerPixelBase = std::fabs(range) / pixels;
+    } else {
+        scale.centre = high * 0.5 + low * 0.5;
+        scale.unitsPerPixelBase = std::fabs(HalfRange(low, high)) / pixels * 2.0;
+    }
+    if (!IsFinite(scale.centre)) scale.centre = 0.0;
+    if (!IsFinite(scale.unitsPerPixelBase) || scale.unitsPerPixelBase == 0.0) {
+        scale.unitsPerPixelBase = 1.0;
+    }
+    scale.unitsPerPixel = (1.0 / graph.zoom) * scale.unitsPerPixelBase;
+    if (!IsFinite(scale.unitsPerPixel)) {
+        scale.unitsPerPixel = std::numeric_limits<double>::max();
+    }
+    scale.barSize = graph.seriesCount > 0 ? TruncateToInt(pixels / range / graph.seriesCount) : 0;
+    scale.tickStep = TickStep(range, std::fabs(range) / pixels, graph.zoom, tickPixels);
+    return scale;
+}
+
+}  // namespace
+
+int xPixel(const GraphRecord& graph, double x) {
+    return graph.xCentrePixel + TruncateToInt((x - graph.xCentre) / graph.xUnitsPerPixel);
+}
+
+int yPixel(const GraphRecord& graph, double y) {
+    return graph.yCentrePixel - TruncateToInt((y - graph.yCentre) / graph.yUnitsPerPixel);
+}
+
+void RescaleX(GraphRecord& graph) {
+    if (!graph.hwnd) return;
+    const RECT plot = PlotArea(graph);
+    const int width = plot.right - plot.left;
+    const AxisScale scale = ScaleAxis(graph.xMin, graph.xMax, width, graph, kXTickPixels);
+    graph.barWidth = scale.barSize;
+    graph.xCentre = scale.centre;
+    graph.xUnitsPerPixelBase = scale.unitsPerPixelBase;
+    graph.xUnitsPerPixel = scale.unitsPerPixel;
+    graph.xCentrePixel = graph.marginLeft + (width >> 1);
+    graph.xTickStep = scale.tickStep;
+    graph.xTickHalfSpacing = ((xPixel(graph, graph.xTickStep) - xPixel(graph, 0)) >> 1) - 2;
+    if (graph.xTickStep == 0) graph.xTickStep = 1.0;
+    graph.xTickStepCopy = graph.xTickStep;
+}
+
+void RescaleY(GraphRecord& graph) {
+    if (!graph.hwnd) return;
+    const RECT plot = PlotArea(graph);
+    const int height = plot.bottom - plot.top;
+    const AxisScale scale = ScaleAxis(graph.yMin, graph.yMax, height, graph, kYTickPixels);
+    graph.barHeight = scale.barSize;
+    graph.yCentre = scale.centre;
+    graph.yUnitsPerPixelBase = scale.unitsPerPixelBase;
+    graph.yUnitsPerPixel = scale.unitsPerPixel;
+    graph.yCentrePixel = graph.marginTop + (height >> 1);
+    graph.yTickStep = scale.tickStep == 0 ? 1.0 : scale.tickStep;
+    graph.yTickStepCopy = graph.yTickStep;
+}
+
+void AutoRange(GraphRecord& graph, int axis) {
+    const bool isBar = graph.chartType == kBar;
+    const bool ofPoints = (axis == KORGRAPH_X) != isBar;  // the axis that counts the points
+    const double low = ofPoints ? graph.xDataMin : graph.yDataMin;
+    const double high = ofPoints ? graph.xDataMax : graph.yDataMax;
+    if (axis == KORGRAPH_X) {
+        graph.xAutoRange = 1;
+        graph.xMin = low;
+        graph.xMax = high;
+        RescaleX(graph);
+    } else if (axis == KORGRAPH_Y) {
+        graph.yAutoRange = 1;
+        graph.yMin = low;
+        graph.yMax = high;
+        RescaleY(graph);
+    }
+}
+
+namespace {
+
+// The category axis of a bar chart takes no range: it follows the largest series, of which every
+// second one is looked at.
+void SetBarCategoryRange(GraphRecord& graph) {
+    int largest = 0;
+    for (int i = 0; i < graph.seriesCount; i += 2) {
+        if (graph.series[i]) largest = std::max(largest, graph.series[i]->pointCount);
+    }
+    graph.yAutoRange = 1;
+    graph.yMax = std::max(graph.yMax, largest + 1.0);
+    RescaleY(graph);
+}
+
+}  // namespace
+
+void SetRange(GraphRecord& graph, int axis, double low, double high) {
+    const double shownHigh = high == low ? low + 1.0 : high;
+    if (axis == KORGRAPH_X) {
+        graph.xAutoRange = 0;
+        graph.xMin = low;
+        graph.xMax = shownHigh;
+        RescaleX(graph);
+    } else if (axis == KORGRAPH_Y && graph.chartType == kBar) {
+        SetBarCategoryRange(graph);
+    } else if (axis == KORGRAPH_Y) {
+        graph.yAutoRange = 0;
+        graph.yMin = low;
+        graph.yMax = shownHigh;
+        RescaleY(graph);
+    }
+}
+
+void SetZoomFactor(GraphRecord& graph, double factor) {
+    graph.zoom = std::fabs(factor);
+    RescaleX(graph);
+    RescaleY(graph);
+}
+
+int ZoomedThickness(const GraphRecord& graph, int thickness) {
+    return graph.zoom >= 1.0 ? thickness : TruncateToInt(thickness * graph.zoom);
+}
+
+}  // namespace kor

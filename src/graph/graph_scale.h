@@ -1,0 +1,28 @@
+// Data values to pixels: one linear mapping per axis, centred on the plot area and scaled by the
+// zoom.
+#pragma once
+
+#include "graph/graph_record.h"
+
+namespace kor {
+
+// Image column of an x value, image row of a y value. Monotone, whatever the value.
+int xPixel(const GraphRecord& graph, double x);
+int yPixel(const GraphRecord& graph, double y);
+
+// Compute an axis' mapping, tick step and bar size from its range, the zoom and the plot area.
+void RescaleX(GraphRecord& graph);
+void RescaleY(GraphRecord& graph);
+
+// `axis` is KORGRAPH_X or KORGRAPH_Y; another number changes nothing.
+void AutoRange(GraphRecord& graph, int axis);
+void SetRange(GraphRecord& graph, int axis, double low, double high);
+
+// Scales the zoom: both axes follow.
+void SetZoomFactor(GraphRecord& graph, double factor);
+
+// Thickness of one column or bar at the current zoom: zooming out narrows, zooming in does not
+// widen.
+int ZoomedThickness(const GraphRecord& graph, int thickness);
+
+}  // namespace kor

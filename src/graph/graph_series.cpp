@@ -1,0 +1,268 @@
+#include "graph/graph_series.h"
+
+#include <algorithm>
+
+#include "graph/graph_numbers.h"
+#include "graph/graph_palette.h"
+#include "graph/graph_scale.h"
+#include "platform/local_text.h"
+#include "platform/records.h"
+
+namespace kor {
+
+namespace {
+
+// More numbers, points or labels than this would not fit into 31 bits of bytes.
+constexpr int kMostValues = 0x7FFFFFFF / static_cast<int>(sizeof(double));
+
+constexpr int kLeastLivePoints = 3;
+
+double* AllocateValues(int count) {
+    return static_cast<double*>(
+        LocalAlloc(LMEM_FIXED, static_cast<SIZE_T>(count) * sizeof(double)));
+}
+
+// What one pass over values finds. Numbers that are none, or infinite, do not count.
+struct Extremes {
+    double minValue = 0;
+    double maxValue = 0;
+    int minIndex = 0;
+    int maxIndex = 0;
+    double absSum = 0;
+};
+
+// Ties keep the first index. The sum is taken in index order.
+Extremes FindExtremes(const double* values, int count) {
+    Extremes found;
+    int i = 0;
+    while (i < count && !IsFinite(values[i])) ++i;
+    if (i == count) return found;
+    found.minValue = found.maxValue = values[i];
+    found.minIndex = found.maxIndex = i;
+    for (; i < count; ++i) {
+        const double value = values[i];
+        if (!IsFinite(value)) continue;
+        if (value < found.minValue) {
+            found.minValue = value;
+            found.minIndex = i;
+        }
+        if (value > found.maxValue) {
+            found.maxValue = value;
+            found.maxIndex = i;
+        }
+        found.absSum += value < 0 ? -value : value;
+    }
+    return found;
+}
+
+void TakeExtremes(GraphSeries& series) {
+    const Extremes found = FindExtremes(series.values, series.pointCount);
+    series.minValue = found.minValue;
+    series.maxValue = found.maxValue;
+    series.minIndex = found.minIndex;
+    series.maxIndex = found.maxIndex;
+    series.absSum = found.absSum;
+}
+
+// Copies the values; in live mode the series gets its second buffer as well.
+bool InitialiseSeries(GraphSeries& series, int count, const double* values, bool live) {
+    series.values = AllocateValues(count);
+    if (!series.values) return false;
+    series.pointCount = count;
+    memcpy(series.values, values, static_cast<size_t>(count) * sizeof(double));
+    TakeExtremes(series);
+    if (!live) return true;
+    series.liveBuffer =
+        AllocateLocal<POINT>(static_cast<uint32_t>(std::max(count, kLeastLivePoints)));
+    return series.liveBuffer != nullptr;
+}
+
+void FreeSeries(GraphSeries* series) {
+    if (!series) return;
+    FreeLocal(series->values);
+    FreeLocal(series->name);
+    FreeLocal(series->liveBuffer);
+    DeleteRecord(series);
+}
+
+GraphSeries* CreateSeries(const GraphSeriesData& data, bool live) {
+    auto* series = NewRecord<GraphSeries>();
+    if (!series) return nullptr;
+    const bool named = data.name && *data.name;
+    const bool made = InitialiseSeries(*series, data.pointCount, data.values, live) &&
+                      (!named || (series->name = CopyText(data.name)) != nullptr);
+    if (made) return series;
+    FreeSeries(series);
+    return nullptr;
+}
+
+bool AppendSeries(GraphRecord& graph, GraphSeries* series) {
+    auto* grown = AllocateLocal<GraphSeries*>(static_cast<uint32_t>(graph.seriesCount) + 1);
+    if (!grown) return false;
+    std::copy_n(graph.series, graph.seriesCount, grown);
+    grown[graph.seriesCount] = series;
+    FreeLocal(graph.series);
+    graph.series = grown;
+    ++graph.seriesCount;
+    return true;
+}
+
+// What all series span together. The x extent never shrinks here; the least y is never above 0.
+void FindDataExtremes(GraphRecord& graph) {
+    graph.yDataMax = graph.series[0]->maxValue;
+    graph.yDataMin = std::min(graph.series[0]->minValue, 0.0);
+    for (int i = 0; i < graph.seriesCount; ++i) {
+        const GraphSeries& series = *graph.series[i];
+        graph.yDataMax = std::max(graph.yDataMax, series.maxValue);
+        graph.yDataMin = std::min(graph.yDataMin, series.minValue);
+        graph.xDataMax = std::max(graph.xDataMax, series.pointCount + 1.0);
+    }
+    if (graph.yDataMax == graph.yDataMin) graph.yDataMax = graph.yDataMin + 1.0;
+}
+
+void FollowData(GraphRecord& graph) {
+    if (graph.xAutoRange) AutoRange(graph, KORGRAPH_X);
+    if (graph.yAutoRange) AutoRange(graph, KORGRAPH_Y);
+}
+
+// The largest value anew. Its index moves only onto a larger value than the first one.
+void RescanMaximum(GraphSeries& series) {
+    series.maxValue = series.values[0];
+    series.absSum = 0;
+    for (int i = 0; i < series.pointCount; ++i) {
+        const double value = series.values[i];
+        if (!IsFinite(value)) continue;
+        if (!(value <= series.maxValue)) {
+            series.maxValue = value;
+            series.maxIndex = i;
+        }
+        series.absSum += value < 0 ? -value : value;
+    }
+}
+
+void RescanMinimum(GraphSeries& series) {
+    series.minValue = series.values[0];
+    series.absSum = 0;
+    for (int i = 0; i < series.pointCount; ++i) {
+        const double value = series.values[i];
+        if (!IsFinite(value)) continue;
+        if (!(value >= series.minValue)) {
+            series.minValue = value;
+            series.minIndex = i;
+        }
+        series.absSum += value < 0 ? -value : value;
+    }
+}
+
+void StoreValue(GraphSeries& series, int index, double value) {
+    series.values[index] = value;
+    if (value < series.minValue && IsFinite(value)) {
+        series.minValue = value;
+        series.minIndex = index;
+    }
+    if (value > series.maxValue && IsFinite(value)) {
+        series.maxValue = value;
+        series.maxIndex = index;
+    }
+    // A value that is neither extreme leaves the sum as it was.
+    if (index == series.maxIndex) {
+        RescanMaximum(series);
+    } else if (index == series.minIndex) {
+        RescanMinimum(series);
+    }
+}
+
+void RemoveCategories(GraphRecord& graph) {
+    if (graph.categoryLabels) {
+        for (int i = 0; i < graph.categoryCount; ++i) FreeLocal(graph.categoryLabels[i]);
+    }
+    FreeLocal(graph.categoryLabels);
+}
+
+}  // namespace
+
+bool AddSeries(GraphRecord& graph, const GraphSeriesData& data) {
+    if (!data.values || data.pointCount < 1 || data.pointCount > kMostValues) return false;
+    GraphSeries* series = CreateSeries(data, HasOption(graph, KORGRAPH_LIVE));
+    if (!series) return false;
+    if (!AppendSeries(graph, series)) {
+        FreeSeries(series);
+        return false;
+    }
+    FindDataExtremes(graph);
+    series->colour = ColourOfSeriesNumber(graph.seriesCount);
+    FollowData(graph);
+    return true;
+}
+
+void SetSeriesValue(GraphRecord& graph, const GraphValue& point) {
+    GraphSeries* series = SeriesAt(graph, point.seriesIndex);
+    if (!series) return;
+    if (series->values && point.pointIndex >= 0 && point.pointIndex < series->pointCount) {
+        StoreValue(*series, point.pointIndex, point.value);
+    }
+    FollowData(graph);
+}
+
+void ReplaceSeriesValues(GraphRecord& graph, const GraphSeriesData& data) {
+    GraphSeries* series = SeriesAt(graph, data.seriesIndex);
+    if (!series) return;
+    if (data.values && data.pointCount >= 1) {
+        if (series->values) {
+            const int copied = std::min<int>(series->pointCount, data.pointCount);
+            std::copy_n(data.values, copied, series->values);
+            std::fill(series->values + copied, series->values + series->pointCount, 0.0);
+            TakeExtremes(*series);
+        } else {
+            InitialiseSeries(*series, data.pointCount, data.values,
+                             HasOption(graph, KORGRAPH_LIVE));
+        }
+    }
+    FollowData(graph);
+}
+
+void RemoveAllSeries(GraphRecord& graph) {
+    for (int i = 0; i < graph.seriesCount; ++i) FreeSeries(graph.series[i]);
+    FreeLocal(graph.series);
+    graph.seriesCount = 0;
+    graph.xDataMax = graph.yDataMax = 1.0;
+    graph.xDataMin = graph.yDataMin = 0.0;
+    RemoveCategories(graph);
+}
+
+bool SetCategories(GraphRecord& graph, int count, const wchar_t* const* labels) {
+    RemoveCategories(graph);
+    graph.categoryCount = 0;
+    if (count < 1) return true;
+    if (count > kMostValues) return false;
+    graph.categoryLabels = AllocateLocal<wchar_t*>(static_cast<uint32_t>(count));
+    if (!graph.categoryLabels) return false;
+    graph.categoryCount = count;
+    if (!labels) return true;
+    for (int i = 0; i < count; ++i) {
+        if (!labels[i]) continue;
+        const size_t length = wcslen(labels[i]);
+        auto* label = AllocateLocal<wchar_t>(static_cast<uint32_t>(length) + 1);
+        if (!label) return false;
+        memcpy(label, labels[i], length * sizeof(wchar_t));
+        graph.categoryLabels[i] = label;
+    }
+    return true;
+}
+
+GraphSeries* SeriesAt(const GraphRecord& graph, int index) {
+    return index >= 0 && index < graph.seriesCount ? graph.series[index] : nullptr;
+}
+
+COLORREF SeriesColour(const GraphRecord& graph, int index) {
+    if (graph.chartType == kPie) return SliceColour(index);
+    const GraphSeries* series = SeriesAt(graph, index);
+    return series ? series->colour : 0;
+}
+
+const wchar_t* SeriesName(const GraphRecord& graph, int index) {
+    const GraphSeries* series = SeriesAt(graph, index);
+    return series ? series->name : nullptr;
+}
+
+}  // namespace kor

@@ -1,0 +1,12 @@
+#include "platform/number_text.h"
+
+#include <wchar.h>
+
+namespace kor {
+
+void FormatSignificant(double value, int digits, wchar_t (&text)[kNumberTextCapacity]) {
+    _snwprintf(text, kNumberTextCapacity, L"%.*G", digits, value);
+    text[kNumberTextCapacity - 1] = L'\0';
+}
+
+}  // namespace kor
