@@ -13,7 +13,7 @@ sys.dont_write_bytecode = True
 ROOT = pathlib.Path(__file__).resolve().parents[1]
 sys.path.insert(0, str(ROOT / "tests" / "e2e"))
 
-from desktop import Desktop  # noqa: E402
+from desktop import Desktop, wait_until  # noqa: E402
 from probe import Probe  # noqa: E402
 from workbook_app import Workbook, column_name, expect, windows_path  # noqa: E402
 
@@ -43,6 +43,18 @@ def zoom(workbook, key, percent):
     """Through the View menu; `key` is the underlined letter of the entry."""
     workbook.desktop.key("alt+v", "z", key)
     expect(lambda: workbook.view().zoom, f"{percent} %")
+
+
+def chart_of(workbook):
+    return workbook.view().main.find("KORVANE Corporation GraphControl")
+
+
+def show_chart(workbook, first, last):
+    """Selects a block and charts it."""
+    workbook.drag_cells(first, last)
+    expect(lambda: workbook.view().status.split()[0], f"{first}:{last}")
+    workbook.desktop.key("ctrl+h")
+    wait_until(lambda: chart_of(workbook), "the chart appears")
 
 
 def steps(workbook, file):
@@ -77,6 +89,14 @@ def steps(workbook, file):
     yield "zoomed-to-150-percent"
     zoom(workbook, "5", 50)
     yield "zoomed-to-50-percent"
+
+    zoom(workbook, "1", 100)
+    workbook.desktop.key("ctrl+Home")
+    show_chart(workbook, "A1", "C13")
+    yield "line-chart"
+    workbook.desktop.key("alt+c", "o")
+    workbook.desktop.key("alt+c", "g")
+    yield "column-chart-with-legend"
 
 
 def main():

@@ -2,12 +2,14 @@
 
 #include <string>
 
+#include "chart_commands.h"
 #include "clipboard.h"
 #include "dialogs.h"
 #include "edit_commands.h"
 #include "equation_bar.h"
 #include "file_commands.h"
 #include "function_menu.h"
+#include "menu_marks.h"
 #include "resource.h"
 #include "view_commands.h"
 #include "workbook.h"
@@ -31,14 +33,6 @@ UINT ZoomCommand(DWORD quarters) {
     case 8: return IDM_VIEW_ZOOM_200;
     default: return IDM_VIEW_ZOOM_100;
     }
-}
-
-void Check(HMENU menu, UINT command, bool checked) {
-    CheckMenuItem(menu, command, MF_BYCOMMAND | (checked ? MF_CHECKED : MF_UNCHECKED));
-}
-
-void Enable(HMENU menu, UINT command, bool enabled) {
-    EnableMenuItem(menu, command, MF_BYCOMMAND | (enabled ? MF_ENABLED : MF_GRAYED));
 }
 
 void Rename(HMENU menu, UINT command, const std::wstring& text) {
@@ -106,12 +100,16 @@ void RunCommand(Workbook& workbook, UINT command) {
         if (command >= IDM_FUNCTION_FIRST && command <= IDM_FUNCTION_LAST) {
             InsertFunction(workbook, command);
         }
+        if (command >= IDM_CHART_FIRST && command <= IDM_CHART_LAST) {
+            RunChartCommand(workbook, command);
+        }
     }
 }
 
 void PrepareMenu(const Workbook& workbook, HMENU menu) {
     PrepareEditMenu(workbook.document, menu);
     PrepareViewMenu(workbook.view, menu);
+    PrepareChartMenu(workbook, menu);
 }
 
 }  // namespace workbook

@@ -20,6 +20,7 @@ void AfterEdit(Workbook& workbook, EditResult result) {
     // Storing usually moves on to another cell at once, so a notice would hardly be seen.
     if (result == EditResult::NoMemory) workbook.isOutOfMemory = true;
     if (result != EditResult::Done) return;
+    workbook.chart.isStale = true;
     ShowTitle(workbook);
     UpdateScrollRanges(workbook);
 }

@@ -7,6 +7,11 @@
  * WM_NOTIFY, so that a status bar's notification is never taken for the grid's. */
 #define IDC_GRID 101
 #define IDC_STATUS 102
+#define IDC_CHART_PANE 103
+
+/* Child windows of the chart pane. */
+#define IDC_CHART 104
+#define IDC_LIVE_CHART 105
 
 /* Resources. */
 #define IDR_MENU 200
@@ -15,6 +20,13 @@
 #define IDD_GOTO 210
 #define IDC_GOTO_ADDRESS 211
 #define IDD_KEYS 220
+#define IDD_CHART_TITLES 230
+#define IDC_TITLE_CHART 231
+#define IDC_TITLE_CATEGORIES 232
+#define IDC_TITLE_VALUES 233
+#define IDD_CHART_RANGE 240
+#define IDC_RANGE_LOW 241
+#define IDC_RANGE_HIGH 242
 
 /* File. */
 #define IDM_FILE_NEW 1001
@@ -57,5 +69,45 @@
 #define IDM_FUNCTIONS 1401
 #define IDM_FUNCTION_FIRST 1500
 #define IDM_FUNCTION_LAST 1599
+
+/* Chart. Types and zoom are consecutive in the chart's own order, the options in the order of its
+ * bits. From the line chart on, entries need a chart to be shown. */
+#define IDM_CHART_FIRST 1601
+#define IDM_CHART_SHOW 1601
+#define IDM_CHART_SELECTION 1602
+#define IDM_CHART_LINE 1611
+#define IDM_CHART_AREA 1612
+#define IDM_CHART_BAR 1613
+#define IDM_CHART_COLUMN 1614
+#define IDM_CHART_PIE 1615
+#define IDM_CHART_LEGEND 1621
+#define IDM_CHART_TITLES 1622
+#define IDM_CHART_ZOOM_25 1631
+#define IDM_CHART_ZOOM_50 1632
+#define IDM_CHART_ZOOM_100 1633
+#define IDM_CHART_ZOOM_200 1634
+#define IDM_CHART_OPTION_FIRST 1641
+#define IDM_CHART_HORIZONTAL_GRID 1641
+#define IDM_CHART_VERTICAL_GRID 1642
+#define IDM_CHART_X_TICKS 1643
+#define IDM_CHART_Y_TICKS 1644
+#define IDM_CHART_TITLE 1645
+#define IDM_CHART_X_LABELS 1646
+#define IDM_CHART_Y_LABELS 1647
+#define IDM_CHART_X_TITLE 1648
+#define IDM_CHART_Y_TITLE 1649
+#define IDM_CHART_PERCENTAGES 1650
+#define IDM_CHART_OPTION_LAST 1650
+#define IDM_CHART_BACKGROUND_WHITE 1661
+#define IDM_CHART_BACKGROUND_YELLOW 1662
+#define IDM_CHART_BACKGROUND_GREY 1663
+#define IDM_CHART_BACKGROUND_CHOOSE 1664
+#define IDM_CHART_RANGE_AUTOMATIC 1671
+#define IDM_CHART_RANGE_FIX 1672
+#define IDM_CHART_RANGE_EDIT 1673
+#define IDM_CHART_LIVE_OFF 1681
+#define IDM_CHART_LIVE_SWEEP 1682
+#define IDM_CHART_LIVE_REPLACE 1683
+#define IDM_CHART_LAST 1683
 
 #endif

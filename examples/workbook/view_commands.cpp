@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <iterator>
 
+#include "chart_view.h"
 #include "equation_bar.h"
 #include "model/survey.h"
 #include "selection.h"
@@ -117,6 +118,7 @@ void ShowDocumentFromStart(Workbook& workbook) {
     Select(workbook, BlockOf({0, 0}));
     workbook.shown.notice.clear();
     ShowTitle(workbook);
+    ChartNewDocument(workbook);
 }
 
 }  // namespace workbook

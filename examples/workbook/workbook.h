@@ -8,6 +8,7 @@
 #include <string>
 
 #include "cell_styles.h"
+#include "chart.h"
 #include "column_widths.h"
 #include "model/document.h"
 #include "text_measure.h"
@@ -58,6 +59,7 @@ struct Workbook {
     ViewOptions view;
     ShownState shown;
     PressState press;
+    Chart chart;
     int wheelDistance = 0;       // turned, but less than a notch so far
     bool isOutOfMemory = false;  // to be told when no message is being handled
 };

@@ -5,6 +5,8 @@
 #include <algorithm>
 #include <new>
 
+#include "chart_pane.h"
+#include "chart_view.h"
 #include "commands.h"
 #include "equation_bar.h"
 #include "file_commands.h"
@@ -35,7 +37,7 @@ bool OnCreate(Workbook& workbook, HWND window) {
     workbook.grid =
         CreateWindowExW(0, KORGRID_CLASS, nullptr, kGridStyle, 0, 0, 0, 0, window,
                         reinterpret_cast<HMENU>(INT_PTR{IDC_GRID}), workbook.instance, nullptr);
-    if (!workbook.grid || !workbook.statusBar) return false;
+    if (!workbook.grid || !workbook.statusBar || !CreateChartPane(workbook)) return false;
     PrepareEquationBar(workbook);
     SetFunctionButtonMessageID(IDM_FUNCTIONS);
     DragAcceptFiles(window, TRUE);
@@ -51,10 +53,9 @@ void OnDestroy(Workbook& workbook) {
 
 // ---- Layout and focus ----
 
-void OnSize(Workbook& workbook, WPARAM kind, int width, int height) {
+void OnSize(Workbook& workbook, WPARAM kind) {
     if (kind == SIZE_MINIMIZED) return;
-    const int gridHeight = std::max(0, height - LayoutStatusBar(workbook));
-    MoveWindow(workbook.grid, 0, 0, width, gridHeight, TRUE);
+    LayOutWindow(workbook);
     UpdateScrollRanges(workbook);
 }
 
@@ -81,7 +82,7 @@ void OnGetMinMaxInfo(MINMAXINFO& info) { info.ptMinTrackSize = {kLeastWidth, kLe
 LRESULT Dispatch(Workbook& workbook, UINT message, WPARAM wParam, LPARAM lParam) {
     const HWND window = workbook.window;
     switch (message) {
-    case WM_SIZE: OnSize(workbook, wParam, LOWORD(lParam), HIWORD(lParam)); return 0;
+    case WM_SIZE: OnSize(workbook, wParam); return 0;
     case WM_SETFOCUS: OnSetFocus(workbook); return 0;
     case WM_NOTIFY:
         if (OnGridNotify(workbook, static_cast<UINT>(wParam), lParam)) return 0;
@@ -165,6 +166,16 @@ bool CreateWorkbookWindow(Workbook& workbook, const std::wstring& file, int show
     return true;
 }
 
+void LayOutWindow(const Workbook& workbook) {
+    RECT area = {};
+    GetClientRect(workbook.window, &area);
+    const int width = static_cast<int>(area.right);
+    const int height = std::max(0, static_cast<int>(area.bottom) - LayoutStatusBar(workbook));
+    const int gridWidth = width - ChartPaneWidth(workbook, width);
+    MoveWindow(workbook.grid, 0, 0, gridWidth, height, TRUE);
+    MoveWindow(workbook.chart.pane, gridWidth, 0, width - gridWidth, height, TRUE);
+}
+
 void ShowTitle(const Workbook& workbook) {
     const Document& document = workbook.document;
     const std::wstring title = document.name() + L" - Workbook";
@@ -175,6 +186,8 @@ void OnIdle(Workbook& workbook) noexcept {
     if (!workbook.grid) return;
     try {
         CatchUpWithGrid(workbook);
+        RefreshChart(workbook);
+        KeepTooltipsInPane(workbook);
     } catch (const std::bad_alloc&) {
         workbook.isOutOfMemory = true;
     }

@@ -18,6 +18,9 @@ bool CreateWorkbookWindow(Workbook& workbook, const std::wstring& file, int show
 // "*sunspots.csv - Workbook"; the star means unsaved changes.
 void ShowTitle(const Workbook& workbook);
 
+// Gives grid, chart and status bar their places.
+void LayOutWindow(const Workbook& workbook);
+
 // To be called when no message is waiting.
 void OnIdle(Workbook& workbook) noexcept;
 

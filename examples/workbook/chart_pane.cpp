@@ -1,0 +1,165 @@
+#include "chart_pane.h"
+
+#include <korcontrols/graph.h>
+#include <korcontrols/legend.h>
+#include <korcontrols/tooltip.h>
+
+#include <algorithm>
+#include <new>
+
+#include "chart_live.h"
+#include "chart_view.h"
+#include "resource.h"
+#include "workbook.h"
+
+namespace workbook {
+
+namespace {
+
+constexpr const wchar_t* kPaneClass = L"korcontrols Workbook Chart Pane";
+constexpr int kPanePercent = 45;
+constexpr int kChartPercent = 60;  // of the height, with the live chart below
+constexpr int kEdge = 2;           // between grid and chart
+
+constexpr int kLegendWidth = 130;
+constexpr int kLegendHeight = 120;
+constexpr int kLegendTop = 24;  // below the title
+constexpr int kLegendGap = 6;
+
+// The chart must not paint over the tooltip, a sibling, nor over the legend, a child.
+constexpr DWORD kGraphStyle = WS_CHILD | WS_CLIPSIBLINGS | WS_CLIPCHILDREN;
+
+RECT ClientOf(HWND window) {
+    RECT area = {};
+    GetClientRect(window, &area);
+    return area;
+}
+
+HWND LegendOf(const Chart& chart) { return GetDlgItem(chart.graph, KORLEGEND_ID); }
+
+// Where the legend stands when it is shown first: at the right, below the title.
+RECT LegendPlace(const Chart& chart) {
+    const RECT area = ClientOf(chart.graph);
+    const LONG width = std::min<LONG>(kLegendWidth, area.right / 2);
+    const LONG left = area.right - width - kLegendGap;
+    return {left, kLegendTop, left + width, kLegendTop + kLegendHeight};
+}
+
+void PlaceLegend(const Chart& chart) {
+    const HWND legend = LegendOf(chart);
+    if (!legend) return;
+    const RECT place = LegendPlace(chart);
+    SetWindowPos(legend, nullptr, place.left, place.top, 0, 0, SWP_NOSIZE | SWP_NOZORDER);
+}
+
+HWND CreateGraph(const Workbook& workbook, int id, DWORD style) {
+    return CreateWindowExW(0, KORGRAPH_CLASS, nullptr, kGraphStyle | style, 0, 0, 0, 0,
+                           workbook.chart.pane, reinterpret_cast<HMENU>(INT_PTR{id}),
+                           workbook.instance, nullptr);
+}
+
+LRESULT Dispatch(Workbook& workbook, UINT message, WPARAM wParam, LPARAM lParam) {
+    switch (message) {
+    case WM_SIZE: LayOutChartPane(workbook); return 0;
+    case WM_TIMER: OnLiveTimer(workbook); return 0;
+    case WM_SETCURSOR:
+        // Charts have no pointer shape of their own.
+        if (LOWORD(lParam) != HTCLIENT) break;
+        SetCursor(LoadCursorW(nullptr, IDC_ARROW));
+        return TRUE;
+    default: break;
+    }
+    return DefWindowProcW(workbook.chart.pane, message, wParam, lParam);
+}
+
+LRESULT CALLBACK PaneProc(HWND window, UINT message, WPARAM wParam, LPARAM lParam) noexcept {
+    auto* const workbook = reinterpret_cast<Workbook*>(GetWindowLongPtrW(window, GWLP_USERDATA));
+    if (!workbook) return DefWindowProcW(window, message, wParam, lParam);
+    try {
+        return Dispatch(*workbook, message, wParam, lParam);
+    } catch (const std::bad_alloc&) {
+        workbook->isOutOfMemory = true;
+        return 0;
+    }
+}
+
+bool RegisterPaneClass(HINSTANCE instance) {
+    WNDCLASSEXW windowClass = {};
+    windowClass.cbSize = sizeof windowClass;
+    windowClass.lpfnWndProc = PaneProc;
+    windowClass.hInstance = instance;
+    windowClass.hbrBackground = reinterpret_cast<HBRUSH>(INT_PTR{COLOR_BTNFACE + 1});
+    windowClass.lpszClassName = kPaneClass;
+    return RegisterClassExW(&windowClass) != 0;
+}
+
+void KeepInPane(HWND pane, HWND tooltip) {
+    RECT place = {};
+    GetWindowRect(tooltip, &place);
+    MapWindowPoints(nullptr, pane, reinterpret_cast<POINT*>(&place), 2);
+    const LONG beyond = place.right - ClientOf(pane).right;
+    if (beyond <= 0) return;
+    SetWindowPos(tooltip, nullptr, std::max(0L, place.left - beyond), place.top, 0, 0,
+                 SWP_NOSIZE | SWP_NOZORDER);
+}
+
+}  // namespace
+
+bool CreateChartPane(Workbook& workbook) {
+    if (!RegisterGraphControl(workbook.instance) || !RegisterPaneClass(workbook.instance)) {
+        return false;
+    }
+    Chart& chart = workbook.chart;
+    chart.pane = CreateWindowExW(0, kPaneClass, nullptr, WS_CHILD | WS_CLIPCHILDREN, 0, 0, 0, 0,
+                                 workbook.window, reinterpret_cast<HMENU>(INT_PTR{IDC_CHART_PANE}),
+                                 workbook.instance, nullptr);
+    chart.graph = CreateGraph(workbook, IDC_CHART, WS_VISIBLE);
+    chart.liveGraph = CreateGraph(workbook, IDC_LIVE_CHART, 0);
+    SetWindowLongPtrW(chart.pane, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(&workbook));
+    return chart.pane && chart.graph && chart.liveGraph;
+}
+
+int ChartPaneWidth(const Workbook& workbook, int windowWidth) {
+    return workbook.chart.isShown ? windowWidth * kPanePercent / 100 : 0;
+}
+
+void LayOutChartPane(const Workbook& workbook) {
+    const Chart& chart = workbook.chart;
+    const RECT area = ClientOf(chart.pane);
+    const int width = std::max(0, static_cast<int>(area.right) - kEdge);
+    const int height = static_cast<int>(area.bottom);
+    const int chartHeight = chart.live.isRunning ? height * kChartPercent / 100 : height;
+    MoveWindow(chart.graph, kEdge, 0, width, chartHeight, TRUE);
+    const int liveTop = chartHeight + kEdge;
+    MoveWindow(chart.liveGraph, kEdge, liveTop, width, std::max(0, height - liveTop), TRUE);
+    PlaceLegend(chart);
+    ApplyCategories(workbook);
+    DrawChart(workbook);
+}
+
+bool IsLegendShown(const Workbook& workbook) {
+    const HWND legend = LegendOf(workbook.chart);
+    return legend && (GetWindowLongPtrW(legend, GWL_STYLE) & WS_VISIBLE);
+}
+
+// The chart makes its legend once; afterwards it is an ordinary window.
+void ToggleLegend(Workbook& workbook) {
+    const Chart& chart = workbook.chart;
+    const HWND legend = LegendOf(chart);
+    if (legend) {
+        ShowWindow(legend, IsLegendShown(workbook) ? SW_HIDE : SW_SHOW);
+        return;
+    }
+    const RECT place = LegendPlace(chart);
+    KorGraph_ShowLegend(chart.graph, &place);
+}
+
+void KeepTooltipsInPane(const Workbook& workbook) {
+    const HWND pane = workbook.chart.pane;
+    // Each chart has one, with the same id.
+    for (HWND child = GetWindow(pane, GW_CHILD); child; child = GetWindow(child, GW_HWNDNEXT)) {
+        if (GetDlgCtrlID(child) == KORTOOLTIP_ID && IsWindowVisible(child)) KeepInPane(pane, child);
+    }
+}
+
+}  // namespace workbook

@@ -1,0 +1,39 @@
+// Brings data of the sheet into the chart.
+#pragma once
+
+#include <windows.h>
+
+#include "chart.h"
+#include "model/address.h"
+
+namespace workbook {
+
+struct Workbook;
+
+// Charts a block, with titles of the sheet and automatic ranges.
+void ChartBlockOf(Workbook& workbook, const Block& selection);
+
+// The same after another document was opened.
+void ChartNewDocument(Workbook& workbook);
+
+// After edits: changes values in place where it can, or hands over everything anew. To be called
+// when no message waits.
+void RefreshChart(Workbook& workbook);
+
+// Hands over titles and range, and as many of the categories as have room with the chart's size,
+// type and zoom.
+void ApplyCategories(const Workbook& workbook);
+void ApplyTitles(const Workbook& workbook);
+void ApplyRange(const Workbook& workbook);
+
+// As the chart shows them now.
+ChartTitles ShownTitles(const Workbook& workbook);
+ValueRange ShownRange(const Workbook& workbook);
+
+// Draws the chart and lets the screen show it: the chart only draws its image.
+void DrawChart(const Workbook& workbook);
+
+// Which axis has the values: in a bar chart x, otherwise y.
+LONG ValueAxis(const Workbook& workbook);
+
+}  // namespace workbook
