@@ -154,7 +154,7 @@ protected:
         chart.setXTitle(L"x");
         chart.setYTitle(L"y");
         std::vector<double> values(900);
-        for (size_t i = 0; i < values.size(); ++i) values[i] = std::sin(i * 0.3) * (i % 17);
+        for (unsigned i = 0; i < values.size(); ++i) values[i] = std::sin(i * 0.3) * (i % 17);
         chart.addSeries(values);
         chart.addSeries({3, 1, 4, 1, 5});
     }

@@ -90,7 +90,7 @@ TEST_F(GraphLine, EndsAsAPlainPolylineDoes) {
     for (const double last : {0.0, 100.0, -100.0, 37.0}) {
         chart.reset();
         std::vector<double> values(4000);
-        for (size_t i = 0; i < values.size(); ++i) values[i] = i % 3 ? 100.0 : -100.0 + i % 7;
+        for (unsigned i = 0; i < values.size(); ++i) values[i] = i % 3 ? 100.0 : -100.0 + i % 7;
         values.back() = last;
         chart.addSeries(values);
         chart.setRange(KORGRAPH_X, 0, 3900);
@@ -112,7 +112,7 @@ TEST_F(GraphLine, MarkersReachIntoThePlotFromOutsideIt) {
     for (const int count : {5, 1400}) {
         chart.reset();
         std::vector<double> values(static_cast<size_t>(count));
-        for (size_t i = 0; i < values.size(); ++i) values[i] = static_cast<double>(i % 5);
+        for (unsigned i = 0; i < values.size(); ++i) values[i] = static_cast<double>(i % 5);
         chart.addSeries(values);
         for (int i = -12; i <= 12; ++i) {
             chart.setRange(KORGRAPH_X, 1 + i * 0.004 * count, count + i * 0.004 * count);
@@ -294,7 +294,7 @@ TEST_F(GraphSeriesShapes, AnotherTypeDrawsNothing) {
 
 TEST_F(GraphSeriesShapes, OfWindowsSmallerThanTheirMarginsAreThoseOfPlainCalls) {
     std::vector<double> values(300);
-    for (size_t i = 0; i < values.size(); ++i) values[i] = static_cast<double>(i * 7 % 23) - 9;
+    for (unsigned i = 0; i < values.size(); ++i) values[i] = static_cast<double>(i * 7 % 23) - 9;
     chart.addSeries(values);
     for (int type = KORGRAPH_LINE; type <= KORGRAPH_COLUMN; ++type) {
         chart.setType(type);
@@ -342,7 +342,7 @@ TEST_F(GraphOddValues, AmongThousandsAreLeftOut) {
         chart.reset();
         chart.setType(type);
         std::vector<double> values(3000);
-        for (size_t i = 0; i < values.size(); ++i) values[i] = std::sin(i * 0.7) * (i % 13);
+        for (unsigned i = 0; i < values.size(); ++i) values[i] = std::sin(i * 0.7) * (i % 13);
         chart.addSeries(values);
         chart.setRange(type == KORGRAPH_BAR ? KORGRAPH_X : KORGRAPH_Y, -10, 10);
         for (size_t i = 0; i < values.size(); i += 1 + i % 5) {
