@@ -106,9 +106,9 @@ INSTANTIATE_TEST_SUITE_P(Imports, GraphFaults,
                                            "GetDC", "CreateCompatibleDC", "CreateCompatibleBitmap",
                                            "CreateFontIndirectW", "CreateSolidBrush",
                                            "CreateRectRgn", "SelectObject", "DrawTextW",
-                                           "GetTextExtentPoint32W", "BeginPaint", "GetClientRect",
-                                           "GetWindowRect", "LoadStringW", "GetDeviceCaps",
-                                           "SetScrollInfo", "SetWindowPos", "GetStockObject"),
+                                           "BeginPaint", "GetClientRect", "GetWindowRect",
+                                           "LoadStringW", "GetDeviceCaps", "SetScrollInfo",
+                                           "SetWindowPos", "GetStockObject"),
                          NameOf);
 
 }  // namespace
