@@ -382,7 +382,7 @@ TEST_F(GraphOddValues, HugeOnesBesideSmallRangesReachTheEdges) {
 // values of this test minutes.
 TEST_F(GraphOddValues, FarBeyondTheViewDoNotReachThePlatformsPolygon) {
     std::vector<double> values(1000);
-    for (size_t i = 0; i < values.size(); ++i) values[i] = (i % 2 ? -1.0 : 1.0) * (i % 7);
+    for (unsigned i = 0; i < values.size(); ++i) values[i] = (i % 2 ? -1.0 : 1.0) * (i % 7);
     ImportSpy spy;
     LONG farthest = 0;
     int polygons = 0;
