@@ -27,5 +27,5 @@ macro(windows_ce_gnu language)
   set(CMAKE_${language}_ARCHIVE_FINISH "<CMAKE_RANLIB> -D <TARGET>")
   # Only the loader of later systems reads the two flags that are switched off.
   set(CMAKE_${language}_CREATE_SHARED_LIBRARY
-    "<CMAKE_LINKER> -shared --subsystem wince:3.0 --major-os-version 3 --minor-os-version 0 --disable-dynamicbase --disable-nxcompat --image-base 0x10000000 <LINK_FLAGS> -o <TARGET> --out-implib <TARGET_IMPLIB> <OBJECTS> <LINK_LIBRARIES>")
+    "<CMAKE_LINKER> -shared --subsystem wince:3.0 --major-os-version 3 --minor-os-version 0 --disable-dynamicbase --disable-nxcompat --image-base 0x10000000 <LINK_FLAGS> -o <TARGET> <OBJECTS> <LINK_LIBRARIES>")
 endmacro()

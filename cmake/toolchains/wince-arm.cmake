@@ -36,7 +36,7 @@ string(JOIN " " _machine
   -march=armv4 -marm -mno-thumb-interwork -mabi=apcs-gnu -mfloat-abi=soft
   -fshort-wchar -fsigned-char -fno-short-enums
   -fno-unwind-tables -fno-asynchronous-unwind-tables -fno-stack-protector
-  -B${KOR_WINCE}/bin -Wa,--coff-assembler=${KOR_DEVICE_TOOLS}/as)
+  "\"-B${KOR_WINCE}/bin\"" "\"-Wa,--coff-assembler=${KOR_DEVICE_TOOLS}/as\"")
 
 # Headers: the desktop's, with its calling-convention words empty, since here there is one convention.
 # Versions are those of Windows CE 3.0's time, so that no record has members that it does not know.
@@ -44,19 +44,19 @@ execute_process(COMMAND i686-w64-mingw32-g++-posix -print-file-name=include
   OUTPUT_VARIABLE _desktop OUTPUT_STRIP_TRAILING_WHITESPACE COMMAND_ERROR_IS_FATAL ANY)
 execute_process(COMMAND arm-none-eabi-gcc -print-file-name=include
   OUTPUT_VARIABLE _compiler OUTPUT_STRIP_TRAILING_WHITESPACE COMMAND_ERROR_IS_FATAL ANY)
-set(_platform -isystem ${KOR_WINCE}/include -isystem /usr/share/mingw-w64/include)
 string(JOIN " " _definitions
   -D_WIN32 -D_WIN32_WCE=300 -D_ARM_ -DARM -D__MSVCRT__ -D__USE_MINGW_ANSI_STDIO=0
   -DWINVER=0x0400 -D_WIN32_WINNT=0x0400 -D_WIN32_IE=0x0400
   -D__cdecl= -D_cdecl= -D__stdcall= -D_stdcall= -D__fastcall= -D__thiscall=
   "\"-D__int64=long long\"" "\"-D__declspec(what)=\"")
 string(JOIN " " _headers -nostdinc
-  -isystem ${_desktop}/c++ -isystem ${_desktop}/c++/i686-w64-mingw32 ${_platform}
-  -isystem ${_compiler} -include ${KOR_WINCE}/include/device_types.h)
+  -isystem ${_desktop}/c++ -isystem ${_desktop}/c++/i686-w64-mingw32
+  -isystem "\"${KOR_WINCE}/include\"" -isystem /usr/share/mingw-w64/include
+  -isystem ${_compiler} -include "\"${KOR_WINCE}/include/device_types.h\"")
 
 set(CMAKE_C_FLAGS_INIT "${_machine} ${_definitions} ${_headers}")
 set(CMAKE_CXX_FLAGS_INIT "${_machine} -fno-exceptions -fno-rtti -fno-sized-deallocation ${_definitions} ${_headers}")
 string(JOIN " " CMAKE_RC_FLAGS_INIT
   --codepage=65001 --preprocessor=arm-none-eabi-cpp
   --preprocessor-arg=-nostdinc --preprocessor-arg=-DRC_INVOKED --preprocessor-arg=-D_WIN32
-  --preprocessor-arg=-D_ARM_ -I${KOR_WINCE}/include -I/usr/share/mingw-w64/include -I${_compiler})
+  --preprocessor-arg=-D_ARM_ -I/usr/share/mingw-w64/include -I${_compiler})

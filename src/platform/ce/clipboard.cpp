@@ -1,4 +1,5 @@
-// The clipboard of Windows CE takes blocks of the local heap, and drawing is done when a call returns.
+// The clipboard of Windows CE takes blocks of the local heap, and drawing is done when a call
+// returns.
 #include "platform/clipboard.h"
 
 namespace kor {

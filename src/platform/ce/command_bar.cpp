@@ -13,7 +13,8 @@ HWND CommandBar_InsertComboBox(HWND bar, HINSTANCE instance, int width, UINT sty
                                WORD position);
 }
 
-constexpr UINT kSetToolTips = WM_USER + 81;  // TB_SETTOOLTIPS, also what CommandBar_AddToolTips sends
+constexpr UINT kSetToolTips =
+    WM_USER + 81;  // TB_SETTOOLTIPS, also what CommandBar_AddToolTips sends
 
 }  // namespace
 

@@ -1,5 +1,6 @@
 // Numbers as text by the core library. Its swprintf takes no capacity, unlike the one that the
-// headers declare, and its wcstod has a replacement there; so both are declared here by their names.
+// headers declare, and its wcstod has a replacement there; so both are declared here by their
+// names.
 #include "platform/number_text.h"
 
 namespace kor {
