@@ -208,6 +208,7 @@ def test_pie(paper):
 def test_titles_have_ten_points_at_the_printers_resolution(paper, chart_type):
     left, top, right, bottom = ink(paper("full", chart_type), (300, 0, 1950, 44))
     assert 25 <= bottom - top <= 41, "10 points are 41 pixels, most of which a capital has"
+    assert bottom <= 42, "whole above the frame"
     assert abs((left + right) / 2 - WIDTH / 2) < 15, "centred on the page"
     assert right - left > 300
 
