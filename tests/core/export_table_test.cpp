@@ -55,7 +55,8 @@ TEST(ExportTable, HasUndecoratedNamesAndFixedOrdinals) {
 
 TEST(ImportTable, NamesThePlatformsLibrariesOnly) {
     EXPECT_EQ(ImportedLibraries(LibraryModule()),
-              (std::set<std::string>{"gdi32.dll", "kernel32.dll", "msvcrt.dll", "user32.dll"}));
+              (std::set<std::string>{"comctl32.dll", "gdi32.dll", "kernel32.dll", "msvcrt.dll",
+                                     "user32.dll"}));
 }
 
 }  // namespace
