@@ -1,8 +1,18 @@
 /* What the public headers promise, checked by a C compiler: sizes, offsets and numbers, and that
  * the headers can be included twice and in any order.                                           */
+#include <korcontrols/listhelpers.h>
 #include <korcontrols/header.h>
+#include <korcontrols/tooltip.h>
+#include <korcontrols/graph.h>
+#include <korcontrols/legend.h>
+#include <korcontrols/funkybar.h>
 #include <korcontrols/grid.h>
 #include <korcontrols/korcontrols.h>
+#include <korcontrols/funkybar.h>
+#include <korcontrols/graph.h>
+#include <korcontrols/legend.h>
+#include <korcontrols/listhelpers.h>
+#include <korcontrols/tooltip.h>
 #include <korcontrols/grid.h>
 #include <korcontrols/header.h>
 
@@ -52,6 +62,43 @@ CHECK(cells, KORGRID_CELL(0x1234, 0x5678) == 0x56781234 &&
                  KORGRID_PAIR(0x1234, 0xFFFF) == 0xFFFF1234);
 CHECK(cells_cut, KORGRID_CELL(-1, 0) == 0xFFFF && KORGRID_CELL(0x10001, 0x20002) == 0x00020001);
 CHECK(sheet, KORGRID_COLUMNS == 256 && KORGRID_ROWS == 16384);
+
+/* Members of 4 bytes each, of which pointers and handles widen. */
+#define BITS(of32, of64) (sizeof(void *) == 4 ? (of32) : (of64))
+
+CHECK(bar_item, sizeof(FunkyBarItemDesc) == BITS(32, 40));
+CHECK(bar_item_mask, offsetof(FunkyBarItemDesc, mask) == 0);
+CHECK(bar_item_index, offsetof(FunkyBarItemDesc, index) == 4);
+CHECK(bar_item_text, offsetof(FunkyBarItemDesc, text) == 8);
+CHECK(bar_item_capacity, offsetof(FunkyBarItemDesc, textCapacity) == BITS(12, 16));
+CHECK(bar_item_image, offsetof(FunkyBarItemDesc, image) == BITS(16, 20));
+CHECK(bar_item_colour, offsetof(FunkyBarItemDesc, textColour) == BITS(20, 24));
+CHECK(bar_item_background, offsetof(FunkyBarItemDesc, backgroundColour) == BITS(24, 28));
+CHECK(bar_item_data, offsetof(FunkyBarItemDesc, userData) == BITS(28, 32));
+
+CHECK(bar_notification, sizeof(FunkyBarNotification) == BITS(16, 32));
+CHECK(bar_notification_index, offsetof(FunkyBarNotification, index) == BITS(12, 24));
+
+CHECK(bar_bits, FBIF_TEXT == 1 && FBIF_IMAGE == 2 && FBIF_COLOURS == 4 && FBIF_USERDATA == 8);
+CHECK(bar_messages, FBM_INSERTITEM == 7074 && FBM_GETITEM == 7075 && FBM_SETIMAGELIST == 7076 &&
+                        FBM_GETIMAGELIST == 7077 && FBM_DELETEITEM == 7078 &&
+                        FBM_DELETEALL == 7079 && FBM_GETCOUNT == 7080 && FBM_SETCURSEL == 7081 &&
+                        FBM_GETCURSEL == 7082);
+CHECK(bar_notification_code, FBN_SELECTED == 256);
+
+CHECK(series, sizeof(GraphSeriesData) == BITS(16, 32));
+CHECK(series_name, offsetof(GraphSeriesData, name) == BITS(4, 8));
+CHECK(series_values, offsetof(GraphSeriesData, values) == BITS(8, 16));
+CHECK(series_index, offsetof(GraphSeriesData, seriesIndex) == BITS(12, 24));
+CHECK(value, sizeof(GraphValue) == 16 && offsetof(GraphValue, value) == 8);
+CHECK(graph_range, sizeof(GraphRange) == 24 && offsetof(GraphRange, min) == 8 &&
+                       offsetof(GraphRange, max) == 16);
+CHECK(tip_request, sizeof(ToolTipRequest) == BITS(16, 24));
+CHECK(tip_request_x, offsetof(ToolTipRequest, x) == BITS(4, 8));
+CHECK(tip_request_limit, offsetof(ToolTipRequest, limit) == BITS(12, 16));
+CHECK(graph_messages, GM_ADDSERIES == 7024 && GM_GETRANGE == 7053 && GN_RESET == 7040 &&
+                          GN_CLEAR == 7047 && TIPM_SHOW == 6024 && TIPM_HIDE == 6025);
+CHECK(child_ids, KORLEGEND_ID == 30 && KORTOOLTIP_ID == 10);
 
 /* Also keeps the linker from finding that this file holds nothing. */
 DWORD sizesSeenByC(void);

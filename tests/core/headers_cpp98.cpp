@@ -1,7 +1,12 @@
 // The public headers in C++ of the oldest standard.
+#include <korcontrols/funkybar.h>
+#include <korcontrols/graph.h>
 #include <korcontrols/grid.h>
 #include <korcontrols/header.h>
 #include <korcontrols/korcontrols.h>
+#include <korcontrols/legend.h>
+#include <korcontrols/listhelpers.h>
+#include <korcontrols/tooltip.h>
 
 DWORD sizesSeenByOldCpp();
 
