@@ -3,9 +3,7 @@
 import pytest
 
 from desktop import wait_until
-from viewer_app import CHART, GRID, TITLE, TYPE, X_MAX, X_MIN, ZOOM, Viewer
-
-GREEN = (0, 255, 0)
+from viewer_app import CHART, GREEN, GRID, TITLE, TYPE, X_MAX, X_MIN, ZOOM, Viewer
 
 
 @pytest.fixture
@@ -50,20 +48,20 @@ def test_the_type_combo_changes_the_chart(viewer):
 
 
 def test_the_zoom_combo_changes_the_chart(viewer):
-    before = viewer.picture_of_chart()
+    before = viewer.picture_of_lower_half()
     viewer.choose(ZOOM, "Down")
     wait_until(lambda: viewer.combo(ZOOM).text == "200%", "the combo box shows the choice")
-    wait_until(lambda: viewer.picture_of_chart() != before, "the chart is drawn anew")
+    wait_until(lambda: viewer.picture_of_lower_half() != before, "the chart is drawn anew")
 
 
 def test_pages_change_title_and_range(viewer):
-    before = viewer.picture_of_chart()
+    before = viewer.picture_of_lower_half()
     viewer.open_sheet()
     viewer.type_into(TITLE, "More of it")
     viewer.show_data_page()
     viewer.type_into(X_MAX, "4")
     viewer.press_ok()
-    wait_until(lambda: viewer.picture_of_chart() != before, "the chart is drawn anew")
+    wait_until(lambda: viewer.picture_of_lower_half() != before, "the chart is drawn anew")
     sheet = viewer.open_sheet()
     assert sheet.find("Edit", id=TITLE).text == "More of it"
     viewer.show_data_page()

@@ -6,6 +6,7 @@ CHART, GRID = "KORVANE Corporation GraphControl", "KV Grid Control"
 BAR, COMBO, TOOLTIP = "ToolbarWindow32", "ComboBox", "tooltips_class32"
 ZOOM, TYPE = 103, 104
 SHEET = "Graph Properties"
+GREEN = (0, 255, 0)  # the first series
 TITLE, X_MIN, X_MAX = 1002, 1007, 1008
 
 
@@ -18,6 +19,7 @@ class Viewer:
 
     def __enter__(self):
         wait_until(lambda: self.main() and self.main().find(CHART), "the viewer shows its chart")
+        wait_until(lambda: GREEN in self.picture_of_chart().colours(), "the chart is painted")
         return self
 
     def __exit__(self, *_):
@@ -80,3 +82,8 @@ class Viewer:
 
     def picture_of_chart(self):
         return self.desktop.picture().crop(self.main().find(CHART).rect)
+
+    def picture_of_lower_half(self):
+        """Of the chart: where no open list of a combo box reaches."""
+        left, top, right, bottom = self.main().find(CHART).rect
+        return self.desktop.picture().crop((left, (top + bottom) // 2, right, bottom))
