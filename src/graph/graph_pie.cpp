@@ -11,7 +11,6 @@
 #include "graph/graph_series.h"
 #include "platform/gdi_scopes.h"
 #include "platform/local_text.h"
-#include "text/text_run.h"
 
 namespace kor {
 
@@ -87,7 +86,7 @@ void DrawPercentages(const GraphRecord& graph, const GraphSeries& series, HDC dc
         wchar_t text[kDecimalCapacity + 1];
         _itow(TruncateToInt(share * 100.0 + 0.5), text, 10);
         wcscat(text, L"%");
-        TextRun(dc, text).Draw(place.box, place.alignment);
+        DrawNumberText(dc, graph.numberWidths, text, place.box, place.alignment);
     }
 }
 
