@@ -1,6 +1,9 @@
 // A column is a polygon from the zero line to its value; a bar is the same turned a quarter. Where
-// they have become so thin that several share a pixel, the lowest and the highest cover them all.
+// they have become so thin that several share a pixel, a line from the lowest end to the highest
+// has the pixels of them all.
 #include "graph/graph_bars.h"
+
+#include <algorithm>
 
 #include "graph/graph_frame.h"
 #include "graph/graph_numbers.h"
@@ -18,44 +21,53 @@ struct BarLayout {
     int lowPixel;     // the view along that axis
     int highPixel;
     int thickness;
-    void (*draw)(const GraphRecord& graph, HDC dc, int number, double value, int offset,
-                 int thickness);
+    // Pixel of a value in the bar of a point, `across` pixels beside the point's own position.
+    POINT (*place)(const GraphRecord& graph, int number, double value, int across);
+    POINT growth;  // the pixel after another as values grow
 };
 
 // Rows grow downwards, point numbers upwards: turned round they grow together.
 int RowUpwards(const GraphRecord& graph, double pointNumber) { return -yPixel(graph, pointNumber); }
 
-void DrawColumn(const GraphRecord& graph, HDC dc, int number, double value, int offset,
-                int thickness) {
-    const int base = yPixel(graph, 0);
-    const int left = xPixel(graph, number) + offset;
-    const int end = yPixel(graph, value);
+POINT PlaceInColumn(const GraphRecord& graph, int number, double value, int across) {
+    return {xPixel(graph, number) + across, yPixel(graph, value)};
+}
+
+POINT PlaceInBar(const GraphRecord& graph, int number, double value, int across) {
+    return {xPixel(graph, value), yPixel(graph, number) - across};
+}
+
+void DrawOneBar(const GraphRecord& graph, HDC dc, const BarLayout& layout, int number, double value,
+                int offset) {
+    const int past = offset + layout.thickness;
     const POINT corners[] = {
-        {left, base}, {left, end}, {left + thickness, end}, {left + thickness, base}};
+        layout.place(graph, number, 0, offset), layout.place(graph, number, value, offset),
+        layout.place(graph, number, value, past), layout.place(graph, number, 0, past)};
     Polygon(dc, corners, 4);
 }
 
-void DrawBar(const GraphRecord& graph, HDC dc, int number, double value, int offset,
-             int thickness) {
-    const int base = xPixel(graph, 0);
-    const int top = yPixel(graph, number) - offset;
-    const int end = xPixel(graph, value);
-    const POINT corners[] = {
-        {base, top}, {end, top}, {end, top - thickness}, {base, top - thickness}};
-    Polygon(dc, corners, 4);
+// The bars of the points [number, end), which share a position and have no thickness.
+void DrawThinBarsTogether(const GraphRecord& graph, HDC dc, const GraphSeries& series,
+                          const BarLayout& layout, int number, int end, int offset) {
+    const PositionSummary found = Summarise(series.values, number, end);
+    if (found.first < 0) return;
+    const double least = series.values[found.lowest];
+    const double most = series.values[found.highest];
+    const POINT low = layout.place(graph, number, std::min(least, 0.0), offset);
+    const POINT high = layout.place(graph, number, std::max(most, 0.0), offset);
+    if (low.x == high.x && low.y == high.y) {  // a point; the platform says what that looks like
+        DrawOneBar(graph, dc, layout, number, most, offset);
+        return;
+    }
+    const POINT ends[] = {low, {high.x + layout.growth.x, high.y + layout.growth.y}};
+    Polyline(dc, ends, 2);  // leaves its last pixel out
 }
 
 void DrawThinBars(const GraphRecord& graph, HDC dc, const GraphSeries& series,
                   const BarLayout& layout, PointRange range, int offset) {
     for (int number = range.first; number <= range.last;) {
         const int end = EndOfPosition(graph, layout.along, range, number);
-        const PositionSummary found = Summarise(series.values, number, end);
-        if (found.first >= 0) {
-            layout.draw(graph, dc, number, series.values[found.lowest], offset, 0);
-            if (found.highest != found.lowest) {
-                layout.draw(graph, dc, number, series.values[found.highest], offset, 0);
-            }
-        }
+        DrawThinBarsTogether(graph, dc, series, layout, number, end, offset);
         number = end;
     }
 }
@@ -64,7 +76,7 @@ void DrawThickBars(const GraphRecord& graph, HDC dc, const GraphSeries& series,
                    const BarLayout& layout, PointRange range, int offset) {
     for (int number = range.first; number <= range.last; ++number) {
         const double value = series.values[number - 1];
-        if (IsFinite(value)) layout.draw(graph, dc, number, value, offset, layout.thickness);
+        if (IsFinite(value)) DrawOneBar(graph, dc, layout, number, value, offset);
     }
 }
 
@@ -99,18 +111,16 @@ void DrawBars(const GraphRecord& graph, HDC dc, const BarLayout& layout) {
 void DrawColumnChart(GraphRecord& graph, HDC dc) {
     DrawInFrame(graph, dc, [&] {
         const RECT view = PlotClip(graph);
-        DrawBars(
-            graph, dc,
-            {xPixel, view.left, view.right, ZoomedThickness(graph, graph.barWidth), DrawColumn});
+        const int thickness = ZoomedThickness(graph, graph.barWidth);
+        DrawBars(graph, dc, {xPixel, view.left, view.right, thickness, PlaceInColumn, {0, -1}});
     });
 }
 
 void DrawBarChart(GraphRecord& graph, HDC dc) {
     DrawInFrame(graph, dc, [&] {
         const RECT view = PlotClip(graph);
-        DrawBars(graph, dc,
-                 {RowUpwards, -view.bottom, -view.top, ZoomedThickness(graph, graph.barHeight),
-                  DrawBar});
+        const int thickness = ZoomedThickness(graph, graph.barHeight);
+        DrawBars(graph, dc, {RowUpwards, -view.bottom, -view.top, thickness, PlaceInBar, {1, 0}});
     });
 }
 
