@@ -91,7 +91,8 @@ void SeriesPoints::AppendPosition(const GraphRecord& graph, const GraphSeries& s
     if (found.first < 0) return;
     const int column = xPixel(graph, number);
     int order[] = {found.first, found.lowest, found.highest, found.last};
-    if (order[1] > order[2]) std::swap(order[1], order[2]);
+    // All ways over both extremes have the same pixels; this is the shorter one.
+    if (series.values[found.first] > series.values[found.last]) std::swap(order[1], order[2]);
     int previous = -1;
     for (const int index : order) {
         if (index != previous) Append(graph, series, column, index);
