@@ -2,6 +2,7 @@
 
 #include <korcontrols/graph.h>
 
+#include <algorithm>
 #include <cmath>
 
 #include "graph/graph_disc.h"
@@ -137,6 +138,26 @@ void RotateVector(double& dx, double& dy, double degrees) {
     dx = turnedX;
 }
 
+namespace {
+
+// Rows from the centre's that hold pixels of a slice, and some more: from the centre to its arc.
+struct RowRange {
+    int first;
+    int last;
+};
+
+RowRange RowsOfSlice(int radius, double startDegrees, double endDegrees) {
+    constexpr int kSpare = 2;
+    const int start = RadiusEnd(radius, startDegrees).y;
+    const int end = RadiusEnd(radius, endDegrees).y;
+    const bool reachesBottom = startDegrees <= 180.0 && endDegrees >= 180.0;
+    const int lowest = reachesBottom ? radius : std::max({start, end, 0});
+    return {std::max(std::min({start, end, 0}) - kSpare, -radius),
+            std::min(lowest + kSpare, radius)};
+}
+
+}  // namespace
+
 void FillPieSlice(HDC dc, int centreX, int centreY, int radius, double startDegrees,
                   double endDegrees) {
     if (radius < 1 || !(endDegrees > startDegrees)) return;
@@ -145,7 +166,8 @@ void FillPieSlice(HDC dc, int centreX, int centreY, int radius, double startDegr
     WalkCircle(radius, halfWidths);
     const SliceEdge start = MakeSliceEdge(startDegrees);
     const SliceEdge end = MakeSliceEdge(endDegrees);
-    for (int dy = -radius; dy <= radius; ++dy) {
+    const RowRange rows = RowsOfSlice(radius, startDegrees, endDegrees);
+    for (int dy = rows.first; dy <= rows.last; ++dy) {
         const SliceRow row = SliceOnRow(start, end, dy, halfWidths[dy < 0 ? -dy : dy]);
         for (const DiscRun& run : row.runs) {
             if (run.to <= run.from) continue;
