@@ -1,251 +1,83 @@
-// What drawing a chart costs: each redraw as a ratio to the floor, which is the same picture drawn
-// literally with bare GDI calls into a memory DC and copied to the window once; what the data cost;
-// and how the time grows with the points.
+// What the chart costs: each redraw as a ratio to its floor, adding a series as a ratio to one pass
+// over its values, and the memory that a point takes, each beside the bar that it has to keep.
 //
-//   graph_benchmark            tables, and CSV lines "type,points,ms" for a curve
+//   graph_benchmark            the tables
 //   graph_benchmark --check    the same; status 0 only when every figure keeps its bar
 //   graph_benchmark --quick    without the floors of a million points, which take seconds each
-#include <korcontrols/graph.h>
+//   graph_benchmark --curve    microseconds by points, comma-separated, and nothing else
+#include "chart_curve.h"
+#include "interleaved.h"
+#include "measured_chart.h"
 
+#include <algorithm>
 #include <cmath>
 #include <cstdio>
-#include <cstdlib>
 #include <cstring>
-#include <memory>
-
-#include "graph/pictures/literal_chart.h"
-#include "interleaved.h"
 
 namespace {
 
-using kortest::ChartFonts;
-using kortest::ChartState;
-
-constexpr int kWidth = 320;
-constexpr int kHeight = 240;
-constexpr int kSmallRounds = 120;
-const char* const kTypeNames[] = {"line", "area", "bar", "column", "pie"};
-
-HWND host;
-bool allHold = true;
-
+using bench::MeasuredChart;
 using Values = std::vector<double>;
 
-Values Noise(int count, unsigned seed) {
-    Values values(static_cast<size_t>(count));
-    for (double& value : values) {
-        seed = seed * 1664525u + 1013904223u;
-        value = (seed >> 8) / 16777216.0 * 100 - 20;
-    }
-    return values;
-}
+const char* const kTypeNames[] = {"line", "area", "bar", "column", "pie"};
 
-LRESULT CALLBACK HostProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
-    return DefWindowProcW(hwnd, message, wParam, lParam);
-}
-
-void CreateHost() {
-    WNDCLASSW windowClass = {};
-    windowClass.lpfnWndProc = HostProc;
-    windowClass.hInstance = GetModuleHandleW(nullptr);
-    windowClass.lpszClassName = L"Graph benchmark";
-    RegisterClassW(&windowClass);
-    RegisterGraphControl(windowClass.hInstance);
-    host = CreateWindowW(windowClass.lpszClassName, L"", WS_POPUP | WS_VISIBLE, 0, 0, kWidth,
-                         kHeight, nullptr, nullptr, windowClass.hInstance, nullptr);
-}
-
-HWND CreateChart() {
-    return CreateWindowW(KORGRAPH_CLASS, L"", WS_CHILD | WS_VISIBLE, 0, 0, kWidth, kHeight, host,
-                         nullptr, GetModuleHandleW(nullptr), nullptr);
-}
-
-void AddSeries(HWND chart, const Values& values) {
-    const GraphSeriesData data = {static_cast<LONG>(values.size()), nullptr, values.data(), 0};
-    KorGraph_AddSeries(chart, &data);
-}
-
-HDC CreateImage() {
-    HDC window = GetDC(host);
-    HDC dc = CreateCompatibleDC(window);
-    SelectObject(dc, CreateCompatibleBitmap(window, kWidth, kHeight));
-    ReleaseDC(host, window);
-    SetBkMode(dc, TRANSPARENT);
-    return dc;
-}
-
-void CopyToWindow(HWND chart, HDC dc) {
-    HDC window = GetDC(chart);
-    BitBlt(window, 0, 0, kWidth, kHeight, dc, 0, 0, SRCCOPY);
-    ReleaseDC(chart, window);
-}
-
-// The spans of a pie's slices, found beforehand, so that its floor only draws.
-struct SliceSpans {
-    COLORREF colour;
-    std::vector<POINT> ends;  // two per span
-};
-
-// A chart beside its floor.
-class Pair {
-public:
-    Pair(int type, int seriesCount, int points)
-        : chart_(CreateChart()), dc_(CreateImage()), fonts_(dc_), state_(fonts_) {
-        state_.resize(kWidth, kHeight);
-        KorGraph_SetType(chart_, type);
-        state_.setType(type);
-        for (int i = 0; i < seriesCount; ++i) {
-            const Values values = Noise(points, static_cast<unsigned>(i + 1));
-            AddSeries(chart_, values);
-            state_.addSeries(values);
-        }
-        if (type == KORGRAPH_PIE) FindSpans();
-    }
-    ~Pair() { DestroyWindow(chart_); }
-    Pair(const Pair&) = delete;
-    Pair& operator=(const Pair&) = delete;
-
-    void Redraw() {
-        KorGraph_Redraw(chart_);
-        UpdateWindow(chart_);
-    }
-
-    void Floor() {
-        if (state_.type == KORGRAPH_PIE) {
-            DrawPieFloor();
-        } else {
-            DrawLiteral(state_, fonts_, dc_);
-        }
-        CopyToWindow(chart_, dc_);
-    }
-
-private:
-    void FindSpans();
-    void DrawPieFloor();
-    void DrawPercentage(POINT centre, int radius, double middle, double share);
-
-    HWND chart_;
-    HDC dc_;
-    ChartFonts fonts_;
-    ChartState state_;
-    std::vector<SliceSpans> slices_;
-};
-
-void Pair::FindSpans() {
-    const kortest::LiteralPie pie = PlacePie(state_);
-    double end = 0;
-    for (const double value : state_.series[0].values) {
-        const double start = end;
-        end += std::fabs(value) / state_.absSum() * 360;
-        SliceSpans spans = {kortest::PaletteColour(2 + static_cast<int>(slices_.size() % 15)), {}};
-        for (int dy = -pie.radius; dy <= pie.radius; ++dy) {
-            const int half = static_cast<int>(std::sqrt(pie.radius * pie.radius - dy * dy));
-            bool inside = false;
-            for (int dx = -half; dx <= half; ++dx) {
-                const double angle = kortest::AngleOf(dx, dy);
-                const bool now = dx < half && start <= angle && angle < end;
-                if (now != inside) spans.ends.push_back({pie.centre.x + dx, pie.centre.y + dy});
-                inside = now;
-            }
-        }
-        slices_.push_back(spans);
-    }
-}
-
-void Pair::DrawPercentage(POINT centre, int radius, double middle, double share) {
-    const double angle = middle * 0.017453292519943295;
-    const POINT at = {centre.x - static_cast<int>(radius * std::sin(angle)),
-                      centre.y - static_cast<int>(radius * std::cos(angle))};
-    const bool left = at.x < centre.x;
-    const bool above = at.y < centre.y;
-    RECT box = {left ? at.x - state_.tipWidth : at.x, above ? at.y - state_.tipHeight : at.y, 0, 0};
-    box.right = box.left + state_.tipWidth;
-    box.bottom = box.top + state_.tipHeight;
-    wchar_t text[16];
-    wsprintfW(text, L"%d%%", static_cast<int>(share * 100 + 0.5));
-    DrawTextW(dc_, text, -1, &box, left ? DT_RIGHT : DT_LEFT);
-}
-
-void Pair::DrawPieFloor() {
-    const kortest::LiteralPie pie = PlacePie(state_);
-    kortest::FillLiteral(dc_, state_.surface, state_.background);
-    const double sum = state_.absSum();
-    const auto radius = [&](double degrees) {
-        const double angle = degrees * 0.017453292519943295;
-        const POINT ends[] = {pie.centre,
-                              {pie.centre.x - static_cast<int>(pie.radius * std::sin(angle)),
-                               pie.centre.y - static_cast<int>(pie.radius * std::cos(angle))}};
-        Polyline(dc_, ends, 2);
-    };
-    double end = 0;
-    for (size_t k = 0; k < slices_.size(); ++k) {
-        const double start = end;
-        end += std::fabs(state_.series[0].values[k]) / sum * 360;
-        {
-            kortest::Drawn pen(dc_, CreatePen(PS_SOLID, 1, slices_[k].colour));
-            for (size_t i = 0; i + 1 < slices_[k].ends.size(); i += 2) {
-                Polyline(dc_, &slices_[k].ends[i], 2);
-            }
-        }
-        radius(start);
-        radius(end);
-    }
-    HGDIOBJ brush = SelectObject(dc_, GetStockObject(NULL_BRUSH));
-    Ellipse(dc_, pie.box.left, pie.box.top, pie.box.right, pie.box.bottom);
-    SelectObject(dc_, brush);
-    HGDIOBJ font = SelectObject(dc_, fonts_.upright());
-    end = 0;
-    for (const double value : state_.series[0].values) {
-        const double share = std::fabs(value) / sum;
-        DrawPercentage({kWidth / 2, kHeight / 2}, pie.radius + 4, end + share * 180, share);
-        end += share * 360;
-    }
-    SelectObject(dc_, font);
-}
+bool allHold = true;
 
 void PrintHeading(const char* title) {
-    std::printf("\n%s\n%-30s %12s %12s %9s %7s\n", title, "", "floor us", "us", "x floor", "bar");
+    std::printf("\n%-32s %12s %12s %9s %7s\n", title, "floor us", "us", "x floor", "bar");
 }
 
-void Print(const std::string& name, double floor, double taken, double bar) {
-    const double ratio = taken / floor;
-    const bool holds = ratio <= bar;
+void Note(bool holds, const char* complaint) {
     allHold = allHold && holds;
-    std::printf("%-30s %12.0f %12.0f %9.4f %7.2f %s\n", name.c_str(), floor, taken, ratio, bar,
-                holds ? "" : "MISSED");
+    std::printf("%s\n", holds ? "" : complaint);
     std::fflush(stdout);
 }
 
-double FastestTime(int rounds, const std::function<void()>& run) {
-    std::vector<bench::Way> ways = {{"", run}};
-    bench::TimeInTurns(ways, rounds, 0);
-    return ways[0].fastest;
+// Other work on the machine only ever adds to a run: the fastest of each are compared.
+void PrintRatio(const std::string& name, const bench::Way& floor, const bench::Way& way,
+                double bar) {
+    const double ratio = way.fastest / floor.fastest;
+    std::printf("%-32s %12.0f %12.0f %9.4f %7.2f ", name.c_str(), floor.fastest, way.fastest, ratio,
+                bar);
+    Note(ratio <= bar, "MISSED");
 }
 
-void MeasureSmall() {
+double Ratio(const std::vector<bench::Way>& ways) { return ways[1].fastest / ways[0].fastest; }
+
+void MeasureRedraw(int type, int series, int points, int rounds, int batches, double bar) {
+    const MeasuredChart chart(type, series, points);
+    std::vector<bench::Way> ways = {{"floor", [&] { chart.DrawFloor(); }},
+                                    {"redraw", [&] { chart.RedrawChart(); }}};
+    bench::TimeInBatches(ways, rounds, batches, [&] { return Ratio(ways) <= bar; });
+    const std::string name = std::string(kTypeNames[type]) + " of " + std::to_string(series) +
+                             " x " + std::to_string(points);
+    PrintRatio(name, ways[0], ways[1], bar);
+    if (!chart.ShowsTheSame()) {
+        std::printf("%-32s ", name.c_str());
+        Note(false, "the floor is ANOTHER PICTURE");
+    }
+}
+
+void MeasureFewPoints() {
     PrintHeading("redraw of few points");
     for (const auto& [series, points] : {std::pair{1, 10}, {3, 100}}) {
         for (int type = KORGRAPH_LINE; type <= KORGRAPH_PIE; ++type) {
-            Pair pair(type, series, points);
-            std::vector<bench::Way> ways = {{"floor", [&] { pair.Floor(); }},
-                                            {"redraw", [&] { pair.Redraw(); }}};
-            bench::TimeInTurns(ways, kSmallRounds);
-            Print(std::string(kTypeNames[type]) + " of " + std::to_string(series) + " x " +
-                      std::to_string(points),
-                  ways[0].fastest, ways[1].fastest, 1.2);
+            MeasureRedraw(type, series, points, 200, 10, 1.2);
         }
     }
 }
 
-void MeasureLarge(int type, int points, int floorRounds, double bar) {
-    Pair pair(type, 1, points);
-    pair.Redraw();
-    const double floor = FastestTime(floorRounds, [&] { pair.Floor(); });
-    Print(std::string(kTypeNames[type]) + " of " + std::to_string(points), floor,
-          FastestTime(12, [&] { pair.Redraw(); }), bar);
+void MeasureManyPoints(bool quick) {
+    PrintHeading("redraw of many points");
+    const int types[] = {KORGRAPH_LINE, KORGRAPH_COLUMN, KORGRAPH_BAR};
+    for (const int type : types) MeasureRedraw(type, 1, 10000, 10, 4, 0.10);
+    MeasureRedraw(KORGRAPH_AREA, 1, 10000, 1, 2, 0.05);
+    if (quick) return;
+    for (const int type : types) MeasureRedraw(type, 1, 1000000, 2, 2, 0.01);
 }
 
-// One pass that copies and finds what a series keeps.
+// One pass over the values that copies them and finds what a series must know of them: both
+// extremes and the sum of the absolute values. Where the extremes are is not even asked.
 double CopyInOnePass(const Values& values) {
     auto* copy = static_cast<double*>(LocalAlloc(LMEM_FIXED, values.size() * sizeof(double)));
     double least = values[0];
@@ -264,18 +96,87 @@ double CopyInOnePass(const Values& values) {
 }
 
 void MeasureAdding() {
-    PrintHeading("adding a series of 1,000,000 values");
-    const Values values = Noise(1000000, 1);
-    HWND chart = CreateChart();
+    PrintHeading("adding a series");
+    const Values values = bench::Noise(1000000, 1);
+    HWND chart = bench::CreateChart();
     volatile double kept = 0;
     std::vector<bench::Way> ways = {{"copy", [&] { kept = CopyInOnePass(values); }},
                                     {"add", [&] {
-                                         AddSeries(chart, values);
+                                         bench::AddSeries(chart, values);
                                          KorGraph_Clear(chart);
                                      }}};
-    bench::TimeInTurns(ways, 20);
-    Print("add and remove", ways[0].fastest, ways[1].fastest, 1.2);
+    bench::TimeInBatches(ways, 40, 5, [&] { return Ratio(ways) <= 1.2; });
+    PrintRatio("1,000,000 values, and removing", ways[0], ways[1], 1.2);
     DestroyWindow(chart);
+}
+
+void PrintCurve(const std::vector<bench::CurveRow>& curve) {
+    std::printf("\n%-32s", "milliseconds by points");
+    for (const char* way : bench::kCurveWays) std::printf(" %10s", way);
+    for (const bench::CurveRow& row : curve) {
+        std::printf("\n%-32d", row.points);
+        for (const double time : row.times) std::printf(" %10.4f", time / 1000);
+    }
+    std::printf("\n");
+}
+
+void PrintCommaSeparated(const std::vector<bench::CurveRow>& curve) {
+    std::printf("points");
+    for (const char* way : bench::kCurveWays) std::printf(",%s", way);
+    for (const bench::CurveRow& row : curve) {
+        std::printf("\n%d", row.points);
+        for (const double time : row.times) std::printf(",%.3f", time);
+    }
+    std::printf("\n");
+}
+
+// From here on ten times as many points must not take more times as long than a pass over them.
+constexpr int kManyPoints = 10000;
+
+// How many times as long a row's way takes as in the row before.
+double Growth(const std::vector<bench::CurveRow>& curve, size_t row, size_t way) {
+    return curve[row].times[way] / curve[row - 1].times[way];
+}
+
+bool GrowthHolds(const std::vector<bench::CurveRow>& curve) {
+    for (size_t row = 1; row < curve.size(); ++row) {
+        for (size_t way = 1; way < std::size(bench::kCurveWays); ++way) {
+            if (curve[row - 1].points < kManyPoints) continue;
+            if (Growth(curve, row, way) > Growth(curve, row, 0)) return false;
+        }
+    }
+    return true;
+}
+
+// Measured again, and the fastest kept, where the machine's other work has bent it.
+std::vector<bench::CurveRow> MeasureUndisturbedCurve() {
+    std::vector<bench::CurveRow> curve = bench::MeasureCurve();
+    for (int again = 0; again < 3 && !GrowthHolds(curve); ++again) {
+        const std::vector<bench::CurveRow> next = bench::MeasureCurve();
+        for (size_t row = 0; row < curve.size(); ++row) {
+            for (size_t way = 0; way < std::size(bench::kCurveWays); ++way) {
+                curve[row].times[way] = std::min(curve[row].times[way], next[row].times[way]);
+            }
+        }
+    }
+    return curve;
+}
+
+void CheckGrowth(const std::vector<bench::CurveRow>& curve) {
+    std::printf("\n%-32s %12s %12s %9s %7s\n", "times as long for 10 x points", "pass", "redraw",
+                "ratio", "bar");
+    for (size_t i = 1; i < curve.size(); ++i) {
+        if (curve[i - 1].points < kManyPoints) continue;
+        for (size_t way = 1; way < std::size(bench::kCurveWays); ++way) {
+            const std::string name =
+                std::string(bench::kCurveWays[way]) + " of " + std::to_string(curve[i].points);
+            const double pass = Growth(curve, i, 0);
+            const double redraw = Growth(curve, i, way);
+            const double ratio = redraw / pass;
+            std::printf("%-32s %12.2f %12.2f %9.4f %7.2f ", name.c_str(), pass, redraw, ratio, 1.0);
+            Note(ratio <= 1, "MISSED");
+        }
+    }
 }
 
 double HeapBytes() {
@@ -289,66 +190,50 @@ double HeapBytes() {
     return bytes;
 }
 
-void MeasureMemory(const char* name, DWORD options, double bar) {
+// What a redraw leaves behind counts as well.
+void MeasurePoint(const char* name, DWORD options, double bar) {
     constexpr int kPoints = 200000;
-    const Values values = Noise(kPoints, 1);
-    HWND chart = CreateChart();
+    constexpr double kRecords = 0.05;  // of the series and what else comes once, per point
+    const Values values = bench::Noise(kPoints, 1);
+    HWND chart = bench::CreateChart();
     KorGraph_ToggleOptions(chart, options);
+    bench::Redraw(chart);
     const double before = HeapBytes();
-    AddSeries(chart, values);
+    bench::AddSeries(chart, values);
+    bench::Redraw(chart);
     const double perPoint = (HeapBytes() - before) / kPoints;
-    const bool holds = perPoint >= bar && perPoint < bar + 0.05;
-    allHold = allHold && holds;
-    std::printf("%-30s %12.3f bytes, bar %.0f %s\n", name, perPoint, bar, holds ? "" : "MISSED");
+    std::printf("%-32s %12s %12.3f %9s %7.2f ", name, "", perPoint, "", bar);
+    Note(perPoint >= bar && perPoint < bar + kRecords, "MISSED");
     DestroyWindow(chart);
 }
 
-void PrintCurve() {
-    std::printf("\ntype,points,ms\n");
-    for (int type = KORGRAPH_LINE; type <= KORGRAPH_COLUMN; ++type) {
-        for (int points = 10; points <= 10000000; points *= 10) {
-            HWND chart = CreateChart();
-            KorGraph_SetType(chart, type);
-            AddSeries(chart, Noise(points, 1));
-            const double taken = FastestTime(points > 100000 ? 3 : 9, [&] {
-                KorGraph_Redraw(chart);
-                UpdateWindow(chart);
-            });
-            std::printf("%s,%d,%.3f\n", kTypeNames[type], points, taken / 1000);
-            DestroyWindow(chart);
-        }
-    }
-}
-
-bool HasArgument(int count, char** arguments, const char* wanted) {
-    for (int i = 1; i < count; ++i) {
-        if (std::strcmp(arguments[i], wanted) == 0) return true;
-    }
-    return false;
+void MeasureMemory() {
+    std::printf("\n%-32s %12s %12s %9s %7s\n", "memory", "", "bytes/point", "", "bar");
+    MeasurePoint("a series", 0, 8);
+    MeasurePoint("a series in live mode", KORGRAPH_LIVE, 16);
 }
 
 }  // namespace
 
 int main(int argumentCount, char** arguments) {
-    CreateHost();
-    std::printf("chart, %d x %d, %d bits\n", kWidth, kHeight, static_cast<int>(8 * sizeof(void*)));
-    MeasureSmall();
-    PrintHeading("redraw of many points");
-    for (const int type : {KORGRAPH_LINE, KORGRAPH_COLUMN, KORGRAPH_BAR}) {
-        MeasureLarge(type, 10000, 3, 0.10);
+    const auto has = [&](const char* wanted) {
+        return std::any_of(arguments + 1, arguments + argumentCount,
+                           [&](const char* argument) { return !std::strcmp(argument, wanted); });
+    };
+    bench::WaitForQuietStart();
+    if (has("--curve")) {
+        PrintCommaSeparated(MeasureUndisturbedCurve());
+        return 0;
     }
-    MeasureLarge(KORGRAPH_AREA, 10000, 1, 0.05);
-    if (!HasArgument(argumentCount, arguments, "--quick")) {
-        for (const int type : {KORGRAPH_LINE, KORGRAPH_COLUMN, KORGRAPH_BAR}) {
-            MeasureLarge(type, 1000000, 1, 0.01);
-        }
-    }
+    std::printf("chart, %d x %d, %d bits\n", bench::kChartWidth, bench::kChartHeight,
+                static_cast<int>(8 * sizeof(void*)));
+    MeasureFewPoints();
+    MeasureManyPoints(has("--quick"));
     MeasureAdding();
-    std::printf("\nmemory per point\n");
-    MeasureMemory("series", 0, 8);
-    MeasureMemory("series in live mode", KORGRAPH_LIVE, 16);
-    PrintCurve();
-    DestroyWindow(host);
+    MeasureMemory();
+    const std::vector<bench::CurveRow> curve = MeasureUndisturbedCurve();
+    PrintCurve(curve);
+    CheckGrowth(curve);
     std::printf("\n%s\n", allHold ? "every bar holds" : "some bars were MISSED");
-    return HasArgument(argumentCount, arguments, "--check") && !allHold ? 1 : 0;
+    return has("--check") && !allHold ? 1 : 0;
 }

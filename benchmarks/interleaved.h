@@ -14,8 +14,7 @@ namespace bench {
 struct Way {
     std::string name;
     std::function<void()> run;
-    double median = 0;  // microseconds
-    double fastest = 0;
+    double fastest = 0;  // microseconds
 };
 
 inline double Now() {
@@ -26,23 +25,31 @@ inline double Now() {
     return 1e6 * static_cast<double>(count.QuadPart) / static_cast<double>(frequency.QuadPart);
 }
 
-// Runs every way once per round and keeps each one's median and its fastest run. Other work on the
-// machine only ever adds to a run: on a busy one the fastest runs are the ones to compare.
+// Runs every way once per round and keeps its fastest run: other work on the machine only ever adds
+// to a run.
 inline void TimeInTurns(std::vector<Way>& ways, int rounds, int warmUps = 2) {
-    std::vector<std::vector<double>> times(ways.size());
     for (int round = -warmUps; round < rounds; ++round) {
-        for (size_t i = 0; i < ways.size(); ++i) {
+        for (Way& way : ways) {
             const double start = Now();
-            ways[i].run();
+            way.run();
             const double taken = Now() - start;
-            if (round >= 0) times[i].push_back(taken);
+            if (round == 0 || (round > 0 && taken < way.fastest)) way.fastest = taken;
         }
     }
-    for (size_t i = 0; i < ways.size(); ++i) {
-        auto middle = times[i].begin() + static_cast<std::ptrdiff_t>(times[i].size() / 2);
-        std::nth_element(times[i].begin(), middle, times[i].end());
-        ways[i].median = *middle;
-        ways[i].fastest = *std::min_element(times[i].begin(), times[i].end());
+}
+
+// The same in batches until enough() or the last of them; the fastest runs are those of all
+// batches. More runs only bring each way nearer to what it takes undisturbed.
+inline void TimeInBatches(std::vector<Way>& ways, int rounds, int batches,
+                          const std::function<bool()>& enough) {
+    std::vector<double> fastest(ways.size());
+    for (int batch = 0; batch < batches; ++batch) {
+        TimeInTurns(ways, rounds, batch == 0 && rounds > 10 ? 2 : 0);
+        for (size_t i = 0; i < ways.size(); ++i) {
+            if (batch > 0) ways[i].fastest = std::min(ways[i].fastest, fastest[i]);
+            fastest[i] = ways[i].fastest;
+        }
+        if (enough()) return;
     }
 }
 

@@ -1,5 +1,6 @@
 // A column is a polygon from the zero line to its value; a bar is the same turned a quarter. Where
-// they have become so thin that several share a pixel, the lowest and the highest cover them all.
+// they have become so thin that several share a pixel, a line from the lowest end to the highest
+// has the pixels of them all.
 #include "graph/graph_bars.h"
 
 #include <algorithm>
@@ -14,65 +15,79 @@ namespace kor {
 
 namespace {
 
+// So far outside the view that nothing of a pen is seen.
+constexpr LONG kBeyond = 2;
+
 // One way of laying out a chart's bars.
 struct BarLayout {
     AlongAxis along;  // position of a point along the category axis, growing with its number
     int lowPixel;     // the view along that axis
     int highPixel;
+    RECT view;
     int thickness;
-    RECT (*place)(const GraphRecord& graph, int number, double value, int offset, int thickness);
+    // Pixel of a value in the bar of a point, `across` pixels beside the point's own position.
+    POINT (*place)(const GraphRecord& graph, int number, double value, int across);
+    POINT growth;  // the pixel after another as values grow
 };
 
 // Rows grow downwards, point numbers upwards: turned round they grow together.
 int RowUpwards(const GraphRecord& graph, double pointNumber) { return -yPixel(graph, pointNumber); }
 
-// Opposite corners, in any order.
-RECT PlaceColumn(const GraphRecord& graph, int number, double value, int offset, int thickness) {
-    const int left = xPixel(graph, number) + offset;
-    return {left, yPixel(graph, 0), left + thickness, yPixel(graph, value)};
+POINT PlaceInColumn(const GraphRecord& graph, int number, double value, int across) {
+    return {xPixel(graph, number) + across, yPixel(graph, value)};
 }
 
-RECT PlaceBar(const GraphRecord& graph, int number, double value, int offset, int thickness) {
-    const int bottom = yPixel(graph, number) - offset;
-    return {xPixel(graph, 0), bottom, xPixel(graph, value), bottom - thickness};
+POINT PlaceInBar(const GraphRecord& graph, int number, double value, int across) {
+    return {xPixel(graph, value), yPixel(graph, number) - across};
 }
 
 // Sides that lie out of view are moved to just outside it: Polygon's time grows with each row that
 // it spans, seen or not.
-void DrawBox(HDC dc, const RECT& view, const RECT& box) {
-    const auto column = [&](LONG x) { return std::clamp(x, view.left - 2, view.right + 2); };
-    const auto row = [&](LONG y) { return std::clamp(y, view.top - 2, view.bottom + 2); };
-    const POINT corners[] = {{column(box.left), row(box.top)},
-                             {column(box.left), row(box.bottom)},
-                             {column(box.right), row(box.bottom)},
-                             {column(box.right), row(box.top)}};
+void DrawOneBar(const GraphRecord& graph, HDC dc, const BarLayout& layout, int number, double value,
+                int offset) {
+    const RECT& view = layout.view;
+    const auto corner = [&](double at, int across) -> POINT {
+        const POINT place = layout.place(graph, number, at, across);
+        return {std::clamp(place.x, view.left - kBeyond, view.right + kBeyond),
+                std::clamp(place.y, view.top - kBeyond, view.bottom + kBeyond)};
+    };
+    const int past = offset + layout.thickness;
+    const POINT corners[] = {corner(0, offset), corner(value, offset), corner(value, past),
+                             corner(0, past)};
     Polygon(dc, corners, 4);
+}
+
+// The bars of the points [number, end), which share a position and have no thickness.
+void DrawThinBarsTogether(const GraphRecord& graph, HDC dc, const GraphSeries& series,
+                          const BarLayout& layout, int number, int end, int offset) {
+    const PositionSummary found = Summarise(series.values, number, end);
+    if (found.first < 0) return;
+    const double least = series.values[found.lowest];
+    const double most = series.values[found.highest];
+    const POINT low = layout.place(graph, number, std::min(least, 0.0), offset);
+    const POINT high = layout.place(graph, number, std::max(most, 0.0), offset);
+    if (low.x == high.x && low.y == high.y) {  // a point; the platform says what that looks like
+        DrawOneBar(graph, dc, layout, number, most, offset);
+        return;
+    }
+    const POINT ends[] = {low, {high.x + layout.growth.x, high.y + layout.growth.y}};
+    Polyline(dc, ends, 2);  // leaves its last pixel out
 }
 
 void DrawThinBars(const GraphRecord& graph, HDC dc, const GraphSeries& series,
                   const BarLayout& layout, PointRange range, int offset) {
-    const RECT view = PlotClip(graph);
-    const auto draw = [&](int number, double value) {
-        DrawBox(dc, view, layout.place(graph, number, value, offset, 0));
-    };
     for (int number = range.first; number <= range.last;) {
         const int end = EndOfPosition(graph, layout.along, range, number);
-        const PositionSummary found = Summarise(series.values, number, end);
-        if (found.first >= 0) {
-            draw(number, series.values[found.lowest]);
-            if (found.highest != found.lowest) draw(number, series.values[found.highest]);
-        }
+        DrawThinBarsTogether(graph, dc, series, layout, number, end, offset);
         number = end;
     }
 }
 
 void DrawThickBars(const GraphRecord& graph, HDC dc, const GraphSeries& series,
                    const BarLayout& layout, PointRange range, int offset) {
-    const RECT view = PlotClip(graph);
     for (int number = range.first; number <= range.last; ++number) {
         const double value = series.values[number - 1];
-        if (!IsFinite(value)) continue;
-        DrawBox(dc, view, layout.place(graph, number, value, offset, layout.thickness));
+        if (IsFinite(value)) DrawOneBar(graph, dc, layout, number, value, offset);
     }
 }
 
@@ -107,18 +122,18 @@ void DrawBars(const GraphRecord& graph, HDC dc, const BarLayout& layout) {
 void DrawColumnChart(GraphRecord& graph, HDC dc) {
     DrawInFrame(graph, dc, [&] {
         const RECT view = PlotClip(graph);
-        DrawBars(
-            graph, dc,
-            {xPixel, view.left, view.right, ZoomedThickness(graph, graph.barWidth), PlaceColumn});
+        const int thickness = ZoomedThickness(graph, graph.barWidth);
+        DrawBars(graph, dc,
+                 {xPixel, view.left, view.right, view, thickness, PlaceInColumn, {0, -1}});
     });
 }
 
 void DrawBarChart(GraphRecord& graph, HDC dc) {
     DrawInFrame(graph, dc, [&] {
         const RECT view = PlotClip(graph);
+        const int thickness = ZoomedThickness(graph, graph.barHeight);
         DrawBars(graph, dc,
-                 {RowUpwards, -view.bottom, -view.top, ZoomedThickness(graph, graph.barHeight),
-                  PlaceBar});
+                 {RowUpwards, -view.bottom, -view.top, view, thickness, PlaceInBar, {1, 0}});
     });
 }
 

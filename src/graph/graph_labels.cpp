@@ -23,10 +23,10 @@ void DrawCentred(HDC dc, const wchar_t* text, const RECT& cell) {
     TextRun(dc, text).Draw(cell, DT_CENTER);
 }
 
-void DrawNumber(HDC dc, double value, const RECT& cell) {
+void DrawNumber(const GraphRecord& graph, HDC dc, double value, const RECT& cell) {
     wchar_t text[kNumberTextCapacity];
     FormatGraphNumber(value, text, kGraphPrecision);
-    DrawCentred(dc, text, cell);
+    DrawNumberText(dc, graph.numberWidths, text, cell, DT_CENTER);
 }
 
 // The categories whose pixels may lie in view: labels stand at whole numbers from 1 on.
@@ -85,7 +85,7 @@ void DrawXAxisLabels(const GraphRecord& graph, HDC dc) {
         return;
     }
     WalkXTicks(graph, graph.xTickStep, plot.left, plot.right, [&](double value, int x) {
-        DrawNumber(dc, value,
+        DrawNumber(graph, dc, value,
                    {x - graph.xTickHalfSpacing, top, x + graph.xTickHalfSpacing,
                     top + graph.xLabelHeight});
     });
@@ -102,7 +102,8 @@ void DrawYAxisLabels(const GraphRecord& graph, HDC dc) {
         return;
     }
     WalkYTicks(graph, graph.yTickStep, plot.top, plot.bottom, [&](double value, int y) {
-        DrawNumber(dc, value, {left, y - graph.labelHalfHeight, right, y + graph.labelHalfHeight});
+        DrawNumber(graph, dc, value,
+                   {left, y - graph.labelHalfHeight, right, y + graph.labelHalfHeight});
     });
 }
 

@@ -81,6 +81,7 @@ void CreateGraphFonts(GraphRecord& graph, HDC dc) {
     description.lfEscapement = kQuarterTurn;
     description.lfOrientation = kQuarterTurn;
     graph.hfontYTitle = CreateFontIndirectW(&description);
+    graph.numberWidths = MeasureNumberCharacters(dc, graph.hfontAxis);
 }
 
 void LayoutGraphMargins(GraphRecord& graph, HDC dc) {

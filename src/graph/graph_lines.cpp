@@ -17,7 +17,7 @@ void DrawLineSeries(const GraphRecord& graph, HDC dc, const GraphSeries& series)
     SelectScope selected(dc, pen.get());
     const RECT view = PlotClip(graph);
     SeriesPoints points;
-    if (!points.Make(graph, series, view.left - 1, view.right + 1, LastPosition::whole, 0)) return;
+    if (!points.Make(graph, series, view.left - 1, view.right + 1, PointsOf::polyline, 0)) return;
     if (points.count() > 1) Polyline(dc, points.begin(), points.count());
     if (graph.chartType == kLine) DrawSeriesMarkers(graph, dc, series);
 }
@@ -30,7 +30,7 @@ void DrawAreaSeries(const GraphRecord& graph, HDC dc, const GraphSeries& series)
     constexpr int kBasePoint = 1;
     constexpr int kClosingPoint = 1;
     SeriesPoints points;
-    if (!points.Make(graph, series, view.left - 1, view.right + 1, LastPosition::summarised,
+    if (!points.Make(graph, series, view.left - 1, view.right + 1, PointsOf::polygon,
                      kBasePoint + kClosingPoint)) {
         return;
     }

@@ -70,14 +70,10 @@ public:
 
     bool IsMade() const { return steps_ != nullptr; }
 
-    void Add(int y, int from, int to) {
-        const int row = y - top_;
-        if (row < 0 || row >= height_) return;
-        const int first = std::clamp(from - left_, 0, width_);
-        const int past = std::clamp(to - left_, 0, width_);
-        int32_t* steps = steps_ + row * (width_ + 1);
-        ++steps[first];
-        --steps[past];
+    void AddCircle(const CircleRuns& circle, int x, int y) {
+        for (int row = 0; row < kSide; ++row) {
+            Add(y - kRadius + row, x - kRadius + circle.from[row], x - kRadius + circle.to[row]);
+        }
     }
 
     // fill(x, y, width) for every run of covered pixels.
@@ -97,6 +93,16 @@ public:
     }
 
 private:
+    void Add(int y, int from, int to) {
+        const int row = y - top_;
+        if (row < 0 || row >= height_) return;
+        const int first = std::clamp(from - left_, 0, width_);
+        const int past = std::clamp(to - left_, 0, width_);
+        int32_t* steps = steps_ + row * (width_ + 1);
+        ++steps[first];
+        --steps[past];
+    }
+
     int left_;
     int top_;
     int width_;
@@ -104,7 +110,8 @@ private:
     int32_t* steps_;
 };
 
-// Rows of one image column that hold a point: each point counts once however often it comes.
+// Rows of one image column that hold a point: each point counts once however often it comes, and
+// none is looked at when there can be no new one.
 class RowSet {
 public:
     RowSet(int top, int height)
@@ -116,21 +123,44 @@ public:
 
     bool IsMade() const { return rows_ != nullptr; }
 
+    // Begins a column whose points lie between two rows, both included.
+    void Begin(int highest, int lowest) {
+        std::fill_n(rows_, height_, uint8_t{0});
+        missing_ = std::min(lowest, top_ + height_ - 1) - std::max(highest, top_) + 1;
+    }
+
+    bool MayGrow() const { return missing_ > 0; }
+
     // True when the row lies in view and is new in this column.
     bool Insert(int y) {
         const int row = y - top_;
         if (row < 0 || row >= height_ || rows_[row]) return false;
         rows_[row] = 1;
+        --missing_;
         return true;
     }
-
-    void Clear() { std::fill_n(rows_, height_, uint8_t{0}); }
 
 private:
     int top_;
     int height_;
+    int missing_ = 0;  // rows that the column's points can still come to
     uint8_t* rows_;
 };
+
+// found(y) for each row that holds one of the points [number, end) of a column.
+template <typename Found>
+void ForEachNewRow(const GraphRecord& graph, const double* values, int number, int end,
+                   RowSet& rows, Found found) {
+    const PositionSummary summary = Summarise(values, number, end);
+    if (summary.first < 0) return;
+    rows.Begin(yPixel(graph, values[summary.highest]), yPixel(graph, values[summary.lowest]));
+    for (int i = number; i < end && rows.MayGrow(); ++i) {
+        const double value = values[i - 1];
+        if (!IsFinite(value)) continue;
+        const int y = yPixel(graph, value);
+        if (rows.Insert(y)) found(y);
+    }
+}
 
 bool DrawUnited(const GraphRecord& graph, HDC dc, const GraphSeries& series, PointRange range,
                 const RECT& view) {
@@ -143,17 +173,8 @@ bool DrawUnited(const GraphRecord& graph, HDC dc, const GraphSeries& series, Poi
     for (int number = range.first; number <= range.last;) {
         const int x = xPixel(graph, number);
         const int end = EndOfPosition(graph, xPixel, range, number);
-        for (int i = number; i < end; ++i) {
-            const double value = series.values[i - 1];
-            if (!IsFinite(value)) continue;
-            const int y = yPixel(graph, value);
-            if (!seen.Insert(y)) continue;
-            for (int row = 0; row < kSide; ++row) {
-                coverage.Add(y - kRadius + row, x - kRadius + circle->from[row],
-                             x - kRadius + circle->to[row]);
-            }
-        }
-        seen.Clear();
+        ForEachNewRow(graph, series.values, number, end, seen,
+                      [&](int y) { coverage.AddCircle(*circle, x, y); });
         number = end;
     }
     coverage.ForEachRun([&](int x, int y, int width) { PatBlt(dc, x, y, width, 1, PATCOPY); });

@@ -2,6 +2,7 @@
 
 #include <korcontrols/graph.h>
 
+#include <algorithm>
 #include <cmath>
 
 #include "graph/graph_disc.h"
@@ -11,7 +12,6 @@
 #include "graph/graph_series.h"
 #include "platform/gdi_scopes.h"
 #include "platform/local_text.h"
-#include "text/text_run.h"
 
 namespace kor {
 
@@ -87,7 +87,7 @@ void DrawPercentages(const GraphRecord& graph, const GraphSeries& series, HDC dc
         wchar_t text[kDecimalCapacity + 1];
         _itow(TruncateToInt(share * 100.0 + 0.5), text, 10);
         wcscat(text, L"%");
-        TextRun(dc, text).Draw(place.box, place.alignment);
+        DrawNumberText(dc, graph.numberWidths, text, place.box, place.alignment);
     }
 }
 
@@ -138,6 +138,26 @@ void RotateVector(double& dx, double& dy, double degrees) {
     dx = turnedX;
 }
 
+namespace {
+
+// Rows from the centre's that hold pixels of a slice, and some more: from the centre to its arc.
+struct RowRange {
+    int first;
+    int last;
+};
+
+RowRange RowsOfSlice(int radius, double startDegrees, double endDegrees) {
+    constexpr int kSpare = 2;
+    const int start = RadiusEnd(radius, startDegrees).y;
+    const int end = RadiusEnd(radius, endDegrees).y;
+    const bool reachesBottom = startDegrees <= 180.0 && endDegrees >= 180.0;
+    const int lowest = reachesBottom ? radius : std::max({start, end, 0});
+    return {std::max(std::min({start, end, 0}) - kSpare, -radius),
+            std::min(lowest + kSpare, radius)};
+}
+
+}  // namespace
+
 void FillPieSlice(HDC dc, int centreX, int centreY, int radius, double startDegrees,
                   double endDegrees) {
     if (radius < 1 || !(endDegrees > startDegrees)) return;
@@ -146,7 +166,8 @@ void FillPieSlice(HDC dc, int centreX, int centreY, int radius, double startDegr
     WalkCircle(radius, halfWidths);
     const SliceEdge start = MakeSliceEdge(startDegrees);
     const SliceEdge end = MakeSliceEdge(endDegrees);
-    for (int dy = -radius; dy <= radius; ++dy) {
+    const RowRange rows = RowsOfSlice(radius, startDegrees, endDegrees);
+    for (int dy = rows.first; dy <= rows.last; ++dy) {
         const SliceRow row = SliceOnRow(start, end, dy, halfWidths[dy < 0 ? -dy : dy]);
         for (const DiscRun& run : row.runs) {
             if (run.to <= run.from) continue;

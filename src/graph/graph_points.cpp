@@ -23,6 +23,16 @@ int FirstAtOrPast(const GraphRecord& graph, AlongAxis along, int low, int high, 
     return low;
 }
 
+// Values that are no numbers have no point: the line goes on to the next value that is one, even
+// far outside the view, and ends at the last.
+PointRange WithNumbersAtEnds(const GraphSeries& series, PointRange range) {
+    const double* values = series.values;
+    while (range.first > 1 && !IsFinite(values[range.first - 1])) --range.first;
+    while (range.last < series.pointCount && !IsFinite(values[range.last - 1])) ++range.last;
+    while (range.last >= range.first && !IsFinite(values[range.last - 1])) --range.last;
+    return range;
+}
+
 }  // namespace
 
 PointRange PointsBetween(const GraphRecord& graph, AlongAxis along, int count, int lowPixel,
@@ -46,15 +56,25 @@ int EndOfPosition(const GraphRecord& graph, AlongAxis along, PointRange range, i
 }
 
 PositionSummary Summarise(const double* values, int number, int end) {
-    PositionSummary found = {-1, -1, -1, -1};
-    for (int i = number - 1; i < end - 1; ++i) {
+    int i = number - 1;
+    while (i < end - 1 && !IsFinite(values[i])) ++i;
+    if (i == end - 1) return {-1, -1, -1, -1};
+    double least = values[i];
+    double most = values[i];
+    PositionSummary found = {i, i, i, end - 2};
+    for (++i; i < end - 1; ++i) {
         const double value = values[i];
+        if (least <= value && value <= most) continue;  // nearly always, so nothing else is asked
         if (!IsFinite(value)) continue;
-        if (found.first < 0) found = {i, i, i, i};
-        if (value < values[found.lowest]) found.lowest = i;
-        if (value > values[found.highest]) found.highest = i;
-        found.last = i;
+        if (value < least) {
+            least = value;
+            found.lowest = i;
+        } else {
+            most = value;
+            found.highest = i;
+        }
     }
+    while (!IsFinite(values[found.last])) --found.last;
     return found;
 }
 
@@ -71,7 +91,8 @@ void SeriesPoints::AppendPosition(const GraphRecord& graph, const GraphSeries& s
     if (found.first < 0) return;
     const int column = xPixel(graph, number);
     int order[] = {found.first, found.lowest, found.highest, found.last};
-    if (order[1] > order[2]) std::swap(order[1], order[2]);
+    // All ways over both extremes have the same pixels; this is the shorter one.
+    if (series.values[found.first] > series.values[found.last]) std::swap(order[1], order[2]);
     int previous = -1;
     for (const int index : order) {
         if (index != previous) Append(graph, series, column, index);
@@ -79,38 +100,48 @@ void SeriesPoints::AppendPosition(const GraphRecord& graph, const GraphSeries& s
     }
 }
 
-void SeriesPoints::AppendWhole(const GraphRecord& graph, const GraphSeries& series, int number,
-                               int end) {
-    for (int i = number; i < end; ++i) {
-        if (IsFinite(series.values[i - 1])) Append(graph, series, xPixel(graph, i), i - 1);
+// Point end - 1 is there. The polyline's last pixel is that of its last points, as many as share
+// it: a line that ends there leaves it out, but one that has gone over it before has drawn it. So
+// what comes before them is summarised by itself.
+void SeriesPoints::AppendLastPosition(const GraphRecord& graph, const GraphSeries& series,
+                                      int number, int end) {
+    const double* values = series.values;
+    const int last = end - 1;
+    const int row = yPixel(graph, values[last - 1]);
+    int first = last;
+    for (int i = last - 1; i >= number; --i) {
+        if (!IsFinite(values[i - 1])) continue;
+        if (yPixel(graph, values[i - 1]) != row) break;
+        first = i;
     }
+    AppendPosition(graph, series, number, first);
+    const int column = xPixel(graph, number);
+    if (first != last) Append(graph, series, column, first - 1);
+    Append(graph, series, column, last - 1);
 }
 
 bool SeriesPoints::Make(const GraphRecord& graph, const GraphSeries& series, int left, int right,
-                        LastPosition lastPosition, int spare) {
+                        PointsOf shape, int spare) {
     constexpr int kPointsPerPosition = 4;
-    const PointRange range = PointsBetween(graph, xPixel, series.pointCount, left, right);
+    constexpr int kPointsAtTheEnd = 2;
+    const PointRange range =
+        WithNumbersAtEnds(series, PointsBetween(graph, xPixel, series.pointCount, left, right));
     const int all = std::max(range.last - range.first + 1, 0);
-    int lastPositionStart = range.last + 1;
-    if (lastPosition == LastPosition::whole && all > 0) {
-        const int column = xPixel(graph, range.last);
-        lastPositionStart = FirstAtOrPast(graph, xPixel, range.first, range.last, column);
-    }
-    // Positions in view, one on each side of it, and what is kept whole.
-    const int positions = std::max(right - left, 0) + 4;
-    const int most =
-        std::min(all, positions * kPointsPerPosition + range.last + 1 - lastPositionStart);
+    const int positions = std::max(right - left, 0) + 4;  // those in view, and one on each side
+    const int most = std::min(all, positions * kPointsPerPosition + kPointsAtTheEnd);
     points_ = static_cast<POINT*>(
         LocalAlloc(LMEM_FIXED, static_cast<SIZE_T>(most + 2 * spare) * sizeof(POINT)));
     if (!points_) return false;
     spare_ = spare;
-    const PointRange summarised = {range.first, lastPositionStart - 1};
-    for (int number = summarised.first; number <= summarised.last;) {
-        const int end = EndOfPosition(graph, xPixel, summarised, number);
-        AppendPosition(graph, series, number, end);
+    for (int number = range.first; number <= range.last;) {
+        const int end = EndOfPosition(graph, xPixel, range, number);
+        if (shape == PointsOf::polyline && end > range.last) {
+            AppendLastPosition(graph, series, number, end);
+        } else {
+            AppendPosition(graph, series, number, end);
+        }
         number = end;
     }
-    AppendWhole(graph, series, lastPositionStart, range.last + 1);
     return true;
 }
 

@@ -35,9 +35,9 @@ struct PositionSummary {
 
 PositionSummary Summarise(const double* values, int number, int end);
 
-// How the picture ends: a polyline leaves out its very last pixel, so its last position is kept
-// whole.
-enum class LastPosition { whole, summarised };
+// What is drawn with the points. A polyline leaves out its very last pixel, unless it has been
+// there before; a polygon is closed.
+enum class PointsOf { polyline, polygon };
 
 // The points of a line or an area in image pixels, in order. Owns its array.
 class SeriesPoints {
@@ -50,7 +50,7 @@ public:
     // Makes the points of a series for the view between two columns, with `spare` places before and
     // after them; false without memory.
     bool Make(const GraphRecord& graph, const GraphSeries& series, int left, int right,
-              LastPosition lastPosition, int spare);
+              PointsOf shape, int spare);
 
     POINT* begin() { return points_ + spare_; }
     int count() const { return count_; }
@@ -58,7 +58,8 @@ public:
 private:
     void Append(const GraphRecord& graph, const GraphSeries& series, int column, int index);
     void AppendPosition(const GraphRecord& graph, const GraphSeries& series, int number, int end);
-    void AppendWhole(const GraphRecord& graph, const GraphSeries& series, int number, int end);
+    void AppendLastPosition(const GraphRecord& graph, const GraphSeries& series, int number,
+                            int end);
 
     POINT* points_ = nullptr;
     int spare_ = 0;

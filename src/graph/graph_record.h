@@ -5,6 +5,7 @@
 #pragma once
 
 #include "platform/platform.h"
+#include "text/number_run.h"
 
 namespace kor {
 
@@ -113,7 +114,8 @@ struct GraphRecord {
     int32_t barHeight;
 
     // The library's own, behind the specified fields.
-    HGDIOBJ blankBitmap;  // what hdcMem held at first; back before hbmMem is deleted
+    HGDIOBJ blankBitmap;        // what hdcMem held at first; back before hbmMem is deleted
+    NumberWidths numberWidths;  // in hfontAxis
     PrintState printing;
 };
 

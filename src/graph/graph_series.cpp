@@ -1,6 +1,7 @@
 #include "graph/graph_series.h"
 
 #include <algorithm>
+#include <cmath>
 
 #include "graph/graph_numbers.h"
 #include "graph/graph_palette.h"
@@ -31,32 +32,38 @@ struct Extremes {
     double absSum = 0;
 };
 
-// Ties keep the first index. The sum is taken in index order.
-Extremes FindExtremes(const double* values, int count) {
-    Extremes found;
+// Copies values and finds their extremes on the way: what costs is to go through the memory. `to`
+// may be `from`. Ties keep the first index. The sum is taken in index order.
+Extremes CopyFindingExtremes(double* to, const double* from, int count) {
     int i = 0;
-    while (i < count && !IsFinite(values[i])) ++i;
-    if (i == count) return found;
-    found.minValue = found.maxValue = values[i];
-    found.minIndex = found.maxIndex = i;
+    for (; i < count && !IsFinite(from[i]); ++i) to[i] = from[i];
+    if (i == count) return {};
+    double least = from[i];
+    double most = from[i];
+    int leastIndex = i;
+    int mostIndex = i;
+    double sum = 0;
     for (; i < count; ++i) {
-        const double value = values[i];
-        if (!IsFinite(value)) continue;
-        if (value < found.minValue) {
-            found.minValue = value;
-            found.minIndex = i;
+        const double value = from[i];
+        to[i] = value;
+        if (!(least <= value && value <= most)) {  // few are new extremes, or no numbers
+            if (!IsFinite(value)) continue;
+            if (value < least) {
+                least = value;
+                leastIndex = i;
+            } else {
+                most = value;
+                mostIndex = i;
+            }
         }
-        if (value > found.maxValue) {
-            found.maxValue = value;
-            found.maxIndex = i;
-        }
-        found.absSum += value < 0 ? -value : value;
+        sum += std::fabs(value);
     }
-    return found;
+    return {least, most, leastIndex, mostIndex, sum};
 }
 
-void TakeExtremes(GraphSeries& series) {
-    const Extremes found = FindExtremes(series.values, series.pointCount);
+// Fills the series' array, `from` having as many values.
+void TakeValues(GraphSeries& series, const double* from) {
+    const Extremes found = CopyFindingExtremes(series.values, from, series.pointCount);
     series.minValue = found.minValue;
     series.maxValue = found.maxValue;
     series.minIndex = found.minIndex;
@@ -69,8 +76,7 @@ bool InitialiseSeries(GraphSeries& series, int count, const double* values, bool
     series.values = AllocateValues(count);
     if (!series.values) return false;
     series.pointCount = count;
-    memcpy(series.values, values, static_cast<size_t>(count) * sizeof(double));
-    TakeExtremes(series);
+    TakeValues(series, values);
     if (!live) return true;
     series.liveBuffer =
         AllocateLocal<POINT>(static_cast<uint32_t>(std::max(count, kLeastLivePoints)));
@@ -212,7 +218,7 @@ void ReplaceSeriesValues(GraphRecord& graph, const GraphSeriesData& data) {
             const int copied = std::min<int>(series->pointCount, data.pointCount);
             std::copy_n(data.values, copied, series->values);
             std::fill(series->values + copied, series->values + series->pointCount, 0.0);
-            TakeExtremes(*series);
+            TakeValues(*series, series->values);
         } else {
             InitialiseSeries(*series, data.pointCount, data.values,
                              HasOption(graph, KORGRAPH_LIVE));

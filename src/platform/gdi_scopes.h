@@ -74,7 +74,7 @@ private:
     HDC dc_;
 };
 
-// BeginPaint and EndPaint.
+// BeginPaint and EndPaint. Where painting cannot begin, the DC is null and the area empty.
 class PaintScope {
 public:
     explicit PaintScope(HWND hwnd) noexcept : hwnd_(hwnd) { dc_ = BeginPaint(hwnd_, &paint_); }
@@ -88,7 +88,7 @@ public:
 private:
     HWND hwnd_;
     HDC dc_;
-    PAINTSTRUCT paint_;
+    PAINTSTRUCT paint_ = {};
 };
 
 }  // namespace kor

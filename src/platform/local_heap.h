@@ -7,10 +7,17 @@
 
 namespace kor {
 
+// Whether the bytes of so many values can be counted.
+template <typename Value>
+constexpr bool HasCountableBytes(SIZE_T count) {
+    return count <= SIZE_MAX / sizeof(Value);
+}
+
 // A zero-filled array of `count` values, or null. Freed with LocalFree.
 template <typename Value>
 Value* AllocateLocal(uint32_t count) {
     static_assert(std::is_trivially_copyable_v<Value>);
+    if (!HasCountableBytes<Value>(count)) return nullptr;
     return static_cast<Value*>(
         LocalAlloc(LMEM_ZEROINIT, static_cast<SIZE_T>(count) * sizeof(Value)));
 }
@@ -20,6 +27,7 @@ Value* AllocateLocal(uint32_t count) {
 template <typename Value>
 Value* ReallocateLocal(Value* array, uint32_t count) {
     static_assert(std::is_trivially_copyable_v<Value>);
+    if (!HasCountableBytes<Value>(count)) return nullptr;
     return static_cast<Value*>(
         LocalReAlloc(array, static_cast<SIZE_T>(count) * sizeof(Value), LMEM_MOVEABLE));
 }
