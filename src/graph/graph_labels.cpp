@@ -131,7 +131,7 @@ void DrawYAxisTitle(const GraphRecord& graph, HDC dc) {
     const int height = plot.bottom - graph.rcPlot.top - graph.marginTop;
     const RECT strip = {0, plot.top, kYTitleStrip, plot.bottom};
     ExtTextOutW(dc, kYTitleLeft, plot.bottom - (height >> 1), ETO_CLIPPED, &strip, graph.yAxisTitle,
-                static_cast<UINT>(lstrlenW(graph.yAxisTitle)), nullptr);
+                static_cast<UINT>(wcslen(graph.yAxisTitle)), nullptr);
 }
 
 }  // namespace kor

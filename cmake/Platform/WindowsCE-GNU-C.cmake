@@ -1,0 +1,2 @@
+include(Platform/WindowsCE-GNU)
+windows_ce_gnu(C)

@@ -1,0 +1,13 @@
+// The clipboard of Windows CE takes blocks of the local heap, and drawing is done when a call
+// returns.
+#include "platform/clipboard.h"
+
+namespace kor {
+
+HANDLE BlockForClipboard(void* localBlock, uint32_t) { return localBlock; }
+
+void FreeClipboardBlock(HANDLE block) { LocalFree(block); }
+
+void FinishDrawing() {}
+
+}  // namespace kor

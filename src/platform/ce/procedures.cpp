@@ -1,0 +1,14 @@
+#include "platform/procedures.h"
+
+namespace kor {
+
+namespace {
+
+// The desktop's headers lack it: there, names of functions are narrow.
+extern "C" FARPROC GetProcAddressW(HMODULE module, const wchar_t* name);
+
+}  // namespace
+
+FARPROC FindProcedure(HMODULE module, const wchar_t* name) { return GetProcAddressW(module, name); }
+
+}  // namespace kor
