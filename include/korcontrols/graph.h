@@ -21,6 +21,8 @@
 
 #include <korcontrols/korcontrols.h>
 
+#include <commctrl.h> /* TBBUTTON */
+
 #ifdef __cplusplus
 extern "C" {
 #endif
@@ -163,6 +165,13 @@ typedef struct GraphRange {
  *   result  0 */
 #define GN_RESET (WM_USER + 6016)
 
+/* GN_PROPERTIES, inside WM_NOTIFY: runs the modal property sheet "Graph Properties", with a page of
+ * the titles and a page of ranges, type and zoom. OK applies both pages and draws. It comes back
+ * when the sheet is closed; the host's messages go on meanwhile.
+ *   lParam  0
+ *   result  0 */
+#define GN_PROPERTIES (WM_USER + 6017)
+
 /* GN_SETVALUE, inside WM_NOTIFY: sets one value.
  *   lParam  const GraphValue*; bad indexes are ignored
  *   result  0 */
@@ -226,6 +235,14 @@ typedef struct GraphRange {
  *   result  0 */
 #define GM_GETRANGE (WM_USER + 6029)
 
+/* GM_COPY: puts the chart's image on the clipboard, as CF_DIB of 8 bits per pixel in the colours of
+ * the series palette. Both sizes are those of the client area rounded up to multiples of 4. What
+ * was on the clipboard is gone afterwards, also when there was no memory for the image.
+ *   wParam  0
+ *   lParam  0
+ *   result  0 */
+#define GM_COPY (WM_USER + 6030)
+
 /* ---- Functions ---- */
 
 /* Registers the chart's window class under `instance`, the host's own, once per process.
@@ -235,6 +252,36 @@ DWORD KORCONTROLS_API RegisterGraphControl(HINSTANCE instance);
 
 /* The chart's class name; it belongs to the library. */
 LPCWSTR KORCONTROLS_API GetGraphControlClassName(void);
+
+/* Fills a command bar of the host with the chart's controls: the library's three button images
+ * (show chart, properties, legend: image indexes 0 to 2 of an empty bar), the host's buttons, the
+ * zoom combo box and the chart type combo box, in this order from the left. The items' data are the
+ * arguments of GM_SETZOOM and GM_SETTYPE; "100%" and "Line" are selected. The host's window gets
+ * the commands and drives the chart; the library connects nothing.
+ *
+ * The tooltip texts (of the first two buttons, the zoom and the type combo box, and one more) go to
+ * the bar as WM_USER + 81 (wParam 5, lParam LPCWSTR*). Array and texts belong to the library and
+ * stay valid; the first text changes with the chart, "Show Grid" while it is shown and "Show Graph"
+ * while it is hidden, so a bar must read it anew each time. On a desktop the message goes only to a
+ * bar with a procedure of its own, since a plain toolbar takes it for another one: a host that
+ * subclasses the toolbar must answer it there.
+ *   instance       the host's, under which the combo boxes are created
+ *   commandBar     a command bar, or on a desktop a toolbar that was sent TB_BUTTONSTRUCTSIZE
+ *   buttons        buttonCount descriptions, added as they are; null or a count of 0 adds none
+ *   zoomComboOut   receives the zoom combo box, null when it could not be made; may be null
+ *   zoomComboId    its control id
+ *   typeComboOut   the same for the chart type
+ *   typeComboId    its control id
+ *   result         1, or 0 for a null bar (nothing is done or stored then) */
+DWORD KORCONTROLS_API SetupGraphCommandBar(HINSTANCE instance, HWND commandBar,
+                                           const TBBUTTON* buttons, LONG buttonCount,
+                                           HWND* zoomComboOut, UINT zoomComboId, HWND* typeComboOut,
+                                           UINT typeComboId);
+
+/* Whether charts can be printed: the two modules that printing needs were loaded, which is tried
+ * when a chart is created.
+ *   result  1, or 0 */
+DWORD KORCONTROLS_API IsPrintingAvailableForGraphControl(void);
 
 /* ---- The messages as functions ---- */
 
@@ -324,6 +371,12 @@ static __inline void KorGraph_SetBackgroundColour(HWND graph, COLORREF colour) {
 }
 
 static __inline void KorGraph_Redraw(HWND graph) { KorGraph_Notify(graph, GN_REDRAW, 0); }
+
+static __inline void KorGraph_ShowProperties(HWND graph) {
+    KorGraph_Notify(graph, GN_PROPERTIES, 0);
+}
+
+static __inline void KorGraph_Copy(HWND graph) { SendMessageW(graph, GM_COPY, 0, 0); }
 
 static __inline void KorGraph_Clear(HWND graph) { KorGraph_Notify(graph, GN_CLEAR, 0); }
 

@@ -14,8 +14,6 @@ namespace kor {
 
 namespace {
 
-constexpr int RoundedUpTo4(int pixels) { return (pixels + 3) / 4 * 4; }
-
 void ReplaceBitmap(GraphRecord& graph, int width, int height) {
     WindowDC window(graph.hwnd);
     HBITMAP bitmap = CreateCompatibleBitmap(window.get(), std::max(RoundedUpTo4(width), 1),

@@ -5,6 +5,9 @@
 
 namespace kor {
 
+// Both sizes of the image's bitmap are multiples of 4.
+constexpr int RoundedUpTo4(int pixels) { return (pixels + 3) / 4 * 4; }
+
 // Makes the image for a client size, scales both axes and draws.
 void ResizeImage(GraphRecord& graph, int width, int height);
 

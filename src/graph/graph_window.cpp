@@ -5,10 +5,13 @@
 
 #include "graph/children/legend.h"
 #include "graph/children/tooltip.h"
+#include "graph/graph_clipboard.h"
+#include "graph/graph_command_bar.h"
 #include "graph/graph_image.h"
 #include "graph/graph_layout.h"
 #include "graph/graph_legend.h"
 #include "graph/graph_live.h"
+#include "graph/graph_pages.h"
 #include "graph/graph_palette.h"
 #include "graph/graph_pointer.h"
 #include "graph/graph_record.h"
@@ -129,6 +132,9 @@ bool OnNotify(GraphRecord& graph, WPARAM code, LPARAM argument) {
     switch (code) {
     case GN_RESET: OnReset(graph, argument != 0); return true;
     case GN_CLEAR: OnReset(graph, false); return true;
+    case GN_PROPERTIES:
+        if (graph.hwnd) RunGraphProperties(graph.hwnd);
+        return true;
     case GN_REDRAW: RedrawGraph(graph); return true;
     case GN_LIVEUPDATE: OnLiveUpdate(graph, argument); return true;
     case GN_SETVALUE:
@@ -158,6 +164,7 @@ LRESULT CALLBACK GraphProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam
         if (graph->hwnd) PaintFromImage(*graph);
         break;
     case WM_ERASEBKGND: return OnEraseBackground(*graph, reinterpret_cast<HDC>(wParam));
+    case WM_SHOWWINDOW: ReloadShowGraphToolTip(wParam != 0); break;
     case WM_LBUTTONDOWN:
         return OnGraphButtonDown(*graph, SignedLowWord(lParam), SignedHighWord(lParam));
     case WM_LBUTTONUP: return OnGraphButtonUp(*graph);
@@ -191,6 +198,7 @@ LRESULT CALLBACK GraphProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam
     case GM_SETBKCOLOR: SetBackgroundColour(*graph, static_cast<COLORREF>(number)); return 0;
     case GM_GETZOOM: return Store<LONG>(lParam, ZoomIndex(*graph));
     case GM_GETRANGE: return OnGetRange(*graph, reinterpret_cast<GraphRange*>(lParam));
+    case GM_COPY: CopyGraphToClipboard(*graph); return 0;
     default: break;
     }
     return DefWindowProcW(hwnd, message, wParam, lParam);

@@ -58,6 +58,22 @@ private:
     HDC dc_;
 };
 
+// A memory DC of its own.
+class MemoryDC {
+public:
+    explicit MemoryDC(HDC like) noexcept : dc_(CreateCompatibleDC(like)) {}
+    ~MemoryDC() {
+        if (dc_) DeleteDC(dc_);
+    }
+    MemoryDC(const MemoryDC&) = delete;
+    MemoryDC& operator=(const MemoryDC&) = delete;
+
+    HDC get() const noexcept { return dc_; }
+
+private:
+    HDC dc_;
+};
+
 // BeginPaint and EndPaint.
 class PaintScope {
 public:

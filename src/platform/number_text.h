@@ -12,4 +12,7 @@ constexpr int kNumberTextCapacity = 40;
 // is called, and in the digits of the exponent.
 void FormatSignificant(double value, int digits, wchar_t (&text)[kNumberTextCapacity]);
 
+// The number at a text's beginning, whatever follows it; 0 where there is none.
+double NumberFromText(const wchar_t* text);
+
 }  // namespace kor

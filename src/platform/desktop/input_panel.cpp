@@ -1,0 +1,10 @@
+// A desktop has a keyboard.
+#include "platform/input_panel.h"
+
+namespace kor {
+
+void ShowInputPanel() {}
+
+void HideInputPanel() {}
+
+}  // namespace kor
