@@ -1,21 +1,12 @@
 // What the program knows about its chart view. The chart itself is asked for its type, zoom and
-// options.
+// options; what is charted belongs to the sheet (see ChartChoice).
 #pragma once
 
 #include <windows.h>
 
-#include <optional>
-#include <string>
-
 #include "chart_data.h"
 
 namespace workbook {
-
-struct ChartTitles {
-    std::wstring chart;
-    std::wstring categories;
-    std::wstring values;
-};
 
 struct LiveDemonstration {
     bool isRunning = false;
@@ -30,10 +21,7 @@ struct Chart {
 
     bool isShown = false;
     bool isStale = false;  // the sheet was edited; brought up to date when no message waits
-    Block block;
-    ChartData data;                     // as the chart has it
-    std::optional<ChartTitles> titles;  // chosen by the user; otherwise they follow the sheet
-    std::optional<ValueRange> range;    // fixed by the user; otherwise automatic
+    ChartData data;        // as the chart has it
     COLORREF background = RGB(255, 255, 255);
     LiveDemonstration live;
 };

@@ -45,14 +45,20 @@ void ShowPane(Workbook& workbook, bool shown) {
 
 void ChartSelection(Workbook& workbook) {
     CommitTyping(workbook);
-    ChartBlockOf(workbook, SelectedBlock());
     if (!workbook.chart.isShown) ShowPane(workbook, true);
+    ChartBlockOf(workbook, SelectedBlock());
 }
 
+// With a single cell selected the chart comes back as it was.
 void ToggleChart(Workbook& workbook) {
-    if (!workbook.chart.isShown) return ChartSelection(workbook);
-    StopLiveData(workbook);
-    ShowPane(workbook, false);
+    if (workbook.chart.isShown) {
+        StopLiveData(workbook);
+        return ShowPane(workbook, false);
+    }
+    if (SelectedBlock() != BlockOf(CurrentCell())) return ChartSelection(workbook);
+    CommitTyping(workbook);
+    ShowPane(workbook, true);
+    ShowChartOfSheet(workbook);
 }
 
 // Titles and ranges belong to values and categories, the chart's to x and y.
@@ -93,7 +99,7 @@ void ChooseBackground(Workbook& workbook) {
 }
 
 void SetChartRange(Workbook& workbook, const std::optional<ValueRange>& range) {
-    workbook.chart.range = range;
+    workbook.sheetView().chart.values = range;
     ApplyRange(workbook);
     DrawChart(workbook);
 }
@@ -175,7 +181,7 @@ void PrepareChartMenu(const Workbook& workbook, HMENU menu) {
     MarkOne(menu, IDM_CHART_BACKGROUND_WHITE, IDM_CHART_BACKGROUND_CHOOSE,
             BackgroundCommand(chart.background));
     Check(menu, IDM_CHART_LEGEND, IsLegendShown(workbook));
-    Check(menu, IDM_CHART_RANGE_AUTOMATIC, !chart.range);
+    Check(menu, IDM_CHART_RANGE_AUTOMATIC, !workbook.sheetView().chart.values);
     MarkOne(menu, IDM_CHART_LIVE_OFF, IDM_CHART_LIVE_REPLACE, LiveCommand(chart.live));
 }
 

@@ -26,6 +26,14 @@ struct ValueRange {
     friend bool operator==(const ValueRange&, const ValueRange&) = default;
 };
 
+struct ChartTitles {
+    std::wstring chart;
+    std::wstring categories;
+    std::wstring values;
+
+    friend bool operator==(const ChartTitles&, const ChartTitles&) = default;
+};
+
 // The block that a selection means: its part with anything in it, for a single cell all of the
 // sheet.
 Block ChartedBlock(const Sheet& sheet, const Block& selection);

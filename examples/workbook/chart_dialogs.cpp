@@ -101,7 +101,7 @@ void EditChartTitles(Workbook& workbook) {
              &titles)) {
         return;
     }
-    workbook.chart.titles = titles;
+    workbook.sheetView().chart.titles = titles;
     ApplyTitles(workbook);
     DrawChart(workbook);
 }
@@ -112,7 +112,7 @@ void EditChartRange(Workbook& workbook) {
              &range)) {
         return;
     }
-    workbook.chart.range = range;
+    workbook.sheetView().chart.values = range;
     ApplyRange(workbook);
     DrawChart(workbook);
 }

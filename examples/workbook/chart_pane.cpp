@@ -53,7 +53,7 @@ void PlaceLegend(const Chart& chart) {
 }
 
 HWND CreateGraph(const Workbook& workbook, int id, DWORD style) {
-    return CreateWindowExW(0, KORGRAPH_CLASS, nullptr, kGraphStyle | style, 0, 0, 0, 0,
+    return CreateWindowExW(0, GetGraphControlClassName(), nullptr, kGraphStyle | style, 0, 0, 0, 0,
                            workbook.chart.pane, reinterpret_cast<HMENU>(INT_PTR{id}),
                            workbook.instance, nullptr);
 }

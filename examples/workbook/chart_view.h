@@ -13,8 +13,9 @@ struct Workbook;
 // Charts a block, with titles of the sheet and automatic ranges.
 void ChartBlockOf(Workbook& workbook, const Block& selection);
 
-// The same after another document was opened.
-void ChartNewDocument(Workbook& workbook);
+// Charts what was chosen of the current sheet, at first all of it. Does nothing while the chart is
+// hidden.
+void ShowChartOfSheet(Workbook& workbook);
 
 // After edits: changes values in place where it can, or hands over everything anew. To be called
 // when no message waits.

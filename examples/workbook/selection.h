@@ -11,6 +11,9 @@ struct Workbook;
 Block SelectedBlock();
 CellAddress CurrentCell();
 
+// The cell at the view's top left.
+CellAddress FirstVisibleCell();
+
 // Selects a block, scrolls to its first cell and shows that cell in the equation bar.
 void GoTo(Workbook& workbook, const Block& block);
 

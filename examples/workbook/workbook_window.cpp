@@ -12,6 +12,7 @@
 #include "file_commands.h"
 #include "grid_host.h"
 #include "resource.h"
+#include "sheet_switch.h"
 #include "status_line.h"
 #include "view_commands.h"
 #include "workbook.h"
@@ -104,9 +105,9 @@ LRESULT Dispatch(Workbook& workbook, UINT message, WPARAM wParam, LPARAM lParam)
         return 0;
     case WM_DROPFILES: OnDropFiles(workbook, reinterpret_cast<HDROP>(wParam)); return 0;
     case WM_CLOSE:
-        if (MayDiscard(workbook)) DestroyWindow(window);
+        if (MayEnd(workbook)) DestroyWindow(window);
         return 0;
-    case WM_QUERYENDSESSION: return MayDiscard(workbook);
+    case WM_QUERYENDSESSION: return MayEnd(workbook);
     case WM_DESTROY: OnDestroy(workbook); return 0;
     default: break;
     }
@@ -147,7 +148,7 @@ bool RegisterWorkbookClass(HINSTANCE instance) {
 
 }  // namespace
 
-bool CreateWorkbookWindow(Workbook& workbook, const std::wstring& file, int show) {
+bool CreateWorkbookWindow(Workbook& workbook, const std::vector<std::wstring>& files, int show) {
     if (!RegisterGridControl(workbook.instance) || !RegisterWorkbookClass(workbook.instance)) {
         return false;
     }
@@ -158,11 +159,11 @@ bool CreateWorkbookWindow(Workbook& workbook, const std::wstring& file, int show
                          workbook.instance, &workbook)) {
         return false;
     }
-    ShowDocumentFromStart(workbook);
+    ShowSheet(workbook);
     UpdateStatusBar(workbook);
     ShowWindow(workbook.window, show);
     UpdateWindow(workbook.window);
-    if (!file.empty()) OpenFile(workbook, file);
+    for (const std::wstring& file : files) OpenFile(workbook, file);
     return true;
 }
 
@@ -177,7 +178,7 @@ void LayOutWindow(const Workbook& workbook) {
 }
 
 void ShowTitle(const Workbook& workbook) {
-    const Document& document = workbook.document;
+    const Document& document = workbook.document();
     const std::wstring title = document.name() + L" - Workbook";
     SetWindowTextW(workbook.window, ((document.isModified() ? L"*" : L"") + title).c_str());
 }
