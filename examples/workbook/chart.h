@@ -14,10 +14,19 @@ struct LiveDemonstration {
     int step = 0;
 };
 
+// The bar belongs to the main window, the combo boxes to the bar.
+struct ChartBar {
+    HWND window = nullptr;
+    HWND zoom = nullptr;
+    HWND type = nullptr;
+};
+
 struct Chart {
+    ChartBar bar;
     HWND pane = nullptr;  // borderless, so that the tooltip is placed right: see chart_pane.h
     HWND graph = nullptr;
-    HWND liveGraph = nullptr;  // shown while the demonstration runs
+    HWND livePane = nullptr;  // in the pane, shown while the demonstration runs
+    HWND liveGraph = nullptr;
 
     bool isShown = false;
     bool isStale = false;  // the sheet was edited; brought up to date when no message waits

@@ -7,6 +7,7 @@
 
 #include "chart_dialogs.h"
 #include "chart_live.h"
+#include "chart_output.h"
 #include "chart_pane.h"
 #include "chart_view.h"
 #include "equation_bar.h"
@@ -40,6 +41,8 @@ void ShowPane(Workbook& workbook, bool shown) {
     workbook.chart.isShown = shown;
     LayOutWindow(workbook);
     ShowWindow(workbook.chart.pane, shown ? SW_SHOW : SW_HIDE);
+    // The chart's own visibility chooses the bar's tooltip, "Show Grid" or "Show Graph".
+    ShowWindow(workbook.chart.graph, shown ? SW_SHOW : SW_HIDE);
     UpdateScrollRanges(workbook);
 }
 
@@ -156,8 +159,11 @@ void RunChartCommand(Workbook& workbook, UINT command) {
     switch (command) {
     case IDM_CHART_LEGEND: return ToggleLegend(workbook);
     case IDM_CHART_TITLES: return EditChartTitles(workbook);
+    case IDM_CHART_PROPERTIES: return EditChartProperties(workbook);
+    case IDM_CHART_COPY: return CopyChart(workbook);
     case IDM_CHART_RANGE_AUTOMATIC: return SetChartRange(workbook, std::nullopt);
-    case IDM_CHART_RANGE_FIX: return SetChartRange(workbook, ShownRange(workbook));
+    case IDM_CHART_RANGE_FIX:
+        return SetChartRange(workbook, ShownRange(workbook, ValueAxis(workbook)));
     case IDM_CHART_RANGE_EDIT: return EditChartRange(workbook);
     case IDM_CHART_LIVE_OFF: return StopLiveData(workbook);
     case IDM_CHART_LIVE_SWEEP: return StartLiveData(workbook, KORGRAPH_SWEEP);

@@ -107,7 +107,7 @@ void EditChartTitles(Workbook& workbook) {
 }
 
 void EditChartRange(Workbook& workbook) {
-    ValueRange range = ShownRange(workbook);
+    ValueRange range = ShownRange(workbook, ValueAxis(workbook));
     if (!Ask(workbook, IDD_CHART_RANGE, DialogProc<ValueRange, FillRange, OnRangeAccepted>,
              &range)) {
         return;

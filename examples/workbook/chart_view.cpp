@@ -114,8 +114,6 @@ void ApplyAxis(HWND graph, LONG axis, const std::optional<ValueRange>& range) {
     }
 }
 
-constexpr LONG OtherAxis(LONG axis) { return axis == KORGRAPH_X ? KORGRAPH_Y : KORGRAPH_X; }
-
 }  // namespace
 
 void ChartBlockOf(Workbook& workbook, const Block& selection) {
@@ -184,8 +182,8 @@ ChartTitles ShownTitles(const Workbook& workbook) {
     return workbook.sheetView().chart.titles.value_or(TitlesOfSheet(workbook));
 }
 
-ValueRange ShownRange(const Workbook& workbook) {
-    GraphRange range = {ValueAxis(workbook), 0, 0, 0};
+ValueRange ShownRange(const Workbook& workbook, LONG axis) {
+    GraphRange range = {axis, 0, 0, 0};
     SendMessageW(workbook.chart.graph, GM_GETRANGE, 0, reinterpret_cast<LPARAM>(&range));
     return {range.min, range.max};
 }
@@ -198,5 +196,7 @@ void DrawChart(const Workbook& workbook) {
 LONG ValueAxis(const Workbook& workbook) {
     return KorGraph_GetType(workbook.chart.graph) == KORGRAPH_BAR ? KORGRAPH_X : KORGRAPH_Y;
 }
+
+LONG OtherAxis(LONG axis) { return axis == KORGRAPH_X ? KORGRAPH_Y : KORGRAPH_X; }
 
 }  // namespace workbook

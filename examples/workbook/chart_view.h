@@ -29,12 +29,13 @@ void ApplyRange(const Workbook& workbook);
 
 // As the chart shows them now.
 ChartTitles ShownTitles(const Workbook& workbook);
-ValueRange ShownRange(const Workbook& workbook);
+ValueRange ShownRange(const Workbook& workbook, LONG axis);
 
 // Draws the chart and lets the screen show it: the chart only draws its image.
 void DrawChart(const Workbook& workbook);
 
-// Which axis has the values: in a bar chart x, otherwise y.
+// Which axis has the values: in a bar chart x, otherwise y. The other one has the categories.
 LONG ValueAxis(const Workbook& workbook);
+LONG OtherAxis(LONG axis);
 
 }  // namespace workbook

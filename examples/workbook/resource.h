@@ -12,6 +12,12 @@
 /* Child windows of the chart pane. */
 #define IDC_CHART 104
 #define IDC_LIVE_CHART 105
+#define IDC_LIVE_PANE 106
+
+/* The chart's bar, a child of the main window, and its combo boxes. */
+#define IDC_CHART_BAR 107
+#define IDC_ZOOM_COMBO 108
+#define IDC_TYPE_COMBO 109
 
 /* Resources. */
 #define IDR_MENU 200
@@ -35,6 +41,7 @@
 #define IDM_FILE_SAVE_AS 1004
 #define IDM_FILE_EXIT 1005
 #define IDM_FILE_CLOSE 1006
+#define IDM_FILE_PRINT 1007
 
 /* Edit. */
 #define IDM_EDIT_UNDO 1101
@@ -85,6 +92,8 @@
 #define IDM_CHART_PIE 1615
 #define IDM_CHART_LEGEND 1621
 #define IDM_CHART_TITLES 1622
+#define IDM_CHART_PROPERTIES 1623
+#define IDM_CHART_COPY 1624
 #define IDM_CHART_ZOOM_25 1631
 #define IDM_CHART_ZOOM_50 1632
 #define IDM_CHART_ZOOM_100 1633

@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <new>
 
+#include "chart_bar.h"
 #include "chart_pane.h"
 #include "chart_view.h"
 #include "commands.h"
@@ -38,7 +39,10 @@ bool OnCreate(Workbook& workbook, HWND window) {
     workbook.grid =
         CreateWindowExW(0, KORGRID_CLASS, nullptr, kGridStyle, 0, 0, 0, 0, window,
                         reinterpret_cast<HMENU>(INT_PTR{IDC_GRID}), workbook.instance, nullptr);
-    if (!workbook.grid || !workbook.statusBar || !CreateChartPane(workbook)) return false;
+    if (!workbook.grid || !workbook.statusBar || !CreateChartPane(workbook) ||
+        !CreateChartBar(workbook)) {
+        return false;
+    }
     PrepareEquationBar(workbook);
     SetFunctionButtonMessageID(IDM_FUNCTIONS);
     DragAcceptFiles(window, TRUE);
@@ -98,7 +102,11 @@ LRESULT Dispatch(Workbook& workbook, UINT message, WPARAM wParam, LPARAM lParam)
     case WM_SETCURSOR:
         if (OnSetCursor(workbook, reinterpret_cast<HWND>(wParam), LOWORD(lParam))) return TRUE;
         break;
-    case WM_COMMAND: RunCommand(workbook, LOWORD(wParam)); return 0;
+    case WM_COMMAND:
+        if (!OnChartBarCommand(workbook, LOWORD(wParam), HIWORD(wParam))) {
+            RunCommand(workbook, LOWORD(wParam));
+        }
+        return 0;
     case WM_INITMENUPOPUP: PrepareMenu(workbook, reinterpret_cast<HMENU>(wParam)); return 0;
     case WM_MOUSEWHEEL:
         OnMouseWheel(workbook, LOWORD(wParam), static_cast<short>(HIWORD(wParam)));
@@ -171,10 +179,13 @@ void LayOutWindow(const Workbook& workbook) {
     RECT area = {};
     GetClientRect(workbook.window, &area);
     const int width = static_cast<int>(area.right);
-    const int height = std::max(0, static_cast<int>(area.bottom) - LayoutStatusBar(workbook));
+    const int top = ChartBarHeight(workbook);
+    const int bottom = static_cast<int>(area.bottom) - LayoutStatusBar(workbook);
+    const int height = std::max(0, bottom - top);
     const int gridWidth = width - ChartPaneWidth(workbook, width);
-    MoveWindow(workbook.grid, 0, 0, gridWidth, height, TRUE);
-    MoveWindow(workbook.chart.pane, gridWidth, 0, width - gridWidth, height, TRUE);
+    MoveWindow(workbook.chart.bar.window, 0, 0, width, top, TRUE);
+    MoveWindow(workbook.grid, 0, top, gridWidth, height, TRUE);
+    MoveWindow(workbook.chart.pane, gridWidth, top, width - gridWidth, height, TRUE);
 }
 
 void ShowTitle(const Workbook& workbook) {
@@ -189,6 +200,7 @@ void OnIdle(Workbook& workbook) noexcept {
         CatchUpWithGrid(workbook);
         RefreshChart(workbook);
         KeepTooltipsInPane(workbook);
+        RefreshChartBar(workbook);
     } catch (const std::bad_alloc&) {
         workbook.isOutOfMemory = true;
     }
