@@ -1,4 +1,6 @@
 // The window classes and who registers them.
+#include <korcontrols/funkybar.h>
+
 #include "support/import_spy.h"
 #include "support/recording_host.h"
 
@@ -135,6 +137,47 @@ TEST_F(WindowClasses, OfTheStripMayFailWithoutHarmToTheGrid) {
     ToggleViewStateOfHeaders();
     DestroyWindow(grid);
     EXPECT_NE(ColumnHeaderOf(createGrid(ProgramInstance())), nullptr);
+}
+
+TEST_F(WindowClasses, OfTheFunctionBarHasItsAttributes) {
+    const DWORD atom = InitFunkyControl(ProgramInstance());
+    EXPECT_NE(atom, 0u);
+    ASSERT_EQ(registered.size(), 1u);
+    EXPECT_EQ(registered[0].name, L"FunkyBarControl");
+    WNDCLASSW attributes{};
+    EXPECT_EQ(GetClassInfoW(ProgramInstance(), L"FunkyBarControl", &attributes),
+              static_cast<int>(atom));
+    for (const WNDCLASSW& each : {attributes, registered[0].attributes}) {
+        EXPECT_EQ(each.style, 0u);
+        EXPECT_NE(each.lpfnWndProc, nullptr);
+        EXPECT_EQ(each.cbClsExtra, 0);
+        EXPECT_EQ(each.cbWndExtra, 0);
+        EXPECT_EQ(each.hInstance, ProgramInstance());
+        EXPECT_EQ(each.hIcon, nullptr);
+        EXPECT_EQ(each.hCursor, nullptr);
+        EXPECT_EQ(each.hbrBackground, nullptr);
+        EXPECT_EQ(each.lpszMenuName, nullptr);
+    }
+}
+
+TEST_F(WindowClasses, OfTheFunctionBarNeedsAnInstance) {
+    EXPECT_EQ(InitFunkyControl(nullptr), 0u);
+    EXPECT_TRUE(registered.empty());
+}
+
+TEST_F(WindowClasses, OfTheFunctionBarIsRegisteredOncePerInstance) {
+    HINSTANCE other = GetModuleHandleW(L"gdi32.dll");
+    EXPECT_NE(InitFunkyControl(ProgramInstance()), 0u);
+    EXPECT_EQ(InitFunkyControl(ProgramInstance()), 0u);
+    EXPECT_NE(InitFunkyControl(other), 0u);
+    EXPECT_EQ(registered.size(), 3u) << "asked for each time";
+    EXPECT_TRUE(isRegistered(other, KORFUNKYBAR_CLASS));
+}
+
+TEST_F(WindowClasses, OfTheFunctionBarReportsFailure) {
+    spy.failNth("RegisterClassW", 1, 0, ERROR_NOT_ENOUGH_MEMORY);
+    EXPECT_EQ(InitFunkyControl(ProgramInstance()), 0u);
+    EXPECT_NE(InitFunkyControl(ProgramInstance()), 0u);
 }
 
 TEST_F(WindowClasses, StayRegisteredAfterTheGridIsGone) {

@@ -5,6 +5,7 @@
 #include <gtest/gtest.h>
 
 #include <cstdio>
+#include <cstring>
 #include <fstream>
 #include <sstream>
 
@@ -51,11 +52,25 @@ TEST(ExportTable, HasUndecoratedNamesAndFixedOrdinals) {
     EXPECT_EQ(exported.at("RegisterGridControl"), 2);
     EXPECT_EQ(exported.at("ResetGrid"), 5);
     EXPECT_EQ(exported.at("PressOKButton"), 30);
+    EXPECT_EQ(exported.at("InitFunkyControl"), 4);
 }
 
 TEST(ImportTable, NamesThePlatformsLibrariesOnly) {
     EXPECT_EQ(ImportedLibraries(LibraryModule()),
-              (std::set<std::string>{"gdi32.dll", "kernel32.dll", "msvcrt.dll", "user32.dll"}));
+              (std::set<std::string>{"comctl32.dll", "gdi32.dll", "kernel32.dll", "msvcrt.dll",
+                                     "user32.dll"}));
+}
+
+// A BITMAPINFOHEADER, then sixteen colours: the platform's standard ones, which every display has.
+TEST(Resources, HoldTheFunctionBarsArrow) {
+    const std::string bytes = ResourceBytes(LibraryModule(), 107, 2);
+    ASSERT_GE(bytes.size(), sizeof(BITMAPINFOHEADER));
+    BITMAPINFOHEADER header{};
+    memcpy(&header, bytes.data(), sizeof header);
+    EXPECT_EQ(header.biWidth, 13);
+    EXPECT_EQ(header.biHeight, 8);
+    EXPECT_EQ(header.biBitCount, 4);
+    EXPECT_EQ(bytes.size(), sizeof header + 16 * sizeof(RGBQUAD) + 8 * 8);
 }
 
 }  // namespace

@@ -1,7 +1,12 @@
 // The public headers where C, old C++ and today's C++ meet. Most checks are made by the compiler,
 // in headers_c90.c.
+#include <korcontrols/funkybar.h>
+#include <korcontrols/graph.h>
 #include <korcontrols/grid.h>
 #include <korcontrols/header.h>
+#include <korcontrols/legend.h>
+#include <korcontrols/listhelpers.h>
+#include <korcontrols/tooltip.h>
 
 #include <gtest/gtest.h>
 
@@ -22,6 +27,10 @@ TEST(PublicHeaders, GiveEveryLanguageTheSameSizes) {
 TEST(PublicHeaders, NameTheClasses) {
     EXPECT_EQ(std::wstring(KORGRID_CLASS), L"KV Grid Control");
     EXPECT_EQ(std::wstring(KORHEADER_CLASS), L"korvane Header");
+    EXPECT_EQ(std::wstring(KORGRAPH_CLASS), L"KORVANE Corporation GraphControl");
+    EXPECT_EQ(std::wstring(KORLEGEND_CLASS), L"KORVANE Corporation LegendControl");
+    EXPECT_EQ(std::wstring(KORTOOLTIP_CLASS), L"KORVANE Corporation ToolTipControl");
+    EXPECT_EQ(std::wstring(KORFUNKYBAR_CLASS), L"FunkyBarControl");
 }
 
 }  // namespace

@@ -89,6 +89,12 @@ constexpr Signature kStdcall[] = {
     {"SetScrollRange", 5},
     {"SetTimer", 4},
     {"ShowScrollBar", 3},
+    {"GetMessagePos", 0},
+    // user32: menus
+    {"AppendMenuW", 4},
+    {"CreatePopupMenu", 0},
+    {"DestroyMenu", 1},
+    {"TrackPopupMenuEx", 6},
     // user32: painting
     {"BeginPaint", 2},
     {"DrawTextW", 5},
@@ -108,6 +114,11 @@ constexpr Signature kStdcall[] = {
     {"ReleaseDC", 2},
     {"SetRect", 5},
     {"ValidateRect", 2},
+    // comctl32
+    {"ImageList_Destroy", 1},
+    {"ImageList_Draw", 6},
+    {"ImageList_GetImageInfo", 3},
+    {"ImageList_LoadImageW", 7},
     // gdi32
     {"BitBlt", 9},
     {"CombineRgn", 4},
@@ -161,7 +172,7 @@ constexpr Signature kStdcall[] = {
 
 constexpr Signature kCdecl[] = {
     {"_itow", 3},   {"_wtol", 1},  {"calloc", 2},  {"free", 1},   {"malloc", 1}, {"memcpy", 3},
-    {"memmove", 3}, {"memset", 3}, {"realloc", 2}, {"wcscpy", 2}, {"wcslen", 1},
+    {"memmove", 3}, {"memset", 3}, {"realloc", 2}, {"wcscpy", 2}, {"wcslen", 1}, {"wcsncpy", 3},
 };
 
 template <size_t count>

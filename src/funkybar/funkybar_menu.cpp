@@ -1,0 +1,56 @@
+#include "funkybar/funkybar_menu.h"
+
+#include "funkybar/funkybar_drawing.h"
+#include "funkybar/funkybar_items.h"
+#include "funkybar/funkybar_layout.h"
+#include "funkybar/funkybar_selection.h"
+
+namespace kor {
+
+namespace {
+
+// An entry's command is its item's position, counted from 1: 0 means that nothing was chosen.
+void AppendEntries(HMENU menu) {
+    UINT_PTR command = 1;
+    for (const FunkyBarItem* item = funkyBar.first; item; item = item->next, ++command) {
+        AppendMenuW(menu, MF_OWNERDRAW, command, reinterpret_cast<LPCWSTR>(item));
+    }
+}
+
+// The item of an entry's data, null when it is not in the list any more.
+const FunkyBarItem* ItemOfEntry(ULONG_PTR data) {
+    return ItemAt(IndexOfItem(reinterpret_cast<const void*>(data)));
+}
+
+}  // namespace
+
+LRESULT OpenItemMenu(HWND hwnd) {
+    RECT bar = {};
+    GetWindowRect(hwnd, &bar);
+    HMENU menu = CreatePopupMenu();
+    if (!menu) return 0;
+    AppendEntries(menu);
+    const BOOL command =
+        TrackPopupMenuEx(menu, TPM_RETURNCMD, kMenuLeft, bar.bottom, hwnd, nullptr);
+    if (command > 0 && IsWindow(hwnd)) SelectItem(hwnd, command - 1);
+    DestroyMenu(menu);
+    return 0;
+}
+
+LRESULT OnMeasureEntry(HWND hwnd, MEASUREITEMSTRUCT* entry) {
+    if (!entry) return 0;
+    const FunkyBarItem* item = ItemOfEntry(entry->itemData);
+    const SIZE size = item ? MeasureEntry(hwnd, *item) : SIZE{};
+    entry->itemWidth = static_cast<UINT>(size.cx);
+    entry->itemHeight = static_cast<UINT>(size.cy);
+    return 1;
+}
+
+LRESULT OnDrawEntry(const DRAWITEMSTRUCT* entry) {
+    if (!entry) return 0;
+    const bool selected = (entry->itemState & ODS_SELECTED) != 0;
+    DrawEntry(entry->hDC, entry->rcItem, ItemOfEntry(entry->itemData), selected);
+    return 1;
+}
+
+}  // namespace kor
