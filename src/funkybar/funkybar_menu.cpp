@@ -22,16 +22,24 @@ const FunkyBarItem* ItemOfEntry(ULONG_PTR data) {
     return ItemAt(IndexOfItem(reinterpret_cast<const void*>(data)));
 }
 
+// The chosen command, 0 for none.
+int32_t TrackMenu(HWND hwnd, HMENU menu, int top) {
+    funkyBar.menuOpen = true;
+    const BOOL command = TrackPopupMenuEx(menu, TPM_RETURNCMD, kMenuLeft, top, hwnd, nullptr);
+    funkyBar.menuOpen = false;
+    return command;
+}
+
 }  // namespace
 
 LRESULT OpenItemMenu(HWND hwnd) {
+    if (funkyBar.menuOpen) return 0;
     RECT bar = {};
     GetWindowRect(hwnd, &bar);
     HMENU menu = CreatePopupMenu();
     if (!menu) return 0;
     AppendEntries(menu);
-    const BOOL command =
-        TrackPopupMenuEx(menu, TPM_RETURNCMD, kMenuLeft, bar.bottom, hwnd, nullptr);
+    const int32_t command = TrackMenu(hwnd, menu, bar.bottom);
     if (command > 0 && IsWindow(hwnd)) SelectItem(hwnd, command - 1);
     DestroyMenu(menu);
     return 0;

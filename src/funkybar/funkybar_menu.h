@@ -7,7 +7,7 @@
 namespace kor {
 
 // Opens the menu below the bar, waits for the choice and selects it. Always 0. The window may be
-// gone when this returns.
+// gone when this returns. While a menu is open this does nothing.
 LRESULT OpenItemMenu(HWND hwnd);
 
 // WM_MEASUREITEM and WM_DRAWITEM of an entry: 1, or 0 for a null pointer.

@@ -28,6 +28,7 @@ struct FunkyBarState {
     HIMAGELIST itemImages;   // the host's, never destroyed here; outlives the window
     HIMAGELIST arrowImages;  // from WM_CREATE to WM_DESTROY
     HFONT font;              // likewise
+    bool menuOpen;           // some bar waits for its menu
 };
 
 extern FunkyBarState funkyBar;

@@ -41,7 +41,9 @@ LRESULT OnCreate(HWND hwnd) {
     return 0;
 }
 
-LRESULT OnDestroy() {
+// An open menu would stay on the screen, and its loop wait for ever, when its window has gone.
+LRESULT OnDestroy(HWND hwnd) {
+    if (funkyBar.menuOpen) SendMessageW(hwnd, WM_CANCELMODE, 0, 0);
     RemoveAllItems();
     if (funkyBar.font) DeleteObject(funkyBar.font);
     funkyBar.font = nullptr;
@@ -84,7 +86,7 @@ LRESULT OnDeleteAll(HWND hwnd) {
 LRESULT CALLBACK FunkyBarProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
     switch (message) {
     case WM_CREATE: return OnCreate(hwnd);
-    case WM_DESTROY: return OnDestroy();
+    case WM_DESTROY: return OnDestroy(hwnd);
     case WM_PAINT: return OnPaint(hwnd);
     case WM_LBUTTONDOWN: return OpenItemMenu(hwnd);
     case WM_DRAWITEM: return OnDrawEntry(reinterpret_cast<const DRAWITEMSTRUCT*>(lParam));

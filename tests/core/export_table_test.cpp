@@ -53,6 +53,11 @@ TEST(ExportTable, HasUndecoratedNamesAndFixedOrdinals) {
     EXPECT_EQ(exported.at("ResetGrid"), 5);
     EXPECT_EQ(exported.at("PressOKButton"), 30);
     EXPECT_EQ(exported.at("InitFunkyControl"), 4);
+    EXPECT_EQ(exported.at("KorListView_UpdateItem"), 34);
+    EXPECT_EQ(exported.at("KorListView_GetIndexFromCurrentPosition"), 35);
+    EXPECT_EQ(exported.at("KorListView_DeleteAll"), 36);
+    EXPECT_EQ(exported.at("KorListView_GetSelection"), 37);
+    EXPECT_EQ(exported.at("KorTreeView_AddItem"), 38);
 }
 
 TEST(ImportTable, NamesThePlatformsLibrariesOnly) {
