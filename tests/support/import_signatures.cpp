@@ -168,6 +168,19 @@ constexpr Signature kStdcall[] = {
     {"SetTextColor", 2},
     {"StretchBlt", 11},
     {"TextOutW", 5},
+    // dialogs, clipboard
+    {"CloseClipboard", 0},
+    {"CreatePropertySheetPageW", 1},
+    {"DestroyPropertySheetPage", 1},
+    {"EmptyClipboard", 0},
+    {"GdiFlush", 0},
+    {"GetDlgItemTextW", 4},
+    {"MessageBoxW", 4},
+    {"OpenClipboard", 1},
+    {"PropertySheetW", 1},
+    {"SendDlgItemMessageW", 5},
+    {"SetClipboardData", 2},
+    {"SetDlgItemTextW", 3},
 };
 
 constexpr Signature kCdecl[] = {
