@@ -11,7 +11,8 @@
  * are exclusive, ends of a selection inclusive. Sizes "in units" are pixels at 100 % zoom.
  *
  * Functions called before the grid's window exists, or after it is gone, keep or return what the
- * grid knows and draw nothing. */
+ * grid knows and draw nothing. After it is gone those that redraw still ask its parent to paint
+ * cells (GRIDN_PAINTCELLS); nothing comes of the answers. */
 #ifndef KORCONTROLS_GRID_H
 #define KORCONTROLS_GRID_H
 

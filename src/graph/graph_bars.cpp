@@ -2,6 +2,8 @@
 // they have become so thin that several share a pixel, the lowest and the highest cover them all.
 #include "graph/graph_bars.h"
 
+#include <algorithm>
+
 #include "graph/graph_frame.h"
 #include "graph/graph_numbers.h"
 #include "graph/graph_points.h"
@@ -18,43 +20,47 @@ struct BarLayout {
     int lowPixel;     // the view along that axis
     int highPixel;
     int thickness;
-    void (*draw)(const GraphRecord& graph, HDC dc, int number, double value, int offset,
-                 int thickness);
+    RECT (*place)(const GraphRecord& graph, int number, double value, int offset, int thickness);
 };
 
 // Rows grow downwards, point numbers upwards: turned round they grow together.
 int RowUpwards(const GraphRecord& graph, double pointNumber) { return -yPixel(graph, pointNumber); }
 
-void DrawColumn(const GraphRecord& graph, HDC dc, int number, double value, int offset,
-                int thickness) {
-    const int base = yPixel(graph, 0);
+// Opposite corners, in any order.
+RECT PlaceColumn(const GraphRecord& graph, int number, double value, int offset, int thickness) {
     const int left = xPixel(graph, number) + offset;
-    const int end = yPixel(graph, value);
-    const POINT corners[] = {
-        {left, base}, {left, end}, {left + thickness, end}, {left + thickness, base}};
-    Polygon(dc, corners, 4);
+    return {left, yPixel(graph, 0), left + thickness, yPixel(graph, value)};
 }
 
-void DrawBar(const GraphRecord& graph, HDC dc, int number, double value, int offset,
-             int thickness) {
-    const int base = xPixel(graph, 0);
-    const int top = yPixel(graph, number) - offset;
-    const int end = xPixel(graph, value);
-    const POINT corners[] = {
-        {base, top}, {end, top}, {end, top - thickness}, {base, top - thickness}};
+RECT PlaceBar(const GraphRecord& graph, int number, double value, int offset, int thickness) {
+    const int bottom = yPixel(graph, number) - offset;
+    return {xPixel(graph, 0), bottom, xPixel(graph, value), bottom - thickness};
+}
+
+// Sides that lie out of view are moved to just outside it: Polygon's time grows with each row that
+// it spans, seen or not.
+void DrawBox(HDC dc, const RECT& view, const RECT& box) {
+    const auto column = [&](LONG x) { return std::clamp(x, view.left - 2, view.right + 2); };
+    const auto row = [&](LONG y) { return std::clamp(y, view.top - 2, view.bottom + 2); };
+    const POINT corners[] = {{column(box.left), row(box.top)},
+                             {column(box.left), row(box.bottom)},
+                             {column(box.right), row(box.bottom)},
+                             {column(box.right), row(box.top)}};
     Polygon(dc, corners, 4);
 }
 
 void DrawThinBars(const GraphRecord& graph, HDC dc, const GraphSeries& series,
                   const BarLayout& layout, PointRange range, int offset) {
+    const RECT view = PlotClip(graph);
+    const auto draw = [&](int number, double value) {
+        DrawBox(dc, view, layout.place(graph, number, value, offset, 0));
+    };
     for (int number = range.first; number <= range.last;) {
         const int end = EndOfPosition(graph, layout.along, range, number);
         const PositionSummary found = Summarise(series.values, number, end);
         if (found.first >= 0) {
-            layout.draw(graph, dc, number, series.values[found.lowest], offset, 0);
-            if (found.highest != found.lowest) {
-                layout.draw(graph, dc, number, series.values[found.highest], offset, 0);
-            }
+            draw(number, series.values[found.lowest]);
+            if (found.highest != found.lowest) draw(number, series.values[found.highest]);
         }
         number = end;
     }
@@ -62,9 +68,11 @@ void DrawThinBars(const GraphRecord& graph, HDC dc, const GraphSeries& series,
 
 void DrawThickBars(const GraphRecord& graph, HDC dc, const GraphSeries& series,
                    const BarLayout& layout, PointRange range, int offset) {
+    const RECT view = PlotClip(graph);
     for (int number = range.first; number <= range.last; ++number) {
         const double value = series.values[number - 1];
-        if (IsFinite(value)) layout.draw(graph, dc, number, value, offset, layout.thickness);
+        if (!IsFinite(value)) continue;
+        DrawBox(dc, view, layout.place(graph, number, value, offset, layout.thickness));
     }
 }
 
@@ -101,7 +109,7 @@ void DrawColumnChart(GraphRecord& graph, HDC dc) {
         const RECT view = PlotClip(graph);
         DrawBars(
             graph, dc,
-            {xPixel, view.left, view.right, ZoomedThickness(graph, graph.barWidth), DrawColumn});
+            {xPixel, view.left, view.right, ZoomedThickness(graph, graph.barWidth), PlaceColumn});
     });
 }
 
@@ -110,7 +118,7 @@ void DrawBarChart(GraphRecord& graph, HDC dc) {
         const RECT view = PlotClip(graph);
         DrawBars(graph, dc,
                  {RowUpwards, -view.bottom, -view.top, ZoomedThickness(graph, graph.barHeight),
-                  DrawBar});
+                  PlaceBar});
     });
 }
 

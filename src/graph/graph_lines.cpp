@@ -1,5 +1,6 @@
 #include "graph/graph_lines.h"
 
+#include "graph/graph_area.h"
 #include "graph/graph_frame.h"
 #include "graph/graph_points.h"
 #include "graph/graph_scale.h"
@@ -27,9 +28,10 @@ void DrawAreaSeries(const GraphRecord& graph, HDC dc, const GraphSeries& series)
     SelectScope selected(dc, brush.get());
     const RECT view = PlotClip(graph);
     constexpr int kBasePoint = 1;
+    constexpr int kClosingPoint = 1;
     SeriesPoints points;
     if (!points.Make(graph, series, view.left - 1, view.right + 1, LastPosition::summarised,
-                     kBasePoint)) {
+                     kBasePoint + kClosingPoint)) {
         return;
     }
     const int base = yPixel(graph, 0);
@@ -37,7 +39,7 @@ void DrawAreaSeries(const GraphRecord& graph, HDC dc, const GraphSeries& series)
     const int count = points.count() + 2 * kBasePoint;
     corners[0] = {xPixel(graph, 1), base};
     corners[count - 1] = {xPixel(graph, series.pointCount), base};
-    Polygon(dc, corners, count);
+    DrawArea(dc, view, {corners, count});
 }
 
 }  // namespace

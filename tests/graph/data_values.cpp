@@ -1,6 +1,8 @@
 // Changing single values, and replacing a series' values.
 #include "graph/number_graph.h"
 
+#include "platform/local_text.h"
+
 #include <limits>
 
 namespace kortest {
@@ -214,6 +216,17 @@ TEST_F(GraphReplace, AppliesAutomaticRanges) {
     replace(0, {5, 50, 5});
     EXPECT_EQ(graph.xMax, 4.0);
     EXPECT_EQ(graph.yMax, 3.0) << "what the last add gave";
+}
+
+TEST_F(GraphReplace, GivesASeriesWithoutValuesItsOwn) {
+    kor::GraphSeries& series = add({1, 2});
+    kor::FreeLocal(series.values);
+    series.values = nullptr;
+    replace(0, {4, -6, 5});
+    EXPECT_EQ(series.pointCount, 3);
+    EXPECT_EQ(ValuesOf(series), (std::vector<double>{4, -6, 5}));
+    EXPECT_EQ(series.minValue, -6);
+    EXPECT_EQ(series.absSum, 15);
 }
 
 }  // namespace

@@ -142,6 +142,14 @@ TEST_F(GraphPieHit, StaleSumGivesStaleShares) {
     EXPECT_EQ(hit(30, 110), L"40%\r\nValue:6");
 }
 
+// The slices end before the circle does: what is left belongs to none.
+TEST_F(GraphPieHit, GapOfAStaleSumIsNoHit) {
+    add({1, 5, 9});
+    set(0, 1, 2);
+    EXPECT_EQ(hit(100, 40), L"6.7%\r\nValue:1");
+    EXPECT_EQ(hit(110, 40), L"-") << "the last fifth";
+}
+
 TEST_F(GraphPieHit, TinyImageIsSurvived) {
     add({1, 2});
     for (const int size : {0, 1, 7, 8, 9}) {

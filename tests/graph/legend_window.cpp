@@ -141,5 +141,21 @@ TEST_F(LegendWindow, OfStrangeRectanglesIsSurvived) {
     }
 }
 
+// Its creation answers 1, which is no failure to the platform: the window lives on, without a
+// graph.
+TEST_F(LegendWindow, WithoutAParentIsAnEmptyWindow) {
+    create();
+    showLegend({0, 0, 90, 60});  // registers the class
+    const HWND legend =
+        CreateWindowExW(0, L"KORVANE Corporation LegendControl", L"", WS_POPUP | WS_VISIBLE, 10, 10,
+                        60, 40, nullptr, nullptr, GetModuleHandleW(nullptr), nullptr);
+    ASSERT_NE(legend, nullptr);
+    InvalidateRect(legend, nullptr, TRUE);
+    EXPECT_TRUE(GetUpdateRect(legend, nullptr, FALSE));
+    EXPECT_EQ(SendMessageW(legend, WM_PAINT, 0, 0), 0);
+    EXPECT_FALSE(GetUpdateRect(legend, nullptr, FALSE));
+    EXPECT_TRUE(DestroyWindow(legend));
+}
+
 }  // namespace
 }  // namespace kortest

@@ -1,6 +1,8 @@
 // The scaling of an axis: units per pixel, tick step, bar size.
 #include "graph/number_graph.h"
 
+#include <limits>
+
 #include <ostream>
 
 namespace kortest {
@@ -206,6 +208,16 @@ TEST_F(GraphScaling, ZoomingOutNarrowsBarsAndZoomingInDoesNotWiden) {
     graph.zoom = 0.25;
     EXPECT_EQ(kor::ZoomedThickness(graph, 7), 1);
     EXPECT_EQ(kor::ZoomedThickness(graph, 3), 0);
+}
+
+// 0.95e308 / 4 * 2 units a pixel would be four times as many at a zoom of 25%, more than a double
+// holds.
+TEST_F(GraphScaling, ZoomedOutBeyondTheNumbersStaysFinite) {
+    graph.zoom = 0.25;
+    resizePlot(4, 100);
+    showX(-0.95e308, 0.95e308);
+    EXPECT_EQ(graph.xUnitsPerPixel, std::numeric_limits<double>::max());
+    EXPECT_EQ(kor::xPixel(graph, 0), 17);
 }
 
 TEST_F(GraphScaling, WaitsForAWindow) {

@@ -117,6 +117,17 @@ TEST_F(GridLifetime, SecondGridDeletesNothingOfTheFirst) {
     EXPECT_EQ(CountCalls(spy, "DeleteDC", dc), 0);
 }
 
+// A host that lays out its windows while they end: the next grid must not inherit this image.
+TEST_F(GridLifetime, SizeAfterTheEndMakesNoImage) {
+    create(400, 300);
+    spy.watchAll({"CreateCompatibleBitmap"});
+    SendMessageW(grid, WM_DESTROY, 0, 0);
+    SendMessageW(grid, WM_SIZE, SIZE_RESTORED, MAKELPARAM(400, 300));
+    EXPECT_EQ(spy.count("CreateCompatibleBitmap"), 0);
+    ASSERT_NE(host.createGrid(300, 200), nullptr);
+    EXPECT_EQ(spy.count("CreateCompatibleBitmap"), 1);
+}
+
 TEST_F(GridLifetime, EndAnswersZero) {
     create(400, 300);
     EXPECT_EQ(SendMessageW(grid, WM_DESTROY, 0, 0), 0);

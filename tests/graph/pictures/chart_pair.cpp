@@ -205,7 +205,7 @@ bool ChartPair::compare() {
 
 ::testing::AssertionResult ChartPair::same() {
     redraw();
-    if (!finished_) return ::testing::AssertionFailure() << "the walk from 0 was given up";
+    if (!finished_) return ::testing::AssertionFailure() << "drawing it literally takes too long";
     if (compare()) return ::testing::AssertionSuccess();
     return SamePicture(expected(), shown());
 }

@@ -9,16 +9,17 @@
 namespace kortest {
 
 // Draws into `dc`, whose pen, brush and text colour are the defaults, and notes in `state` which
-// pan arrows were drawn. False when a walk from 0 would take too long; the picture is unfinished.
+// pan arrows were drawn. False when a walk from 0 or the polygon of an area would take too long;
+// the picture is unfinished.
 bool DrawLiteral(ChartState& state, const ChartFonts& fonts, HDC dc);
 
 // Its parts.
 bool DrawLiteralFrame(ChartState& state, const ChartFonts& fonts, HDC dc,
-                      const std::function<void()>& drawSeries);
+                      const std::function<bool()>& drawSeries);
 void DrawLiteralTitle(const ChartState& state, const ChartFonts& fonts, HDC dc);
 bool DrawLiteralGrid(const ChartState& state, HDC dc, const RECT* bounds);
 bool DrawLiteralXAxis(ChartState& state, HDC dc);
-void DrawLiteralSeries(const ChartState& state, HDC dc);
+bool DrawLiteralSeries(const ChartState& state, HDC dc);
 void DrawLiteralPie(const ChartState& state, const ChartFonts& fonts, HDC dc);
 void ClipDC(HDC dc, const RECT& area);
 void FillLiteral(HDC dc, const RECT& area, COLORREF colour);

@@ -198,13 +198,13 @@ bool DrawLiteralXAxis(ChartState& state, HDC dc) {
 }
 
 bool DrawLiteralFrame(ChartState& state, const ChartFonts& fonts, HDC dc,
-                      const std::function<void()>& drawSeries) {
+                      const std::function<bool()>& drawSeries) {
     const RECT& all = state.surface;
     FillLiteral(dc, all, state.background);
     DrawLiteralTitle(state, fonts, dc);
     bool finished = DrawLiteralGrid(state, dc, nullptr);
     ClipDC(dc, state.plot());
-    drawSeries();
+    finished &= drawSeries();
     ClipDC(dc, {all.left, all.top, all.right + 1, all.bottom + 1});
     finished &= DrawLiteralXAxis(state, dc);
     finished &= DrawYAxis(state, dc);

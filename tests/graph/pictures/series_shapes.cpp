@@ -1,5 +1,6 @@
 // Lines, markers, areas, columns and bars, one sentence at a time.
 #include "graph/pictures/chart_pair.h"
+#include "support/import_spy.h"
 
 #include <cmath>
 #include <limits>
@@ -375,6 +376,37 @@ TEST_F(GraphOddValues, HugeOnesBesideSmallRangesReachTheEdges) {
     EXPECT_EQ(picture.pixel(xOf(1), plot.top), kGreen);
     EXPECT_EQ(picture.pixel(xOf(2), plot.bottom - 1), kGreen);
     EXPECT_EQ(picture.pixel(xOf(3), plot.top), kGreen);
+}
+
+// The platform's Polygon takes time for each row between a polygon's corners, seen or not: with the
+// values of this test minutes.
+TEST_F(GraphOddValues, FarBeyondTheViewDoNotReachThePlatformsPolygon) {
+    std::vector<double> values(1000);
+    for (unsigned i = 0; i < values.size(); ++i) values[i] = (i % 2 ? -1.0 : 1.0) * (i % 7);
+    ImportSpy spy;
+    LONG farthest = 0;
+    int polygons = 0;
+    ASSERT_TRUE(spy.watch("Polygon"));
+    spy.replace("Polygon", [&](ULONG_PTR* arguments) {
+        const auto* corners = reinterpret_cast<const POINT*>(arguments[1]);
+        for (ULONG_PTR i = 0; i < arguments[2]; ++i) {
+            farthest = std::max({farthest, std::abs(corners[i].x), std::abs(corners[i].y)});
+        }
+        ++polygons;
+        return farthest < 4096 ? spy.callReal("Polygon", arguments) : TRUE;
+    });
+    for (const int type : {KORGRAPH_AREA, KORGRAPH_COLUMN, KORGRAPH_BAR}) {
+        KorGraph_Reset(chart.window(), TRUE);
+        KorGraph_SetType(chart.window(), type);
+        const GraphSeriesData data{static_cast<LONG>(values.size()), nullptr, values.data(), 0};
+        EXPECT_TRUE(KorGraph_AddSeries(chart.window(), &data));
+        chart.setRange(type == KORGRAPH_BAR ? KORGRAPH_X : KORGRAPH_Y, -1e-6, 1e-6);
+        KorGraph_Redraw(chart.window());
+        UpdateWindow(chart.window());
+        EXPECT_GT(chart.shown().count(kGreen) + chart.shown().count(kBlack), 10000) << type;
+    }
+    EXPECT_GT(polygons, 0);
+    EXPECT_LT(farthest, 4096);
 }
 
 }  // namespace
