@@ -182,6 +182,14 @@ typedef struct GraphRange {
  *   result  0 */
 #define GN_REDRAW (WM_USER + 6019)
 
+/* GN_PRINT, inside WM_NOTIFY: asks for a printer with the platform's print dialog and prints the
+ * chart on one page. It comes back when that is done; the host's messages go on while the dialog is
+ * open. After a print the chart's window is disabled, and the host enables it again; after a dialog
+ * that was cancelled it is not. Does nothing without printing, or inside another print.
+ *   lParam  0
+ *   result  0 */
+#define GN_PRINT (WM_USER + 6020)
+
 /* GN_LIVEUPDATE, inside WM_NOTIFY: one step of live mode.
  *   lParam  in sweep mode a whole number, the new sample; in replace mode const GraphSeriesData*
  *   result  0 */
@@ -377,6 +385,8 @@ static __inline void KorGraph_ShowProperties(HWND graph) {
 }
 
 static __inline void KorGraph_Copy(HWND graph) { SendMessageW(graph, GM_COPY, 0, 0); }
+
+static __inline void KorGraph_Print(HWND graph) { KorGraph_Notify(graph, GN_PRINT, 0); }
 
 static __inline void KorGraph_Clear(HWND graph) { KorGraph_Notify(graph, GN_CLEAR, 0); }
 

@@ -29,6 +29,14 @@ struct Triangle {
     POINT points[3];
 };
 
+// A print under way. It runs inside one message, but its dialog lets others through.
+enum class PrintState : int32_t {
+    none,
+    underWay,   // the record is the screen's; a second print is refused
+    onPage,     // the record stands for the page; only WM_DESTROY may touch it
+    windowGone  // the print frees the record at its end
+};
+
 struct GraphRecord {
     HWND hwndParent;
     HINSTANCE hInstance;
@@ -106,6 +114,7 @@ struct GraphRecord {
 
     // The library's own, behind the specified fields.
     HGDIOBJ blankBitmap;  // what hdcMem held at first; back before hbmMem is deleted
+    PrintState printing;
 };
 
 constexpr uint32_t kPanLeft = 1;

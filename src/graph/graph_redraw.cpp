@@ -6,8 +6,7 @@
 
 namespace kor {
 
-void RedrawGraph(GraphRecord& graph) {
-    if (!graph.hwnd) return;
+void DrawGraph(GraphRecord& graph) {
     switch (graph.chartType) {
     case kLine: DrawLineChart(graph, graph.hdcMem); break;
     case kArea: DrawAreaChart(graph, graph.hdcMem); break;
@@ -16,6 +15,10 @@ void RedrawGraph(GraphRecord& graph) {
     case kPie: DrawPieChart(graph, graph.hdcMem); break;
     default: break;
     }
+}
+
+void RedrawGraph(GraphRecord& graph) {
+    if (graph.hwnd) DrawGraph(graph);
 }
 
 }  // namespace kor

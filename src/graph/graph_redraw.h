@@ -5,7 +5,10 @@
 
 namespace kor {
 
-// By chart type; does nothing for a chart without a window, or of a type there is not.
+// By chart type, into hdcMem; a type there is not draws nothing.
+void DrawGraph(GraphRecord& graph);
+
+// The same; does nothing for a chart without a window.
 void RedrawGraph(GraphRecord& graph);
 
 }  // namespace kor

@@ -19,6 +19,8 @@
 #include "graph/graph_scale.h"
 #include "graph/graph_series.h"
 #include "graph/graph_settings.h"
+#include "graph/printing.h"
+#include "graph/printing_calls.h"
 #include "platform/gdi_scopes.h"
 #include "platform/records.h"
 #include "platform/windows_helpers.h"
@@ -54,6 +56,7 @@ LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
     if (!graph) return 1;
     SetUserData(hwnd, graph);
     if (!creation || !creation->hInstance || !creation->hwndParent) return 1;
+    LoadPrintModules();
     graph->hInstance = creation->hInstance;
     graph->hwnd = hwnd;
     graph->hwndParent = creation->hwndParent;
@@ -71,7 +74,11 @@ LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
 LRESULT OnDestroy(HWND hwnd, GraphRecord* graph) {
     DetachLegend(graph->hwndLegend);
     SetUserData(hwnd, nullptr);
-    DestroyGraphRecord(graph);
+    if (graph->printing == PrintState::none) {
+        DestroyGraphRecord(graph);
+    } else {
+        graph->printing = PrintState::windowGone;
+    }
     return 0;
 }
 
@@ -136,6 +143,7 @@ bool OnNotify(GraphRecord& graph, WPARAM code, LPARAM argument) {
         if (graph.hwnd) RunGraphProperties(graph.hwnd);
         return true;
     case GN_REDRAW: RedrawGraph(graph); return true;
+    case GN_PRINT: PrintGraph(graph); return true;  // the record may be gone now
     case GN_LIVEUPDATE: OnLiveUpdate(graph, argument); return true;
     case GN_SETVALUE:
         if (argument) SetSeriesValue(graph, *reinterpret_cast<const GraphValue*>(argument));
@@ -154,7 +162,9 @@ LRESULT CALLBACK GraphProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam
     if (message == WM_CREATE && !graph) {
         return OnCreate(hwnd, reinterpret_cast<CREATESTRUCTW*>(lParam));
     }
-    if (!graph) return DefWindowProcW(hwnd, message, wParam, lParam);
+    if (!graph || (graph->printing == PrintState::onPage && message != WM_DESTROY)) {
+        return DefWindowProcW(hwnd, message, wParam, lParam);
+    }
 
     const auto number = static_cast<int32_t>(lParam);
     switch (message) {

@@ -1,0 +1,75 @@
+// Drawing is the screen's, so for the time of a page the record stands for the page: hdcMem and
+// rcPlot are the printer's, and fonts, margins and scaling follow from them. Meanwhile the window
+// procedure keeps all messages away from the record.
+#include "graph/printing.h"
+
+#include "graph/graph_frame.h"
+#include "graph/graph_layout.h"
+#include "graph/graph_redraw.h"
+#include "graph/graph_scale.h"
+#include "graph/printing_calls.h"
+
+namespace kor {
+
+namespace {
+
+// Only the fonts follow the printer's resolution. Pens, markers, least margins and ticks are so
+// many pixels here as on the screen, and come out small.
+void BecomePage(GraphRecord& graph, HDC printer) {
+    graph.rcPlot = {0, 0, GetDeviceCaps(printer, HORZRES), GetDeviceCaps(printer, VERTRES)};
+    graph.hdcMem = printer;
+    ClipToSurface(graph, printer);
+    SetBkMode(printer, TRANSPARENT);  // as the off-screen image has it
+    CreateGraphFonts(graph, printer);
+    LayoutGraphMargins(graph, printer);
+    RescaleX(graph);
+    RescaleY(graph);
+}
+
+// Everything is as it was for the screen, whatever a layout or a scaling would give by now: a
+// redraw gives the picture from before. Only the fonts have to be made again.
+void BecomeScreen(GraphRecord& graph, const GraphRecord& screen) {
+    CreateGraphFonts(graph, screen.hdcMem);
+    const GraphRecord page = graph;
+    graph = screen;
+    graph.hfontTitle = page.hfontTitle;
+    graph.hfontXTitle = page.hfontXTitle;
+    graph.hfontYTitle = page.hfontYTitle;
+    graph.hfontLabel = page.hfontLabel;
+    graph.hfontAxis = page.hfontAxis;
+    graph.printing = page.printing;
+    ClipToSurface(graph, graph.hdcMem);
+}
+
+void PrintOn(GraphRecord& graph, HDC printer) {
+    // The host enables the window again, when it likes.
+    if (graph.hwnd) EnableWindow(graph.hwnd, FALSE);
+    BeginPrintJob(printer);
+    const GraphRecord screen = graph;
+    if (graph.printing == PrintState::underWay) graph.printing = PrintState::onPage;
+    BecomePage(graph, printer);
+    DrawGraph(graph);
+    EndPrintJob(printer);
+    DeleteDC(printer);
+    BecomeScreen(graph, screen);
+}
+
+}  // namespace
+
+void PrintGraph(GraphRecord& graph) {
+    if (!CanPrint() || graph.printing != PrintState::none) return;
+    graph.printing = PrintState::underWay;
+    HDC printer = AskForPrinter(graph.hwnd);
+    if (printer && graph.printing == PrintState::underWay) {
+        PrintOn(graph, printer);
+    } else if (printer) {
+        DeleteDC(printer);  // chosen for a chart that is gone
+    }
+    if (graph.printing == PrintState::windowGone) {
+        DestroyGraphRecord(&graph);
+    } else {
+        graph.printing = PrintState::none;
+    }
+}
+
+}  // namespace kor

@@ -1,0 +1,77 @@
+// The two modules that printing needs: when they are loaded, and what their absence means.
+#include "graph/printing_fixture.h"
+
+namespace kortest {
+namespace {
+
+class PrintModules : public PrintingTest {
+protected:
+    void createAnother() {
+        CreateGraphWindow(host.window(), WS_CHILD, {0, 0, 50, 50}, GetModuleHandleW(nullptr));
+    }
+};
+
+TEST_F(PrintModules, AreLoadedWithTheFirstChart) {
+    EXPECT_EQ(IsPrintingAvailableForGraphControl(), 0u) << "no chart was created";
+    create();
+    EXPECT_EQ(transcript, (Lines{"load commdlg.dll", "load wingdi.dll"}));
+    EXPECT_EQ(IsPrintingAvailableForGraphControl(), 1u);
+}
+
+TEST_F(PrintModules, AreLoadedOnceForAllCharts) {
+    create();
+    transcript.clear();
+    createAnother();
+    EXPECT_EQ(transcript, Lines{});
+    EXPECT_EQ(IsPrintingAvailableForGraphControl(), 1u);
+}
+
+TEST_F(PrintModules, AreNotLoadedForAChartWithoutAParent) {
+    RegisterGraphClass();
+    CreateGraphWindow(nullptr, WS_POPUP, {0, 0, 50, 50}, GetModuleHandleW(nullptr));
+    EXPECT_EQ(transcript, Lines{});
+    EXPECT_EQ(IsPrintingAvailableForGraphControl(), 0u);
+}
+
+TEST_F(PrintModules, StayAfterTheLastChart) {
+    spy.watch("FreeLibrary");
+    create();
+    destroy();
+    EXPECT_EQ(spy.count("FreeLibrary"), 0);
+    EXPECT_EQ(IsPrintingAvailableForGraphControl(), 1u);
+}
+
+class MissingPrintModule : public PrintModules,
+                           public ::testing::WithParamInterface<const char*> {};
+
+TEST_P(MissingPrintModule, MakesPrintingUnavailable) {
+    missingModules = {GetParam()};
+    create();
+    EXPECT_EQ(IsPrintingAvailableForGraphControl(), 0u);
+    transcript.clear();
+    print();
+    EXPECT_EQ(printAnswer, 0);
+    EXPECT_EQ(transcript, Lines{}) << "nothing is even looked for";
+    EXPECT_TRUE(IsWindowEnabled(graph));
+}
+
+TEST_P(MissingPrintModule, IsTriedAgainWithTheNextChart) {
+    missingModules = {GetParam()};
+    create();
+    transcript.clear();
+    createAnother();
+    EXPECT_EQ(transcript, Lines{std::string("load ") + GetParam()}) << "the other one is there";
+    missingModules.clear();
+    createAnother();
+    EXPECT_EQ(IsPrintingAvailableForGraphControl(), 1u);
+    print();
+    EXPECT_FALSE(IsWindowEnabled(graph)) << "the first chart prints as well";
+}
+
+INSTANTIATE_TEST_SUITE_P(Both, MissingPrintModule, ::testing::Values("commdlg.dll", "wingdi.dll"),
+                         [](const auto& tested) {
+                             return std::string(tested.param, std::string(tested.param).find('.'));
+                         });
+
+}  // namespace
+}  // namespace kortest
