@@ -38,6 +38,7 @@ bool IsBetween(UINT command, UINT first, UINT last) { return first <= command &&
 constexpr DWORD OptionOf(UINT command) { return DWORD{1} << (command - IDM_CHART_OPTION_FIRST); }
 
 void ShowPane(Workbook& workbook, bool shown) {
+    workbook.panel.isStale = true;
     workbook.chart.isShown = shown;
     LayOutWindow(workbook);
     ShowWindow(workbook.chart.pane, shown ? SW_SHOW : SW_HIDE);
@@ -66,6 +67,7 @@ void ToggleChart(Workbook& workbook) {
 
 // Titles and ranges belong to values and categories, the chart's to x and y.
 void SetType(Workbook& workbook, LONG type) {
+    workbook.panel.isStale = true;
     KorGraph_SetType(workbook.chart.graph, type);
     ApplyCategories(workbook);
     ApplyTitles(workbook);

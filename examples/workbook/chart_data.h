@@ -11,6 +11,7 @@ namespace workbook {
 struct ChartSeries {
     std::wstring name;
     std::vector<double> values;  // as many in every series
+    int column = 0;              // of the sheet
 };
 
 struct ChartData {

@@ -59,6 +59,7 @@ void EditChartProperties(Workbook& workbook) {
     if (before.titles != after.titles) choice.titles = after.titles;
     NoteChange(choice.values, before.values, after.values);
     NoteChange(choice.positions, before.positions, after.positions);
+    workbook.panel.isStale = true;
     // After a change of type the axes have traded places.
     ApplyCategories(workbook);
     ApplyTitles(workbook);
@@ -67,5 +68,17 @@ void EditChartProperties(Workbook& workbook) {
 }
 
 void CopyChart(Workbook& workbook) { KorGraph_Copy(workbook.chart.graph); }
+
+bool CanPrintChart(const Workbook& workbook) {
+    return workbook.chart.isShown && IsPrintingAvailableForGraphControl() != 0;
+}
+
+void PrintChart(Workbook& workbook) {
+    if (!CanPrintChart(workbook)) return;
+    CommitTyping(workbook);
+    KorGraph_Print(workbook.chart.graph);
+    EnableWindow(workbook.chart.graph, TRUE);  // the chart stays disabled after printing
+    DrawChart(workbook);
+}
 
 }  // namespace workbook

@@ -10,4 +10,8 @@ void EditChartProperties(Workbook& workbook);
 
 void CopyChart(Workbook& workbook);
 
+// Whether there is a chart to see, and a way to print it.
+bool CanPrintChart(const Workbook& workbook);
+void PrintChart(Workbook& workbook);
+
 }  // namespace workbook

@@ -19,7 +19,7 @@ constexpr std::array<double, 4> kZoomFactors = {0.25, 0.5, 1, 2};
 
 // What a label takes, in pixels.
 constexpr size_t kCharacterWidth = 7;
-constexpr size_t kLabelGap = 6;
+constexpr size_t kLabelGap = 12;
 constexpr size_t kLabelHeight = 15;
 
 constexpr const wchar_t* kNothingToChart = L"There are no numbers to chart";
@@ -130,6 +130,7 @@ void ShowChartOfSheet(Workbook& workbook) {
     if (!block) block = ChartedBlock(sheet, BlockOf({0, 0}));
     chart.data = ReadChartData(sheet, *block);
     chart.isStale = false;
+    workbook.panel.isStale = true;  // it shows the series' colours
     HandOverEverything(workbook);
     DrawChart(workbook);
 }

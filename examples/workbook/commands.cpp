@@ -3,6 +3,7 @@
 #include <string>
 
 #include "chart_commands.h"
+#include "chart_output.h"
 #include "clipboard.h"
 #include "dialogs.h"
 #include "edit_commands.h"
@@ -69,6 +70,7 @@ void RunCommand(Workbook& workbook, UINT command) {
     case IDM_FILE_SAVE: Save(workbook); return;
     case IDM_FILE_SAVE_AS: SaveAs(workbook); return;
     case IDM_FILE_CLOSE: return CloseSheet(workbook);
+    case IDM_FILE_PRINT: return PrintChart(workbook);
     case IDM_FILE_EXIT: PostMessageW(workbook.window, WM_CLOSE, 0, 0); return;
 
     case IDM_EDIT_UNDO: return Undo(workbook);
@@ -94,6 +96,8 @@ void RunCommand(Workbook& workbook, UINT command) {
     case IDM_VIEW_VERTICAL_SCROLL_BAR: return ToggleVerticalBar(workbook);
     case IDM_VIEW_TITLE_ROW: return ToggleTitleRow(workbook);
     case IDM_VIEW_FIT_SIZES: return FitSizesAndRedraw(workbook);
+    case IDM_VIEW_SIDE_PANEL: return ToggleSidePanel(workbook);
+    case IDM_VIEW_NEXT_PANE: return StepFocus(workbook);
     case IDM_VIEW_NEXT_SHEET: return StepToSheet(workbook, 1);
     case IDM_VIEW_PREVIOUS_SHEET: return StepToSheet(workbook, -1);
 
@@ -114,6 +118,8 @@ void PrepareMenu(const Workbook& workbook, HMENU menu) {
     PrepareEditMenu(workbook.document(), menu);
     PrepareViewMenu(workbook.view, workbook.sheetView().titleRow, menu);
     PrepareChartMenu(workbook, menu);
+    Enable(menu, IDM_FILE_PRINT, CanPrintChart(workbook));
+    Check(menu, IDM_VIEW_SIDE_PANEL, workbook.panel.isShown);
 }
 
 }  // namespace workbook

@@ -21,6 +21,7 @@ void AfterEdit(Workbook& workbook, EditResult result) {
     if (result == EditResult::NoMemory) workbook.isOutOfMemory = true;
     if (result != EditResult::Done) return;
     workbook.chart.isStale = true;
+    workbook.panel.isStale = true;
     ShowTitle(workbook);
     UpdateScrollRanges(workbook);
 }

@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "equation_bar.h"
+#include "sheet_bar.h"
 #include "sheet_switch.h"
 #include "workbook.h"
 #include "workbook_window.h"
@@ -154,6 +155,7 @@ bool SaveAs(Workbook& workbook) {
 void CloseSheet(Workbook& workbook) {
     CommitTyping(workbook);
     if (!MayDiscard(workbook)) return;
+    RemoveFromSheetBar(workbook, workbook.sheets.currentIndex());
     workbook.sheets.closeCurrent();
     ShowSheet(workbook);
 }

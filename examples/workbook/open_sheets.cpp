@@ -1,6 +1,7 @@
 #include "open_sheets.h"
 
 #include <algorithm>
+#include <array>
 #include <cwctype>
 #include <utility>
 
@@ -24,15 +25,19 @@ bool IsUntouched(const Document& document) {
 OpenSheets::OpenSheets() { addNew(); }
 
 OpenSheet& OpenSheets::addNew() {
-    sheets_.push_back(std::make_unique<OpenSheet>(freeNumber()));
+    auto sheet = std::make_unique<OpenSheet>(freeNumber());
+    sheet->colour = rarestColour();
+    sheets_.push_back(std::move(sheet));
     current_ = sheets_.size() - 1;
     return current();
 }
 
 OpenSheet& OpenSheets::add(std::unique_ptr<OpenSheet> sheet) {
     if (IsUntouched(current().document)) {
+        sheet->colour = current().colour;
         sheets_[current_] = std::move(sheet);
     } else {
+        sheet->colour = rarestColour();
         sheets_.push_back(std::move(sheet));
         current_ = sheets_.size() - 1;
     }
@@ -66,6 +71,12 @@ int OpenSheets::freeNumber() const {
     int number = 1;
     while (isTaken(number)) ++number;
     return number;
+}
+
+int OpenSheets::rarestColour() const {
+    std::array<int, kSheetColours> uses = {};
+    for (const auto& sheet : sheets_) ++uses[static_cast<size_t>(sheet->colour)];
+    return static_cast<int>(std::ranges::min_element(uses) - uses.begin());
 }
 
 }  // namespace workbook

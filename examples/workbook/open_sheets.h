@@ -13,6 +13,9 @@
 
 namespace workbook {
 
+// Sheets have colours by which they are told apart; with more sheets colours come again.
+constexpr int kSheetColours = 8;
+
 // What of a sheet is charted, and what its user chose about it.
 struct ChartChoice {
     std::optional<Block> block;           // nothing: the whole sheet
@@ -37,6 +40,7 @@ struct OpenSheet {
 
     Document document;
     SheetView view;
+    int colour = 0;  // below kSheetColours
 };
 
 // Never empty: in place of the last sheet to be closed there is a new one.
@@ -69,6 +73,7 @@ public:
 
 private:
     int freeNumber() const;
+    int rarestColour() const;
 
     std::vector<std::unique_ptr<OpenSheet>> sheets_;
     size_t current_ = 0;

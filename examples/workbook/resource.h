@@ -19,6 +19,12 @@
 #define IDC_ZOOM_COMBO 108
 #define IDC_TYPE_COMBO 109
 
+/* The bar of sheets, and the side panel with its children. */
+#define IDC_SHEET_BAR 110
+#define IDC_SIDE_PANEL 111
+#define IDC_FILE_TREE 112
+#define IDC_STATISTICS 113
+
 /* Resources. */
 #define IDR_MENU 200
 #define IDR_KEYS_ALWAYS 201 /* accelerators that work everywhere in the window */
@@ -70,6 +76,14 @@
 #define IDM_VIEW_FIT_SIZES 1216
 #define IDM_VIEW_NEXT_SHEET 1217
 #define IDM_VIEW_PREVIOUS_SHEET 1218
+
+#define IDM_VIEW_SIDE_PANEL 1219
+#define IDM_VIEW_NEXT_PANE 1220 /* keys only */
+
+/* The menu over the list of columns. */
+#define IDM_COLUMN_GO 1251
+#define IDM_COLUMN_REMOVE 1252
+#define IDM_COLUMN_SHOW_ALL 1253
 
 /* Help. */
 #define IDM_HELP_KEYS 1301

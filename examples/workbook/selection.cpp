@@ -100,6 +100,12 @@ void GoTo(Workbook& workbook, const Block& block) {
     MakeVisible(workbook, {block.left, block.top});
 }
 
+void GoToColumn(Workbook& workbook, int column) {
+    CommitTyping(workbook);
+    Select(workbook, {column, 0, column, kRowCount - 1});
+    MakeVisible(workbook, {column, FirstVisibleCell().row});
+}
+
 void MakeVisible(Workbook& workbook, CellAddress cell) {
     if (IsIndexCompletelyVisible(IndexOf(cell))) return;
     if (!IsIndexVisible(IndexOf(cell))) ScrollTo(OriginFor(cell, VisibleRange()));

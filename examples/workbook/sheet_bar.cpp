@@ -28,9 +28,9 @@ struct BarItem {
 BarItem ItemOf(const OpenSheet& sheet) {
     const bool isModified = sheet.document.isModified();
     const std::wstring name = (isModified ? L"*" : L"") + sheet.document.name();
-    return {name.substr(0, kLongestName), SheetImage(sheet.colour, isModified),
-            ReadableSheetColour(sheet.colour, GetSysColor(COLOR_MENU),
-                                GetSysColor(COLOR_HIGHLIGHT))};
+    return {
+        name.substr(0, kLongestName), SheetImage(sheet.colour, isModified),
+        ReadableSheetColour(sheet.colour, GetSysColor(COLOR_MENU), GetSysColor(COLOR_HIGHLIGHT))};
 }
 
 std::vector<BarItem> WantedItems(const OpenSheets& sheets) {
@@ -92,10 +92,9 @@ LRESULT CALLBACK BarProc(HWND bar, UINT message, WPARAM wParam, LPARAM lParam) {
 
 bool CreateSheetBar(Workbook& workbook) {
     if (!InitFunkyControl(workbook.instance)) return false;
-    const HWND bar =
-        CreateWindowExW(0, KORFUNKYBAR_CLASS, nullptr, WS_CHILD | WS_VISIBLE, 0, 0, 0, 0,
-                        workbook.window, reinterpret_cast<HMENU>(INT_PTR{IDC_SHEET_BAR}),
-                        workbook.instance, nullptr);
+    const HWND bar = CreateWindowExW(
+        0, KORFUNKYBAR_CLASS, nullptr, WS_CHILD | WS_VISIBLE, 0, 0, 0, 0, workbook.window,
+        reinterpret_cast<HMENU>(INT_PTR{IDC_SHEET_BAR}), workbook.instance, nullptr);
     if (!bar) return false;
     workbook.sheetBar = bar;
     workbook.sheetImages = CreateSheetImages();
@@ -126,6 +125,7 @@ void RefreshSheetBar(const Workbook& workbook) {
     if (items != ShownItems(bar)) {
         KorFunkyBar_DeleteAll(bar);
         for (const BarItem& item : items) Append(bar, item);
+        InvalidateRect(bar, nullptr, TRUE);
     }
     const auto current = static_cast<LONG>(workbook.sheets.currentIndex());
     if (KorFunkyBar_GetCurrent(bar) != current) KorFunkyBar_SetCurrent(bar, current);

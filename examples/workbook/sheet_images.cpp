@@ -96,6 +96,8 @@ HIMAGELIST CreateSheetImages() {
         AddSheet(maker, SheetColour(colour), false);
         AddSheet(maker, SheetColour(colour), true);
     }
+    AddNumbers(maker);
+    AddTexts(maker);
     return maker.list();
 }
 

@@ -8,12 +8,16 @@
 
 #include <vector>
 
+#include "open_sheets.h"
+
 namespace workbook {
 
 constexpr int kImageSize = 16;
 
-// Images of the list for sheets.
+// Images of the list for sheets, which has columns as well.
 int SheetImage(int colour, bool isModified);
+constexpr int kTreeNumbersImage = 2 * kSheetColours;
+constexpr int kTreeTextsImage = kTreeNumbersImage + 1;
 
 // Images of the list for columns; behind them stand the colours of charted series.
 enum ColumnImage { kNumbersImage, kTextsImage, kSeriesImages };

@@ -10,6 +10,7 @@
 #include "cell_styles.h"
 #include "chart.h"
 #include "open_sheets.h"
+#include "side_panel.h"
 #include "text_measure.h"
 
 namespace workbook {
@@ -47,6 +48,7 @@ struct Workbook {
     HWND window = nullptr;
     HWND grid = nullptr;
     HWND statusBar = nullptr;
+    HWND sheetBar = nullptr;
     HACCEL keysAlways = nullptr;
     HACCEL keysInGrid = nullptr;
 
@@ -57,8 +59,10 @@ struct Workbook {
     ShownState shown;
     PressState press;
     Chart chart;
-    int wheelDistance = 0;       // turned, but less than a notch so far
-    bool isOutOfMemory = false;  // to be told when no message is being handled
+    SidePanel panel;
+    HIMAGELIST sheetImages = nullptr;  // of bar and tree
+    int wheelDistance = 0;             // turned, but less than a notch so far
+    bool isOutOfMemory = false;        // to be told when no message is being handled
 
     // Of the current sheet.
     Document& document() { return sheets.current().document; }

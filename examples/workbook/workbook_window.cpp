@@ -13,6 +13,7 @@
 #include "file_commands.h"
 #include "grid_host.h"
 #include "resource.h"
+#include "sheet_bar.h"
 #include "sheet_switch.h"
 #include "status_line.h"
 #include "view_commands.h"
@@ -27,6 +28,8 @@ constexpr int kFirstWidth = 960;
 constexpr int kFirstHeight = 680;
 constexpr int kLeastWidth = 320;
 constexpr int kLeastHeight = 240;
+constexpr int kSheetBarWidth = 250;
+constexpr int kSheetBarHeight = 18;  // of one line of its text, which it draws at the top
 constexpr DWORD kGridStyle = WS_CHILD | WS_VISIBLE | WS_CLIPCHILDREN | WS_HSCROLL | WS_VSCROLL;
 
 // ---- Birth and death ----
@@ -40,7 +43,7 @@ bool OnCreate(Workbook& workbook, HWND window) {
         CreateWindowExW(0, KORGRID_CLASS, nullptr, kGridStyle, 0, 0, 0, 0, window,
                         reinterpret_cast<HMENU>(INT_PTR{IDC_GRID}), workbook.instance, nullptr);
     if (!workbook.grid || !workbook.statusBar || !CreateChartPane(workbook) ||
-        !CreateChartBar(workbook)) {
+        !CreateChartBar(workbook) || !CreateSheetBar(workbook) || !CreateSidePanel(workbook)) {
         return false;
     }
     PrepareEquationBar(workbook);
@@ -50,6 +53,8 @@ bool OnCreate(Workbook& workbook, HWND window) {
 }
 
 void OnDestroy(Workbook& workbook) {
+    DestroySidePanel(workbook);
+    DestroySheetBar(workbook);
     workbook.measure.close();
     DeleteCellStyles(workbook.styles);
     workbook.grid = nullptr;
@@ -84,6 +89,11 @@ void OnGetMinMaxInfo(MINMAXINFO& info) { info.ptMinTrackSize = {kLeastWidth, kLe
 
 // ---- Dispatch ----
 
+void OnSheetBarNotify(Workbook& workbook, LPARAM lParam) {
+    const auto& chosen = *reinterpret_cast<const FunkyBarNotification*>(lParam);
+    if (chosen.header.code == FBN_SELECTED) OnSheetChosen(workbook, chosen);
+}
+
 LRESULT Dispatch(Workbook& workbook, UINT message, WPARAM wParam, LPARAM lParam) {
     const HWND window = workbook.window;
     switch (message) {
@@ -91,6 +101,7 @@ LRESULT Dispatch(Workbook& workbook, UINT message, WPARAM wParam, LPARAM lParam)
     case WM_SETFOCUS: OnSetFocus(workbook); return 0;
     case WM_NOTIFY:
         if (OnGridNotify(workbook, static_cast<UINT>(wParam), lParam)) return 0;
+        if (wParam == IDC_SHEET_BAR) OnSheetBarNotify(workbook, lParam);
         break;
     case GRIDN_EQUATIONENTERED:
         OnEquationEntered(workbook, reinterpret_cast<const wchar_t*>(wParam), lParam);
@@ -182,13 +193,18 @@ void LayOutWindow(const Workbook& workbook) {
     const int top = ChartBarHeight(workbook);
     const int bottom = static_cast<int>(area.bottom) - LayoutStatusBar(workbook);
     const int height = std::max(0, bottom - top);
-    const int gridWidth = width - ChartPaneWidth(workbook, width);
-    MoveWindow(workbook.chart.bar.window, 0, 0, width, top, TRUE);
-    MoveWindow(workbook.grid, 0, top, gridWidth, height, TRUE);
-    MoveWindow(workbook.chart.pane, gridWidth, top, width - gridWidth, height, TRUE);
+    const int gridLeft = SidePanelWidth(workbook, width);
+    const int gridRight = width - ChartPaneWidth(workbook, width);
+    MoveWindow(workbook.sheetBar, 0, (top - kSheetBarHeight) / 2, kSheetBarWidth, kSheetBarHeight,
+               TRUE);
+    MoveWindow(workbook.chart.bar.window, kSheetBarWidth, 0, width - kSheetBarWidth, top, TRUE);
+    MoveWindow(workbook.panel.window, 0, top, gridLeft, height, TRUE);
+    MoveWindow(workbook.grid, gridLeft, top, gridRight - gridLeft, height, TRUE);
+    MoveWindow(workbook.chart.pane, gridRight, top, width - gridRight, height, TRUE);
 }
 
-void ShowTitle(const Workbook& workbook) {
+void ShowTitle(Workbook& workbook) {
+    workbook.panel.isStale = true;
     const Document& document = workbook.document();
     const std::wstring title = document.name() + L" - Workbook";
     SetWindowTextW(workbook.window, ((document.isModified() ? L"*" : L"") + title).c_str());
@@ -201,6 +217,8 @@ void OnIdle(Workbook& workbook) noexcept {
         RefreshChart(workbook);
         KeepTooltipsInPane(workbook);
         RefreshChartBar(workbook);
+        RefreshSheetBar(workbook);
+        RefreshSidePanel(workbook);
     } catch (const std::bad_alloc&) {
         workbook.isOutOfMemory = true;
     }

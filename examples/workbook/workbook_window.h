@@ -17,9 +17,9 @@ struct Workbook;
 bool CreateWorkbookWindow(Workbook& workbook, const std::vector<std::wstring>& files, int show);
 
 // "*sunspots.csv - Workbook"; the star means unsaved changes.
-void ShowTitle(const Workbook& workbook);
+void ShowTitle(Workbook& workbook);
 
-// Gives grid, chart and status bar their places.
+// Gives bars, panes and the grid their places.
 void LayOutWindow(const Workbook& workbook);
 
 // To be called when no message is waiting.
