@@ -13,6 +13,7 @@ from picture import Picture
 ROOT = pathlib.Path(__file__).resolve().parents[2]
 WINE_RUN = ROOT / "scripts" / "wine-run"
 WIDTH, HEIGHT = 1024, 768
+OUT_OF_THE_WAY = WIDTH - 1, HEIGHT - 1
 DOUBLE_CLICK_SECONDS = 0.6
 
 
@@ -132,6 +133,9 @@ class Desktop:
             time.sleep(max(0, when + DOUBLE_CLICK_SECONDS - time.monotonic()))
         self._xdotool("mousemove", x, y, "click", 1)
         self._last_click = (x, y), time.monotonic()
+
+    def right_click(self, x, y):
+        self._xdotool("mousemove", x, y, "click", 3)
 
     def drag(self, *points, release=True):
         """Presses at the first point and moves to the others; each is an (x, y) pair."""
