@@ -12,6 +12,7 @@
 #include "equation_bar.h"
 #include "file_commands.h"
 #include "grid_host.h"
+#include "header_pointer.h"
 #include "resource.h"
 #include "sheet_bar.h"
 #include "sheet_switch.h"
@@ -79,9 +80,9 @@ void OnSetFocus(const Workbook& workbook) {
 // window's border, would stay.
 //   result  whether the cursor is set
 bool OnSetCursor(const Workbook& workbook, HWND window, UINT place) {
-    const bool isGrid = window == workbook.grid || IsGridHeader(workbook, window);
-    if (!isGrid || place != HTCLIENT) return false;
-    SetCursor(LoadCursorW(nullptr, IDC_ARROW));
+    const bool isHeader = IsGridHeader(workbook, window);
+    if ((!isHeader && window != workbook.grid) || place != HTCLIENT) return false;
+    SetCursor(LoadCursorW(nullptr, isHeader ? HeaderPointer(window) : IDC_ARROW));
     return true;
 }
 
