@@ -5,11 +5,11 @@
 
 #include <array>
 
-#include "../command_bar/command_bar.h"
 #include "chart_commands.h"
 #include "chart_pane.h"
 #include "resource.h"
 #include "workbook.h"
+#include <command_bar.h>
 
 namespace workbook {
 

@@ -162,7 +162,7 @@ class Desktop:
         self._xdotool("key", "--delay", 5, *names)
 
     def type(self, text):
-        self._xdotool("type", "--delay", 5, text)
+        self._xdotool("type", "--delay", 5, "--", text)
 
     # ---- Eyes ----
 

@@ -155,6 +155,25 @@ def test_a_range_of_the_property_sheet_stays_through_edits(chart):
     workbook.answer("Cancel")
 
 
+def test_printing_asks_for_a_printer_and_can_be_given_up(chart):
+    workbook = chart.workbook
+    before = chart.picture()
+    workbook.desktop.key("ctrl+p")
+    assert workbook.wait_for_dialog().text == "Print"  # or that there is no printer
+    workbook.desktop.key("Escape")
+    wait_until(lambda: not workbook.dialog(), "the dialog closes")
+    assert chart.window().enabled
+    chart.menu("o")
+    chart.wait_for_change(before)
+
+
+def test_there_is_nothing_to_print_without_a_chart(open_workbook, stations):
+    workbook = open_workbook(stations)
+    workbook.desktop.key("ctrl+p", "F1")
+    assert workbook.wait_for_dialog().text == "Keys of Workbook"
+    workbook.answer("OK")
+
+
 def test_the_keys_are_explained(open_workbook, stations):
     workbook = open_workbook(stations)
     workbook.desktop.key("F1")
