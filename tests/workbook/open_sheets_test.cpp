@@ -5,6 +5,8 @@
 
 #include <gtest/gtest.h>
 
+#include <set>
+
 namespace workbook {
 namespace {
 
@@ -105,6 +107,23 @@ TEST_F(OpenSheets, AreNeverNone) {
     sheets.closeCurrent();
     EXPECT_EQ(NamesOf(sheets), (Names{L"Untitled"}));
     EXPECT_TRUE(sheets.current().document.sheet().isEmpty(At(L"A1")));
+}
+
+TEST_F(OpenSheets, HaveDifferentColoursAsLongAsThereAreAny) {
+    for (int i = 1; i < kSheetColours; ++i) sheets.addNew();
+    std::set<int> colours;
+    for (size_t index = 0; index < sheets.count(); ++index) {
+        colours.insert(sheets.at(index).colour);
+    }
+    EXPECT_EQ(colours.size(), static_cast<size_t>(kSheetColours));
+
+    // The colour of a closed sheet is free again; with all in use the first one comes again.
+    sheets.select(3);
+    const int closed = sheets.current().colour;
+    sheets.closeCurrent();
+    EXPECT_EQ(sheets.addNew().colour, closed);
+    EXPECT_EQ(sheets.add(opened(L"one.csv")).colour, closed);  // takes an untouched one's place
+    EXPECT_EQ(sheets.add(opened(L"two.csv")).colour, 0);
 }
 
 TEST_F(OpenSheets, KeepEachSheetsEditsToItself) {
