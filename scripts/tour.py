@@ -13,17 +13,17 @@ sys.dont_write_bytecode = True
 ROOT = pathlib.Path(__file__).resolve().parents[1]
 sys.path.insert(0, str(ROOT / "tests" / "e2e"))
 
-from desktop import Desktop, wait_until  # noqa: E402
+from desktop import OUT_OF_THE_WAY, Desktop, wait_until  # noqa: E402
 from probe import Probe  # noqa: E402
 from workbook_app import Workbook, column_name, expect, windows_path  # noqa: E402
 
 
 @contextlib.contextmanager
-def opened(programs, file):
-    """A running workbook with the file, ended without saving."""
+def opened(programs, *files):
+    """A running workbook with the files, ended without saving."""
     with Desktop(programs / "workbook.exe") as desktop:
         probe = Probe(desktop, programs / "window_probe.exe")
-        workbook = Workbook(desktop, probe, programs / "workbook.exe", windows_path(file))
+        workbook = Workbook(desktop, probe, programs / "workbook.exe", *map(windows_path, files))
         try:
             yield workbook
             workbook.end_without_saving()
@@ -47,6 +47,27 @@ def zoom(workbook, key, percent):
 
 def chart_of(workbook):
     return workbook.view().main.find("KORVANE Corporation GraphControl")
+
+
+def chart_menu(workbook, *keys):
+    """Chooses in the Chart menu, with the pointer out of its way."""
+    workbook.desktop.move(*OUT_OF_THE_WAY)
+    workbook.desktop.key("alt+c", *keys)
+
+
+def show_side_panel(workbook):
+    """Shows it, with the first sheet unfolded in its tree."""
+    workbook.desktop.key("F9")
+    wait_until(lambda: workbook.view().main.find("SysTreeView32"), "the side panel appears")
+    workbook.desktop.key("F6", "Right")
+    wait_until(lambda: len(workbook.view().main.find("SysTreeView32").items) > 1, "its columns")
+
+
+def choose_column(workbook, number):
+    """Clicks a row of the list of statistics."""
+    left, top, _, bottom = workbook.view().main.find("SysListView32").rows[number]["rect"]
+    workbook.desktop.click(left + 8, (top + bottom) // 2)
+    expect(lambda: workbook.view().status.split()[0].startswith(column_name(number) + "1:"), True)
 
 
 def show_chart(workbook, first, last):
@@ -94,9 +115,32 @@ def steps(workbook, file):
     workbook.desktop.key("ctrl+Home")
     show_chart(workbook, "A1", "C13")
     yield "line-chart"
-    workbook.desktop.key("alt+c", "o")
-    workbook.desktop.key("alt+c", "g")
+    chart_menu(workbook, "o")
+    chart_menu(workbook, "g")
     yield "column-chart-with-legend"
+
+    workbook.desktop.key("alt+Return")
+    workbook.wait_for_dialog()
+    yield "chart-properties"
+    workbook.answer("Cancel")
+
+    show_side_panel(workbook)
+    choose_column(workbook, 1)
+    yield "side-panel"
+
+    workbook.desktop.key("ctrl+n")
+    expect(lambda: workbook.view().title, "Untitled - Workbook")
+    workbook.desktop.click(*workbook.view().main.find("FunkyBarControl").centre)
+    workbook.wait_for_menu()
+    yield "menu-of-sheets"
+    workbook.desktop.key("Escape")
+
+
+def take_picture(workbook):
+    """The workbook, and what of it reaches beyond its window, such as a dialog."""
+    picture, windows = workbook.settle(), workbook.probe.windows()
+    lefts, tops, rights, bottoms = zip(*(window.rect for window in windows))
+    return picture.crop((min(lefts), min(tops), max(rights), max(bottoms)))
 
 
 def main():
@@ -107,7 +151,7 @@ def main():
     with opened(programs, file) as workbook:
         for number, what in enumerate(steps(workbook, file), 1):
             path = folder / f"{number}-{what}.png"
-            workbook.settle().crop(workbook.view().main.rect).write_png(path)
+            take_picture(workbook).write_png(path)
             print(path)
 
 

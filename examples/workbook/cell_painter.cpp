@@ -32,8 +32,8 @@ void DrawCellText(CellAddress cell, const std::wstring& text, const TextStyle& s
 }
 
 bool IsTitleCell(const Workbook& workbook, CellAddress cell) {
-    return workbook.view.titleRow && cell.row == 0 &&
-           cell.column < workbook.document.sheet().extent().columns;
+    return workbook.sheetView().titleRow && cell.row == 0 &&
+           cell.column < workbook.sheet().extent().columns;
 }
 
 TextStyle StyleOf(const Workbook& workbook, CellAddress cell) {
@@ -64,7 +64,7 @@ void DrawNumber(const Workbook& workbook, CellAddress cell, double number) {
     TextStyle style = StyleOf(workbook, cell);
     style.format = kOneLine | DT_RIGHT;
     style.mustFit = true;
-    const int room = workbook.widths.of(cell.column) - kTextMargins;
+    const int room = workbook.sheetView().widths.of(cell.column) - kTextMargins;
     DrawCellText(cell, FitNumber(number, room / workbook.styles.digitWidth), style);
 }
 
@@ -84,7 +84,7 @@ UINT TitleFormat(const Sheet& sheet, CellAddress title) {
 }
 
 void DrawWords(const Workbook& workbook, CellAddress cell, std::wstring_view words, int endColumn) {
-    const Sheet& sheet = workbook.document.sheet();
+    const Sheet& sheet = workbook.sheet();
     TextStyle style = StyleOf(workbook, cell);
     const std::wstring text = DrawableText(words);
     if (text.find(L'\n') != std::wstring::npos) {
@@ -98,7 +98,7 @@ void DrawWords(const Workbook& workbook, CellAddress cell, std::wstring_view wor
 }
 
 void DrawCell(const Workbook& workbook, CellAddress cell, int endColumn) {
-    const ValueView value = workbook.document.sheet().view(cell);
+    const ValueView value = workbook.sheet().view(cell);
     switch (value.kind) {
     case ValueKind::Empty: break;
     case ValueKind::Number: DrawNumber(workbook, cell, value.number); break;
@@ -111,7 +111,7 @@ void DrawCell(const Workbook& workbook, CellAddress cell, int endColumn) {
 // A text that begins left of the view and runs into it: what is left of it from the first visible
 // column on. The grid draws visible cells only, so the rest is drawn as that column's text.
 void DrawTextFromLeft(const Workbook& workbook, int row, const GridVisibleRange& range) {
-    const Sheet& sheet = workbook.document.sheet();
+    const Sheet& sheet = workbook.sheet();
     const CellAddress first = {range.firstColumn, row};
     if (first.column == 0 || !sheet.isEmpty(first)) return;
     CellAddress source = {first.column - 1, row};
@@ -122,7 +122,7 @@ void DrawTextFromLeft(const Workbook& workbook, int row, const GridVisibleRange&
     const std::wstring text = DrawableText(value.text);
     if (text.find(L'\n') != std::wstring::npos) return;
     TextStyle style = StyleOf(workbook, source);
-    const int hidden = workbook.widths.sum(source.column, first.column);
+    const int hidden = workbook.sheetView().widths.sum(source.column, first.column);
     const size_t count = workbook.measure.charactersWithin(style.font, text, hidden);
     if (count >= text.size()) return;
     style.spanRight = EmptyNeighbours(sheet, first, range.endColumn);
@@ -132,8 +132,7 @@ void DrawTextFromLeft(const Workbook& workbook, int row, const GridVisibleRange&
 // The tinted background covers the grid lines, so the title row brings its own.
 void PaintTitleBackground(const Workbook& workbook, const GridVisibleRange& range) {
     const CellStyles& styles = workbook.styles;
-    const int endColumn =
-        std::min<int>(range.endColumn, workbook.document.sheet().extent().columns);
+    const int endColumn = std::min<int>(range.endColumn, workbook.sheet().extent().columns);
     for (int column = range.firstColumn; column < endColumn; ++column) {
         const CellIndex cell = KORGRID_CELL(column, 0);
         SetCellBackGroundColor(cell, styles.titleBrush);
@@ -146,8 +145,8 @@ void PaintTitleBackground(const Workbook& workbook, const GridVisibleRange& rang
 }  // namespace
 
 void PaintCells(const Workbook& workbook, const GridVisibleRange& range) {
-    if (workbook.view.titleRow && range.firstRow == 0) PaintTitleBackground(workbook, range);
-    const SheetExtent extent = workbook.document.sheet().extent();
+    if (workbook.sheetView().titleRow && range.firstRow == 0) PaintTitleBackground(workbook, range);
+    const SheetExtent extent = workbook.sheet().extent();
     const int endRow = std::min<int>(range.endRow, extent.rows);
     const int endColumn = std::min<int>(range.endColumn, extent.columns);
     for (int row = range.firstRow; row < endRow; ++row) {

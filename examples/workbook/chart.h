@@ -1,21 +1,12 @@
 // What the program knows about its chart view. The chart itself is asked for its type, zoom and
-// options.
+// options; what is charted belongs to the sheet (see ChartChoice).
 #pragma once
 
 #include <windows.h>
 
-#include <optional>
-#include <string>
-
 #include "chart_data.h"
 
 namespace workbook {
-
-struct ChartTitles {
-    std::wstring chart;
-    std::wstring categories;
-    std::wstring values;
-};
 
 struct LiveDemonstration {
     bool isRunning = false;
@@ -23,17 +14,23 @@ struct LiveDemonstration {
     int step = 0;
 };
 
+// The bar belongs to the main window, the combo boxes to the bar.
+struct ChartBar {
+    HWND window = nullptr;
+    HWND zoom = nullptr;
+    HWND type = nullptr;
+};
+
 struct Chart {
+    ChartBar bar;
     HWND pane = nullptr;  // borderless, so that the tooltip is placed right: see chart_pane.h
     HWND graph = nullptr;
-    HWND liveGraph = nullptr;  // shown while the demonstration runs
+    HWND livePane = nullptr;  // in the pane, shown while the demonstration runs
+    HWND liveGraph = nullptr;
 
     bool isShown = false;
     bool isStale = false;  // the sheet was edited; brought up to date when no message waits
-    Block block;
-    ChartData data;                     // as the chart has it
-    std::optional<ChartTitles> titles;  // chosen by the user; otherwise they follow the sheet
-    std::optional<ValueRange> range;    // fixed by the user; otherwise automatic
+    ChartData data;        // as the chart has it
     COLORREF background = RGB(255, 255, 255);
     LiveDemonstration live;
 };

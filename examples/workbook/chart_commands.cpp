@@ -7,6 +7,7 @@
 
 #include "chart_dialogs.h"
 #include "chart_live.h"
+#include "chart_output.h"
 #include "chart_pane.h"
 #include "chart_view.h"
 #include "equation_bar.h"
@@ -37,26 +38,36 @@ bool IsBetween(UINT command, UINT first, UINT last) { return first <= command &&
 constexpr DWORD OptionOf(UINT command) { return DWORD{1} << (command - IDM_CHART_OPTION_FIRST); }
 
 void ShowPane(Workbook& workbook, bool shown) {
+    workbook.panel.isStale = true;
     workbook.chart.isShown = shown;
     LayOutWindow(workbook);
     ShowWindow(workbook.chart.pane, shown ? SW_SHOW : SW_HIDE);
+    // The chart's own visibility chooses the bar's tooltip, "Show Grid" or "Show Graph".
+    ShowWindow(workbook.chart.graph, shown ? SW_SHOW : SW_HIDE);
     UpdateScrollRanges(workbook);
 }
 
 void ChartSelection(Workbook& workbook) {
     CommitTyping(workbook);
-    ChartBlockOf(workbook, SelectedBlock());
     if (!workbook.chart.isShown) ShowPane(workbook, true);
+    ChartBlockOf(workbook, SelectedBlock());
 }
 
+// With a single cell selected the chart comes back as it was.
 void ToggleChart(Workbook& workbook) {
-    if (!workbook.chart.isShown) return ChartSelection(workbook);
-    StopLiveData(workbook);
-    ShowPane(workbook, false);
+    if (workbook.chart.isShown) {
+        StopLiveData(workbook);
+        return ShowPane(workbook, false);
+    }
+    if (SelectedBlock() != BlockOf(CurrentCell())) return ChartSelection(workbook);
+    CommitTyping(workbook);
+    ShowPane(workbook, true);
+    ShowChartOfSheet(workbook);
 }
 
 // Titles and ranges belong to values and categories, the chart's to x and y.
 void SetType(Workbook& workbook, LONG type) {
+    workbook.panel.isStale = true;
     KorGraph_SetType(workbook.chart.graph, type);
     ApplyCategories(workbook);
     ApplyTitles(workbook);
@@ -93,7 +104,7 @@ void ChooseBackground(Workbook& workbook) {
 }
 
 void SetChartRange(Workbook& workbook, const std::optional<ValueRange>& range) {
-    workbook.chart.range = range;
+    workbook.sheetView().chart.values = range;
     ApplyRange(workbook);
     DrawChart(workbook);
 }
@@ -150,8 +161,11 @@ void RunChartCommand(Workbook& workbook, UINT command) {
     switch (command) {
     case IDM_CHART_LEGEND: return ToggleLegend(workbook);
     case IDM_CHART_TITLES: return EditChartTitles(workbook);
+    case IDM_CHART_PROPERTIES: return EditChartProperties(workbook);
+    case IDM_CHART_COPY: return CopyChart(workbook);
     case IDM_CHART_RANGE_AUTOMATIC: return SetChartRange(workbook, std::nullopt);
-    case IDM_CHART_RANGE_FIX: return SetChartRange(workbook, ShownRange(workbook));
+    case IDM_CHART_RANGE_FIX:
+        return SetChartRange(workbook, ShownRange(workbook, ValueAxis(workbook)));
     case IDM_CHART_RANGE_EDIT: return EditChartRange(workbook);
     case IDM_CHART_LIVE_OFF: return StopLiveData(workbook);
     case IDM_CHART_LIVE_SWEEP: return StartLiveData(workbook, KORGRAPH_SWEEP);
@@ -175,7 +189,7 @@ void PrepareChartMenu(const Workbook& workbook, HMENU menu) {
     MarkOne(menu, IDM_CHART_BACKGROUND_WHITE, IDM_CHART_BACKGROUND_CHOOSE,
             BackgroundCommand(chart.background));
     Check(menu, IDM_CHART_LEGEND, IsLegendShown(workbook));
-    Check(menu, IDM_CHART_RANGE_AUTOMATIC, !chart.range);
+    Check(menu, IDM_CHART_RANGE_AUTOMATIC, !workbook.sheetView().chart.values);
     MarkOne(menu, IDM_CHART_LIVE_OFF, IDM_CHART_LIVE_REPLACE, LiveCommand(chart.live));
 }
 

@@ -87,6 +87,7 @@ std::wstring Heading(const Sheet& sheet, const ChartBlock& parts, int column) {
 
 ChartSeries ReadSeries(const Sheet& sheet, const ChartBlock& parts, int column) {
     ChartSeries series;
+    series.column = column;
     series.name = Heading(sheet, parts, column);
     if (series.name.empty()) series.name = ColumnName(column);
     series.values.resize(static_cast<size_t>(parts.rows()));

@@ -11,6 +11,7 @@ namespace workbook {
 struct ChartSeries {
     std::wstring name;
     std::vector<double> values;  // as many in every series
+    int column = 0;              // of the sheet
 };
 
 struct ChartData {
@@ -24,6 +25,14 @@ struct ValueRange {
     double high = 0;
 
     friend bool operator==(const ValueRange&, const ValueRange&) = default;
+};
+
+struct ChartTitles {
+    std::wstring chart;
+    std::wstring categories;
+    std::wstring values;
+
+    friend bool operator==(const ChartTitles&, const ChartTitles&) = default;
 };
 
 // The block that a selection means: its part with anything in it, for a single cell all of the

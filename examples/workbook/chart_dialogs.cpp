@@ -101,18 +101,18 @@ void EditChartTitles(Workbook& workbook) {
              &titles)) {
         return;
     }
-    workbook.chart.titles = titles;
+    workbook.sheetView().chart.titles = titles;
     ApplyTitles(workbook);
     DrawChart(workbook);
 }
 
 void EditChartRange(Workbook& workbook) {
-    ValueRange range = ShownRange(workbook);
+    ValueRange range = ShownRange(workbook, ValueAxis(workbook));
     if (!Ask(workbook, IDD_CHART_RANGE, DialogProc<ValueRange, FillRange, OnRangeAccepted>,
              &range)) {
         return;
     }
-    workbook.chart.range = range;
+    workbook.sheetView().chart.values = range;
     ApplyRange(workbook);
     DrawChart(workbook);
 }

@@ -58,7 +58,7 @@ void Prepare(HWND graph, LONG mode) {
 
 void ShowLiveChart(Workbook& workbook, bool shown) {
     workbook.chart.live.isRunning = shown;
-    ShowWindow(workbook.chart.liveGraph, shown ? SW_SHOW : SW_HIDE);
+    ShowWindow(workbook.chart.livePane, shown ? SW_SHOW : SW_HIDE);
     LayOutChartPane(workbook);
 }
 

@@ -26,9 +26,6 @@ constexpr int kLegendHeight = 120;
 constexpr int kLegendTop = 24;  // below the title
 constexpr int kLegendGap = 6;
 
-// The chart must not paint over the tooltip, a sibling, nor over the legend, a child.
-constexpr DWORD kGraphStyle = WS_CHILD | WS_CLIPSIBLINGS | WS_CLIPCHILDREN;
-
 RECT ClientOf(HWND window) {
     RECT area = {};
     GetClientRect(window, &area);
@@ -52,10 +49,11 @@ void PlaceLegend(const Chart& chart) {
     SetWindowPos(legend, nullptr, place.left, place.top, 0, 0, SWP_NOSIZE | SWP_NOZORDER);
 }
 
-HWND CreateGraph(const Workbook& workbook, int id, DWORD style) {
-    return CreateWindowExW(0, KORGRAPH_CLASS, nullptr, kGraphStyle | style, 0, 0, 0, 0,
-                           workbook.chart.pane, reinterpret_cast<HMENU>(INT_PTR{id}),
-                           workbook.instance, nullptr);
+HWND CreateChild(const Workbook& workbook, const wchar_t* windowClass, HWND parent, int id,
+                 DWORD style) {
+    return CreateWindowExW(0, windowClass, nullptr, WS_CHILD | WS_CLIPCHILDREN | style, 0, 0, 0, 0,
+                           parent, reinterpret_cast<HMENU>(INT_PTR{id}), workbook.instance,
+                           nullptr);
 }
 
 LRESULT Dispatch(Workbook& workbook, UINT message, WPARAM wParam, LPARAM lParam) {
@@ -110,11 +108,15 @@ bool CreateChartPane(Workbook& workbook) {
         return false;
     }
     Chart& chart = workbook.chart;
-    chart.pane = CreateWindowExW(0, kPaneClass, nullptr, WS_CHILD | WS_CLIPCHILDREN, 0, 0, 0, 0,
-                                 workbook.window, reinterpret_cast<HMENU>(INT_PTR{IDC_CHART_PANE}),
-                                 workbook.instance, nullptr);
-    chart.graph = CreateGraph(workbook, IDC_CHART, WS_VISIBLE);
-    chart.liveGraph = CreateGraph(workbook, IDC_LIVE_CHART, 0);
+    const LPCWSTR graphClass = GetGraphControlClassName();
+    chart.pane = CreateChild(workbook, kPaneClass, workbook.window, IDC_CHART_PANE, 0);
+    // A chart must not paint over the tooltip, a sibling, nor over the legend, a child.
+    chart.graph = CreateChild(workbook, graphClass, chart.pane, IDC_CHART, WS_CLIPSIBLINGS);
+    // Hiding the live chart itself would change the tool bar's tooltip, which is about the other
+    // chart; hiding its pane does not.
+    chart.livePane = CreateChild(workbook, kPaneClass, chart.pane, IDC_LIVE_PANE, 0);
+    chart.liveGraph = CreateChild(workbook, graphClass, chart.livePane, IDC_LIVE_CHART,
+                                  WS_CLIPSIBLINGS | WS_VISIBLE);
     SetWindowLongPtrW(chart.pane, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(&workbook));
     return chart.pane && chart.graph && chart.liveGraph;
 }
@@ -131,7 +133,9 @@ void LayOutChartPane(const Workbook& workbook) {
     const int chartHeight = chart.live.isRunning ? height * kChartPercent / 100 : height;
     MoveWindow(chart.graph, kEdge, 0, width, chartHeight, TRUE);
     const int liveTop = chartHeight + kEdge;
-    MoveWindow(chart.liveGraph, kEdge, liveTop, width, std::max(0, height - liveTop), TRUE);
+    const int liveHeight = std::max(0, height - liveTop);
+    MoveWindow(chart.livePane, kEdge, liveTop, width, liveHeight, TRUE);
+    MoveWindow(chart.liveGraph, 0, 0, width, liveHeight, TRUE);
     PlaceLegend(chart);
     ApplyCategories(workbook);
     DrawChart(workbook);
@@ -155,10 +159,9 @@ void ToggleLegend(Workbook& workbook) {
 }
 
 void KeepTooltipsInPane(const Workbook& workbook) {
-    const HWND pane = workbook.chart.pane;
-    // Each chart has one, with the same id.
-    for (HWND child = GetWindow(pane, GW_CHILD); child; child = GetWindow(child, GW_HWNDNEXT)) {
-        if (GetDlgCtrlID(child) == KORTOOLTIP_ID && IsWindowVisible(child)) KeepInPane(pane, child);
+    for (const HWND pane : {workbook.chart.pane, workbook.chart.livePane}) {
+        const HWND tooltip = GetDlgItem(pane, KORTOOLTIP_ID);
+        if (tooltip && IsWindowVisible(tooltip)) KeepInPane(pane, tooltip);
     }
 }
 

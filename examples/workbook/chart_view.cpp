@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <optional>
 #include <utility>
 #include <vector>
 
@@ -18,7 +19,7 @@ constexpr std::array<double, 4> kZoomFactors = {0.25, 0.5, 1, 2};
 
 // What a label takes, in pixels.
 constexpr size_t kCharacterWidth = 7;
-constexpr size_t kLabelGap = 6;
+constexpr size_t kLabelGap = 12;
 constexpr size_t kLabelHeight = 15;
 
 constexpr const wchar_t* kNothingToChart = L"There are no numbers to chart";
@@ -29,7 +30,7 @@ std::wstring WithoutExtension(const std::wstring& name) { return name.substr(0, 
 ChartTitles TitlesOfSheet(const Workbook& workbook) {
     const ChartData& data = workbook.chart.data;
     if (data.series.empty()) return {kNothingToChart, L"", L""};
-    return {WithoutExtension(workbook.document.name()), data.categoryTitle,
+    return {WithoutExtension(workbook.document().name()), data.categoryTitle,
             data.series.size() == 1 ? data.series.front().name : L""};
 }
 
@@ -105,29 +106,41 @@ void HandOverChanges(HWND graph, const ChartData& before, const ChartData& after
     }
 }
 
+void ApplyAxis(HWND graph, LONG axis, const std::optional<ValueRange>& range) {
+    if (range) {
+        KorGraph_SetRange(graph, axis, range->low, range->high);
+    } else {
+        KorGraph_AutoRange(graph, axis);
+    }
+}
+
 }  // namespace
 
 void ChartBlockOf(Workbook& workbook, const Block& selection) {
+    workbook.sheetView().chart = {};
+    workbook.sheetView().chart.block = ChartedBlock(workbook.sheet(), selection);
+    ShowChartOfSheet(workbook);
+}
+
+void ShowChartOfSheet(Workbook& workbook) {
     Chart& chart = workbook.chart;
-    const Sheet& sheet = workbook.document.sheet();
-    chart.block = ChartedBlock(sheet, selection);
-    chart.data = ReadChartData(sheet, chart.block);
-    chart.titles.reset();
-    chart.range.reset();
+    if (!chart.isShown) return;
+    const Sheet& sheet = workbook.sheet();
+    std::optional<Block>& block = workbook.sheetView().chart.block;
+    if (!block) block = ChartedBlock(sheet, BlockOf({0, 0}));
+    chart.data = ReadChartData(sheet, *block);
     chart.isStale = false;
+    workbook.panel.isStale = true;  // it shows the series' colours
     HandOverEverything(workbook);
     DrawChart(workbook);
 }
 
-void ChartNewDocument(Workbook& workbook) {
-    if (workbook.chart.isShown) ChartBlockOf(workbook, BlockOf({0, 0}));
-}
-
 void RefreshChart(Workbook& workbook) {
     Chart& chart = workbook.chart;
-    if (!chart.isStale || !chart.isShown) return;
+    const std::optional<Block>& block = workbook.sheetView().chart.block;
+    if (!chart.isStale || !chart.isShown || !block) return;
     chart.isStale = false;
-    ChartData now = ReadChartData(workbook.document.sheet(), chart.block);
+    ChartData now = ReadChartData(workbook.sheet(), *block);
     const ChartData before = std::exchange(chart.data, std::move(now));
     // Automatic ranges follow the values that series are added with, not those set later.
     const bool hasSameRange = ValuesOf(before) == ValuesOf(chart.data);
@@ -161,19 +174,17 @@ void ApplyTitles(const Workbook& workbook) {
 }
 
 void ApplyRange(const Workbook& workbook) {
-    const Chart& chart = workbook.chart;
-    KorGraph_AutoRange(chart.graph, KORGRAPH_X);
-    KorGraph_AutoRange(chart.graph, KORGRAPH_Y);
-    if (!chart.range) return;
-    KorGraph_SetRange(chart.graph, ValueAxis(workbook), chart.range->low, chart.range->high);
+    const LONG valueAxis = ValueAxis(workbook);
+    ApplyAxis(workbook.chart.graph, valueAxis, workbook.sheetView().chart.values);
+    ApplyAxis(workbook.chart.graph, OtherAxis(valueAxis), workbook.sheetView().chart.positions);
 }
 
 ChartTitles ShownTitles(const Workbook& workbook) {
-    return workbook.chart.titles ? *workbook.chart.titles : TitlesOfSheet(workbook);
+    return workbook.sheetView().chart.titles.value_or(TitlesOfSheet(workbook));
 }
 
-ValueRange ShownRange(const Workbook& workbook) {
-    GraphRange range = {ValueAxis(workbook), 0, 0, 0};
+ValueRange ShownRange(const Workbook& workbook, LONG axis) {
+    GraphRange range = {axis, 0, 0, 0};
     SendMessageW(workbook.chart.graph, GM_GETRANGE, 0, reinterpret_cast<LPARAM>(&range));
     return {range.min, range.max};
 }
@@ -186,5 +197,7 @@ void DrawChart(const Workbook& workbook) {
 LONG ValueAxis(const Workbook& workbook) {
     return KorGraph_GetType(workbook.chart.graph) == KORGRAPH_BAR ? KORGRAPH_X : KORGRAPH_Y;
 }
+
+LONG OtherAxis(LONG axis) { return axis == KORGRAPH_X ? KORGRAPH_Y : KORGRAPH_X; }
 
 }  // namespace workbook

@@ -105,7 +105,7 @@ Block ExtentOf(const std::vector<CellText>& cells) {
 }
 
 bool Copy(const Workbook& workbook) {
-    const Sheet& sheet = workbook.document.sheet();
+    const Sheet& sheet = workbook.sheet();
     return PutText(workbook.window, WriteTabText(CopiedRows(sheet, SelectedBlock())));
 }
 

@@ -3,6 +3,7 @@
 #include <string>
 
 #include "chart_commands.h"
+#include "chart_output.h"
 #include "clipboard.h"
 #include "dialogs.h"
 #include "edit_commands.h"
@@ -11,6 +12,7 @@
 #include "function_menu.h"
 #include "menu_marks.h"
 #include "resource.h"
+#include "sheet_switch.h"
 #include "view_commands.h"
 #include "workbook.h"
 
@@ -49,24 +51,26 @@ void PrepareEditMenu(const Document& document, HMENU menu) {
     Enable(menu, IDM_EDIT_PASTE, CanPaste());
 }
 
-void PrepareViewMenu(const ViewOptions& view, HMENU menu) {
+void PrepareViewMenu(const ViewOptions& view, bool titleRow, HMENU menu) {
     CheckMenuRadioItem(menu, IDM_VIEW_ZOOM_50, IDM_VIEW_ZOOM_200, ZoomCommand(view.zoom),
                        MF_BYCOMMAND);
     Check(menu, IDM_VIEW_HEADERS, view.headers);
     Check(menu, IDM_VIEW_GRID_LINES, view.gridLines);
     Check(menu, IDM_VIEW_HORIZONTAL_SCROLL_BAR, view.horizontalScrollBar);
     Check(menu, IDM_VIEW_VERTICAL_SCROLL_BAR, view.verticalScrollBar);
-    Check(menu, IDM_VIEW_TITLE_ROW, view.titleRow);
+    Check(menu, IDM_VIEW_TITLE_ROW, titleRow);
 }
 
 }  // namespace
 
 void RunCommand(Workbook& workbook, UINT command) {
     switch (command) {
-    case IDM_FILE_NEW: return NewDocument(workbook);
+    case IDM_FILE_NEW: return AddNewSheet(workbook);
     case IDM_FILE_OPEN: return OpenWithDialog(workbook);
     case IDM_FILE_SAVE: Save(workbook); return;
     case IDM_FILE_SAVE_AS: SaveAs(workbook); return;
+    case IDM_FILE_CLOSE: return CloseSheet(workbook);
+    case IDM_FILE_PRINT: return PrintChart(workbook);
     case IDM_FILE_EXIT: PostMessageW(workbook.window, WM_CLOSE, 0, 0); return;
 
     case IDM_EDIT_UNDO: return Undo(workbook);
@@ -92,6 +96,10 @@ void RunCommand(Workbook& workbook, UINT command) {
     case IDM_VIEW_VERTICAL_SCROLL_BAR: return ToggleVerticalBar(workbook);
     case IDM_VIEW_TITLE_ROW: return ToggleTitleRow(workbook);
     case IDM_VIEW_FIT_SIZES: return FitSizesAndRedraw(workbook);
+    case IDM_VIEW_SIDE_PANEL: return ToggleSidePanel(workbook);
+    case IDM_VIEW_NEXT_PANE: return StepFocus(workbook);
+    case IDM_VIEW_NEXT_SHEET: return StepToSheet(workbook, 1);
+    case IDM_VIEW_PREVIOUS_SHEET: return StepToSheet(workbook, -1);
 
     case IDM_HELP_KEYS: return ShowKeys(workbook);
     case IDM_HELP_ABOUT: return ShowAbout(workbook);
@@ -107,9 +115,11 @@ void RunCommand(Workbook& workbook, UINT command) {
 }
 
 void PrepareMenu(const Workbook& workbook, HMENU menu) {
-    PrepareEditMenu(workbook.document, menu);
-    PrepareViewMenu(workbook.view, menu);
+    PrepareEditMenu(workbook.document(), menu);
+    PrepareViewMenu(workbook.view, workbook.sheetView().titleRow, menu);
     PrepareChartMenu(workbook, menu);
+    Enable(menu, IDM_FILE_PRINT, CanPrintChart(workbook));
+    Check(menu, IDM_VIEW_SIDE_PANEL, workbook.panel.isShown);
 }
 
 }  // namespace workbook

@@ -21,6 +21,7 @@ void AfterEdit(Workbook& workbook, EditResult result) {
     if (result == EditResult::NoMemory) workbook.isOutOfMemory = true;
     if (result != EditResult::Done) return;
     workbook.chart.isStale = true;
+    workbook.panel.isStale = true;
     ShowTitle(workbook);
     UpdateScrollRanges(workbook);
 }
@@ -40,28 +41,28 @@ void ShowStep(Workbook& workbook, const std::optional<Block>& changed) {
 }  // namespace
 
 void StoreText(Workbook& workbook, CellAddress cell, std::wstring text) {
-    AfterEdit(workbook, workbook.document.setCell(cell, std::move(text)));
+    AfterEdit(workbook, workbook.document().setCell(cell, std::move(text)));
 }
 
 void StoreCells(Workbook& workbook, std::vector<CellText> cells, std::wstring what) {
-    AfterEdit(workbook, workbook.document.setCells(std::move(cells), std::move(what)));
+    AfterEdit(workbook, workbook.document().setCells(std::move(cells), std::move(what)));
     ShowChangedCells(workbook);
 }
 
 void ClearSelection(Workbook& workbook) {
     CommitTyping(workbook);
-    AfterEdit(workbook, workbook.document.clear(SelectedBlock()));
+    AfterEdit(workbook, workbook.document().clear(SelectedBlock()));
     ShowChangedCells(workbook);
 }
 
 void Undo(Workbook& workbook) {
     CommitTyping(workbook);
-    ShowStep(workbook, workbook.document.undo());
+    ShowStep(workbook, workbook.document().undo());
 }
 
 void Redo(Workbook& workbook) {
     CommitTyping(workbook);
-    ShowStep(workbook, workbook.document.redo());
+    ShowStep(workbook, workbook.document().redo());
 }
 
 void SelectAllCells(Workbook& workbook) {
@@ -76,7 +77,7 @@ void GoToFirstCell(Workbook& workbook) {
 
 void GoToLastCell(Workbook& workbook) {
     CommitTyping(workbook);
-    const SheetExtent extent = workbook.document.sheet().extent();
+    const SheetExtent extent = workbook.sheet().extent();
     GoTo(workbook, BlockOf({std::max(0, extent.columns - 1), std::max(0, extent.rows - 1)}));
 }
 

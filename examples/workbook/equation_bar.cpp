@@ -50,7 +50,7 @@ void PrepareEquationBar(const Workbook& workbook) {
 }
 
 void ShowCurrentCell(Workbook& workbook) {
-    KorGrid_SetEquationText(workbook.grid, workbook.document.sheet().text(CurrentCell()).c_str());
+    KorGrid_SetEquationText(workbook.grid, workbook.sheet().text(CurrentCell()).c_str());
     // Not every EDIT clears the flag when its text is set; left set, the shown text would be stored
     // again, or an empty one would clear whatever cell is current by then.
     SendMessageW(GetHandleToEquationControl(), EM_SETMODIFY, FALSE, 0);

@@ -4,9 +4,13 @@
 #include <shellapi.h>
 
 #include <array>
+#include <memory>
+#include <utility>
+#include <vector>
 
 #include "equation_bar.h"
-#include "view_commands.h"
+#include "sheet_bar.h"
+#include "sheet_switch.h"
 #include "workbook.h"
 #include "workbook_window.h"
 
@@ -18,6 +22,7 @@ constexpr const wchar_t* kFilter = L"CSV files (*.csv)\0*.csv\0"
                                    L"Text files (*.txt;*.tsv)\0*.txt;*.tsv\0"
                                    L"All files (*.*)\0*.*\0";
 constexpr size_t kLongestPath = 4096;
+constexpr UINT kCountFiles = 0xFFFFFFFF;  // asks DragQueryFileW how many there are
 
 // An hourglass for as long as it lives.
 class WaitCursor {
@@ -38,8 +43,15 @@ void ShowProblem(const Workbook& workbook, const FileProblem& problem) {
     MessageBoxW(workbook.window, problem.message.c_str(), L"Workbook", MB_OK | MB_ICONWARNING);
 }
 
-// The dialogs' common part. `file` holds the suggested name and receives the chosen path.
-OPENFILENAMEW FileDialog(const Workbook& workbook, std::array<wchar_t, kLongestPath>& file) {
+std::wstring FolderOf(const std::wstring& path) {
+    const size_t slash = path.find_last_of(L"\\/");
+    return slash == std::wstring::npos ? std::wstring() : path.substr(0, slash + 1);
+}
+
+// The dialogs' common part: they begin in `folder`, the system's choice when it is empty. `file`
+// holds the suggested name and receives the chosen path.
+OPENFILENAMEW FileDialog(const Workbook& workbook, const std::wstring& folder,
+                         std::array<wchar_t, kLongestPath>& file) {
     OPENFILENAMEW dialog = {};
     dialog.lStructSize = sizeof dialog;
     dialog.hwndOwner = workbook.window;
@@ -47,66 +59,48 @@ OPENFILENAMEW FileDialog(const Workbook& workbook, std::array<wchar_t, kLongestP
     dialog.lpstrFile = file.data();
     dialog.nMaxFile = static_cast<DWORD>(file.size());
     dialog.lpstrDefExt = L"csv";
+    if (!folder.empty()) dialog.lpstrInitialDir = folder.c_str();
     return dialog;
 }
 
 bool SaveTo(Workbook& workbook, const std::wstring& path) {
     const WaitCursor wait;
-    const std::optional<FileProblem> problem = workbook.document.save(path);
+    const std::optional<FileProblem> problem = workbook.document().save(path);
     if (problem) ShowProblem(workbook, *problem);
     ShowTitle(workbook);
     return !problem;
 }
 
-void Load(Workbook& workbook, const std::wstring& path) {
-    std::optional<FileProblem> problem;
-    {
-        const WaitCursor wait;
-        problem = workbook.document.open(path);
-        if (!problem) ShowDocumentFromStart(workbook);
-    }
-    if (problem) ShowProblem(workbook, *problem);
+// Paths are compared to find a file that is open already.
+std::wstring FullPath(const std::wstring& path) {
+    std::array<wchar_t, kLongestPath> full = {};
+    const DWORD length =
+        GetFullPathNameW(path.c_str(), static_cast<DWORD>(full.size()), full.data(), nullptr);
+    return length > 0 && length < full.size() ? full.data() : path;
 }
 
-}  // namespace
-
-void NewDocument(Workbook& workbook) {
-    if (!MayDiscard(workbook)) return;
-    workbook.document.startNew();
-    ShowDocumentFromStart(workbook);
+std::optional<FileProblem> Load(Workbook& workbook, const std::wstring& path) {
+    const WaitCursor wait;
+    auto sheet = std::make_unique<OpenSheet>();
+    std::optional<FileProblem> problem = sheet->document.open(path);
+    if (problem) return problem;
+    LeaveSheet(workbook);
+    workbook.sheets.add(std::move(sheet));
+    ShowSheetFirstTime(workbook);
+    return std::nullopt;
 }
 
-void OpenWithDialog(Workbook& workbook) {
-    if (!MayDiscard(workbook)) return;
-    std::array<wchar_t, kLongestPath> file = {};
-    OPENFILENAMEW dialog = FileDialog(workbook, file);
-    dialog.Flags = OFN_EXPLORER | OFN_FILEMUSTEXIST | OFN_PATHMUSTEXIST | OFN_HIDEREADONLY;
-    if (GetOpenFileNameW(&dialog)) Load(workbook, file.data());
+// Two sheets with one file would each write over what the other one wrote.
+bool IsOpenInAnotherSheet(const Workbook& workbook, const std::wstring& path) {
+    const std::optional<size_t> index = workbook.sheets.find(path);
+    return index && *index != workbook.sheets.currentIndex();
 }
 
-void OpenFile(Workbook& workbook, const std::wstring& path) {
-    if (MayDiscard(workbook)) Load(workbook, path);
-}
-
-bool Save(Workbook& workbook) {
-    CommitTyping(workbook);
-    const std::wstring path = workbook.document.path();
-    return path.empty() ? SaveAs(workbook) : SaveTo(workbook, path);
-}
-
-bool SaveAs(Workbook& workbook) {
-    CommitTyping(workbook);
-    std::array<wchar_t, kLongestPath> file = {};
-    lstrcpynW(file.data(), workbook.document.name().c_str(), static_cast<int>(file.size()));
-    OPENFILENAMEW dialog = FileDialog(workbook, file);
-    dialog.Flags = OFN_EXPLORER | OFN_OVERWRITEPROMPT | OFN_PATHMUSTEXIST | OFN_HIDEREADONLY;
-    return GetSaveFileNameW(&dialog) && SaveTo(workbook, file.data());
-}
-
+// Asks about unsaved changes of the current sheet, and saves them if wanted.
+//   result  whether the sheet may go
 bool MayDiscard(Workbook& workbook) {
-    CommitTyping(workbook);
-    if (!workbook.document.isModified()) return true;
-    const std::wstring question = L"Save the changes to " + workbook.document.name() + L"?";
+    if (!workbook.document().isModified()) return true;
+    const std::wstring question = L"Save the changes to " + workbook.document().name() + L"?";
     switch (MessageBoxW(workbook.window, question.c_str(), L"Workbook",
                         MB_YESNOCANCEL | MB_ICONQUESTION)) {
     case IDYES: return Save(workbook);
@@ -115,13 +109,77 @@ bool MayDiscard(Workbook& workbook) {
     }
 }
 
-void OnDropFiles(Workbook& workbook, HDROP drop) {
+}  // namespace
+
+void OpenWithDialog(Workbook& workbook) {
+    CommitTyping(workbook);
     std::array<wchar_t, kLongestPath> file = {};
-    const bool any = DragQueryFileW(drop, 0, file.data(), static_cast<UINT>(file.size())) != 0;
+    const std::wstring folder = FolderOf(workbook.document().path());
+    OPENFILENAMEW dialog = FileDialog(workbook, folder, file);
+    dialog.Flags = OFN_EXPLORER | OFN_FILEMUSTEXIST | OFN_PATHMUSTEXIST | OFN_HIDEREADONLY;
+    if (GetOpenFileNameW(&dialog)) OpenFile(workbook, file.data());
+}
+
+void OpenFile(Workbook& workbook, const std::wstring& path) {
+    const std::wstring full = FullPath(path);
+    if (const std::optional<size_t> index = workbook.sheets.find(full)) {
+        return SelectSheet(workbook, *index);
+    }
+    if (const std::optional<FileProblem> problem = Load(workbook, full)) {
+        ShowProblem(workbook, *problem);
+    }
+}
+
+bool Save(Workbook& workbook) {
+    CommitTyping(workbook);
+    const std::wstring path = workbook.document().path();
+    return path.empty() ? SaveAs(workbook) : SaveTo(workbook, path);
+}
+
+bool SaveAs(Workbook& workbook) {
+    CommitTyping(workbook);
+    std::array<wchar_t, kLongestPath> file = {};
+    lstrcpynW(file.data(), workbook.document().name().c_str(), static_cast<int>(file.size()));
+    const std::wstring folder = FolderOf(workbook.document().path());
+    OPENFILENAMEW dialog = FileDialog(workbook, folder, file);
+    dialog.Flags = OFN_EXPLORER | OFN_OVERWRITEPROMPT | OFN_PATHMUSTEXIST | OFN_HIDEREADONLY;
+    if (!GetSaveFileNameW(&dialog)) return false;
+    if (IsOpenInAnotherSheet(workbook, file.data())) {
+        ShowProblem(workbook, {L"\"" + std::wstring(file.data()) +
+                               L"\" is open as another sheet. Choose another name."});
+        return false;
+    }
+    return SaveTo(workbook, file.data());
+}
+
+void CloseSheet(Workbook& workbook) {
+    CommitTyping(workbook);
+    if (!MayDiscard(workbook)) return;
+    RemoveFromSheetBar(workbook, workbook.sheets.currentIndex());
+    workbook.sheets.closeCurrent();
+    ShowSheet(workbook);
+}
+
+bool MayEnd(Workbook& workbook) {
+    CommitTyping(workbook);
+    for (size_t index = 0; index < workbook.sheets.count(); ++index) {
+        if (!workbook.sheets.at(index).document.isModified()) continue;
+        SelectSheet(workbook, index);
+        if (!MayDiscard(workbook)) return false;
+    }
+    return true;
+}
+
+void OnDropFiles(Workbook& workbook, HDROP drop) {
+    std::vector<std::wstring> files(DragQueryFileW(drop, kCountFiles, nullptr, 0));
+    for (UINT index = 0; index < files.size(); ++index) {
+        std::array<wchar_t, kLongestPath> file = {};
+        DragQueryFileW(drop, index, file.data(), static_cast<UINT>(file.size()));
+        files[index] = file.data();
+    }
     DragFinish(drop);
-    if (!any) return;
     SetForegroundWindow(workbook.window);
-    OpenFile(workbook, file.data());
+    for (const std::wstring& file : files) OpenFile(workbook, file);
 }
 
 }  // namespace workbook

@@ -1,4 +1,4 @@
-// New, open, save: dialogs, questions and messages around the document's file.
+// Open, save, close: dialogs, questions and messages around the sheets' files.
 #pragma once
 
 #include <windows.h>
@@ -9,21 +9,24 @@ namespace workbook {
 
 struct Workbook;
 
-void NewDocument(Workbook& workbook);
 void OpenWithDialog(Workbook& workbook);
 
-// Opens a file after asking about unsaved changes. With a problem the open document stays.
+// Opens a file as another sheet, or shows the sheet that has it open already. A problem is told,
+// and all stays as it was.
 void OpenFile(Workbook& workbook, const std::wstring& path);
 
-//   result  whether the document is saved now
+//   result  whether the current sheet is saved now
 bool Save(Workbook& workbook);
 bool SaveAs(Workbook& workbook);
 
-// Asks about unsaved changes, and saves them if wanted.
-//   result  whether the document may go
-bool MayDiscard(Workbook& workbook);
+// Asks about unsaved changes before the current sheet goes.
+void CloseSheet(Workbook& workbook);
 
-// A file was dropped on the window; only the first of several is opened. Frees the drop.
+// Shows each sheet with unsaved changes, asks about it, and saves it if wanted.
+//   result  whether the program may end; "Cancel" keeps everything open
+bool MayEnd(Workbook& workbook);
+
+// Files were dropped on the window. Frees the drop.
 void OnDropFiles(Workbook& workbook, HDROP drop);
 
 }  // namespace workbook

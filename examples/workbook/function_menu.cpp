@@ -75,7 +75,7 @@ void InsertFunction(Workbook& workbook, UINT command) {
     const size_t index = command - IDM_FUNCTION_FIRST;
     if (index >= Functions().size()) return;
     const FunctionDescription& function = Functions()[index];
-    const Sheet& sheet = workbook.document.sheet();
+    const Sheet& sheet = workbook.sheet();
     const std::wstring call = std::wstring(function.name) + L"(";
 
     const std::optional<Block> block = BlockToCalculate(sheet);

@@ -18,7 +18,7 @@ bool IsShiftDown() { return GetKeyState(VK_SHIFT) < 0; }
 // The equation messages carry the cell the other way round than a CellIndex does.
 CellAddress CellOfCommit(LPARAM lParam) {
     const auto packed = static_cast<DWORD>(lParam);
-    return {HIWORD(packed), LOWORD(packed)};
+    return {KORGRID_EQUATIONCOLUMN(packed), KORGRID_EQUATIONROW(packed)};
 }
 
 void OnCellClicked(Workbook& workbook, const GridCellPair& cell) {
@@ -54,12 +54,17 @@ void OnCurrentCell(Workbook& workbook) {
 // The grid drew before it told the new width, which numbers and overhanging texts depend on, and it
 // drew too little at other zooms than 100 %.
 void OnColumnResized(Workbook& workbook, DWORD sizeAndColumn) {
-    const int column = HIWORD(sizeAndColumn);
-    if (column < kColumnCount) workbook.widths.set(column, LOWORD(sizeAndColumn));
+    const int column = KORGRID_RESIZEDINDEX(sizeAndColumn);
+    if (column < kColumnCount)
+        workbook.sheetView().widths.set(column, KORGRID_RESIZEDSIZE(sizeAndColumn));
     KorGrid_Redraw(workbook.grid);
 }
 
-void OnRowResized(const Workbook& workbook) { KorGrid_Redraw(workbook.grid); }
+void OnRowResized(Workbook& workbook, DWORD sizeAndRow) {
+    const int row = KORGRID_RESIZEDINDEX(sizeAndRow);
+    if (row < kRowCount) workbook.sheetView().heights[row] = KORGRID_RESIZEDSIZE(sizeAndRow);
+    KorGrid_Redraw(workbook.grid);
+}
 
 // A press on the very beginning of a header takes the capture and never gives it back, so that the
 // next click anywhere would be the header's.
@@ -86,7 +91,7 @@ bool OnGridNotify(Workbook& workbook, UINT code, LPARAM lParam) {
         OnCellClicked(workbook, *reinterpret_cast<const GridCellPair*>(lParam));
         return true;
     case GRIDN_COLUMNRESIZED: OnColumnResized(workbook, static_cast<DWORD>(lParam)); return true;
-    case GRIDN_ROWRESIZED: OnRowResized(workbook); return true;
+    case GRIDN_ROWRESIZED: OnRowResized(workbook, static_cast<DWORD>(lParam)); return true;
     case GRIDN_CURRENTCELL: OnCurrentCell(workbook); return true;
     case GRIDN_SELECTING: OnSelecting(workbook); return true;
     case GRIDN_SELECTIONDONE: OnSelectionDone(workbook); return true;

@@ -4,7 +4,9 @@
 #include <commctrl.h>
 #include <shellapi.h>
 
+#include <algorithm>
 #include <string>
+#include <vector>
 
 #include "message_routing.h"
 #include "workbook.h"
@@ -12,14 +14,14 @@
 
 namespace {
 
-// The first argument, a CSV file to open; empty without one.
-std::wstring FileOnCommandLine() {
+// The arguments: CSV files to open.
+std::vector<std::wstring> FilesOnCommandLine() {
     int count = 0;
     LPWSTR* arguments = CommandLineToArgvW(GetCommandLineW(), &count);
     if (!arguments) return {};
-    std::wstring file = count > 1 ? arguments[1] : L"";
+    const std::vector<std::wstring> files(arguments + 1, arguments + std::max(count, 1));
     LocalFree(arguments);
-    return file;
+    return files;
 }
 
 // The loop. Before it waits, the window catches up with what the grid does without telling.
@@ -42,7 +44,7 @@ int WINAPI WinMain(HINSTANCE instance, HINSTANCE, LPSTR, int show) {
 
     workbook::Workbook workbook;
     workbook.instance = instance;
-    if (!workbook::CreateWorkbookWindow(workbook, FileOnCommandLine(), show)) {
+    if (!workbook::CreateWorkbookWindow(workbook, FilesOnCommandLine(), show)) {
         MessageBoxW(nullptr, L"The window could not be created.", L"Workbook", MB_ICONERROR);
         return 1;
     }

@@ -23,12 +23,24 @@ bool IsAccelerator(const Workbook& workbook, HACCEL keys, const MSG& message) {
     return TranslateAcceleratorW(workbook.window, keys, &copy) != 0;
 }
 
+// The wheel turns what is under the pointer: the panel's lists, otherwise the sheet. An open combo
+// box keeps it.
+HWND WheelTarget(const Workbook& workbook, const MSG& message) {
+    const POINT place = {static_cast<short>(LOWORD(message.lParam)),
+                         static_cast<short>(HIWORD(message.lParam))};
+    const HWND window = WindowFromPoint(place);
+    if (IsInSidePanel(workbook, window)) return window;
+    if (IsChild(workbook.chart.bar.window, message.hwnd)) return message.hwnd;
+    return workbook.window;
+}
+
 }  // namespace
 
 bool HandleBeforeDispatch(Workbook& workbook, const MSG& message) {
     switch (message.message) {
     case WM_MOUSEWHEEL:
-        SendMessageW(workbook.window, message.message, message.wParam, message.lParam);
+        SendMessageW(WheelTarget(workbook, message), message.message, message.wParam,
+                     message.lParam);
         return true;
     case WM_LBUTTONDOWN:
         // The headers leave the focus where it is, and change the current cell a moment later: what
@@ -44,6 +56,8 @@ bool HandleBeforeDispatch(Workbook& workbook, const MSG& message) {
         if (IsAccelerator(workbook, workbook.keysAlways, message)) return true;
         // Undo, copy and the like mean the typed text while it is being typed.
         if (message.hwnd == GetHandleToEquationControl()) return SelectAllTyping(message);
+        // Tree and list have keys of their own.
+        if (IsInSidePanel(workbook, message.hwnd)) return false;
         return IsAccelerator(workbook, workbook.keysInGrid, message);
     default: return false;
     }

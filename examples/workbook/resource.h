@@ -12,6 +12,18 @@
 /* Child windows of the chart pane. */
 #define IDC_CHART 104
 #define IDC_LIVE_CHART 105
+#define IDC_LIVE_PANE 106
+
+/* The chart's bar, a child of the main window, and its combo boxes. */
+#define IDC_CHART_BAR 107
+#define IDC_ZOOM_COMBO 108
+#define IDC_TYPE_COMBO 109
+
+/* The bar of sheets, and the side panel with its children. */
+#define IDC_SHEET_BAR 110
+#define IDC_SIDE_PANEL 111
+#define IDC_FILE_TREE 112
+#define IDC_STATISTICS 113
 
 /* Resources. */
 #define IDR_MENU 200
@@ -34,6 +46,8 @@
 #define IDM_FILE_SAVE 1003
 #define IDM_FILE_SAVE_AS 1004
 #define IDM_FILE_EXIT 1005
+#define IDM_FILE_CLOSE 1006
+#define IDM_FILE_PRINT 1007
 
 /* Edit. */
 #define IDM_EDIT_UNDO 1101
@@ -60,6 +74,16 @@
 #define IDM_VIEW_VERTICAL_SCROLL_BAR 1214
 #define IDM_VIEW_TITLE_ROW 1215
 #define IDM_VIEW_FIT_SIZES 1216
+#define IDM_VIEW_NEXT_SHEET 1217
+#define IDM_VIEW_PREVIOUS_SHEET 1218
+
+#define IDM_VIEW_SIDE_PANEL 1219
+#define IDM_VIEW_NEXT_PANE 1220 /* keys only */
+
+/* The menu over the list of columns. */
+#define IDM_COLUMN_GO 1251
+#define IDM_COLUMN_REMOVE 1252
+#define IDM_COLUMN_SHOW_ALL 1253
 
 /* Help. */
 #define IDM_HELP_KEYS 1301
@@ -82,6 +106,8 @@
 #define IDM_CHART_PIE 1615
 #define IDM_CHART_LEGEND 1621
 #define IDM_CHART_TITLES 1622
+#define IDM_CHART_PROPERTIES 1623
+#define IDM_CHART_COPY 1624
 #define IDM_CHART_ZOOM_25 1631
 #define IDM_CHART_ZOOM_50 1632
 #define IDM_CHART_ZOOM_100 1633

@@ -30,11 +30,12 @@ CellAddress OriginFor(CellAddress cell, const GridVisibleRange& range) {
     if (cell.column < range.firstColumn) origin.column = cell.column;
     if (cell.row < range.firstRow) origin.row = cell.row;
     if (cell.column >= range.endColumn) {
-        origin.column =
-            OriginBefore(cell.column, range.endColumn - range.firstColumn, kColumnCount);
+        const int count = static_cast<int>(GetNumberOfVisibleColumns());
+        origin.column = OriginBefore(cell.column, count, kColumnCount);
     }
     if (cell.row >= range.endRow) {
-        origin.row = OriginBefore(cell.row, range.endRow - range.firstRow, kRowCount);
+        const int count = static_cast<int>(GetNumberOfVisibleRows());
+        origin.row = OriginBefore(cell.row, count, kRowCount);
     }
     return origin;
 }
@@ -78,8 +79,14 @@ Block SelectedBlock() {
 }
 
 CellAddress CurrentCell() {
-    const Block block = SelectedBlock();
-    return {block.left, block.top};
+    GridCellPair cell = {};
+    GetCurrentSelectedCell(&cell);
+    return {std::min<int>(cell.column, kColumnCount - 1), std::min<int>(cell.row, kRowCount - 1)};
+}
+
+CellAddress FirstVisibleCell() {
+    const GridVisibleRange range = VisibleRange();
+    return {range.firstColumn, range.firstRow};
 }
 
 void Select(Workbook& workbook, const Block& block) {
@@ -91,6 +98,12 @@ void Select(Workbook& workbook, const Block& block) {
 void GoTo(Workbook& workbook, const Block& block) {
     Select(workbook, block);
     MakeVisible(workbook, {block.left, block.top});
+}
+
+void GoToColumn(Workbook& workbook, int column) {
+    CommitTyping(workbook);
+    Select(workbook, {column, 0, column, kRowCount - 1});
+    MakeVisible(workbook, {column, FirstVisibleCell().row});
 }
 
 void MakeVisible(Workbook& workbook, CellAddress cell) {

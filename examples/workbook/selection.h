@@ -11,8 +11,14 @@ struct Workbook;
 Block SelectedBlock();
 CellAddress CurrentCell();
 
+// The cell at the view's top left.
+CellAddress FirstVisibleCell();
+
 // Selects a block, scrolls to its first cell and shows that cell in the equation bar.
 void GoTo(Workbook& workbook, const Block& block);
+
+// Selects a whole column and brings it into view; the rows in view stay.
+void GoToColumn(Workbook& workbook, int column);
 
 // Selects without scrolling.
 void Select(Workbook& workbook, const Block& block);

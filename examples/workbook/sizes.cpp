@@ -19,7 +19,7 @@ constexpr int kMostLines = 8;
 // What the cell needs to show. Results that would fill a column with decimals are content with what
 // a column of default width shows of them.
 std::wstring NeededText(const Workbook& workbook, CellAddress cell) {
-    const Sheet& sheet = workbook.document.sheet();
+    const Sheet& sheet = workbook.sheet();
     const ValueView value = sheet.view(cell);
     if (value.kind == ValueKind::Number && sheet.isFormula(cell)) {
         return FitNumber(value.number,
@@ -31,7 +31,7 @@ std::wstring NeededText(const Workbook& workbook, CellAddress cell) {
 }
 
 int WidthOf(const Workbook& workbook, CellAddress cell) {
-    const bool isTitle = workbook.view.titleRow && cell.row == 0;
+    const bool isTitle = workbook.sheetView().titleRow && cell.row == 0;
     const HFONT font = isTitle ? workbook.styles.bold : workbook.styles.normal;
     return workbook.measure.width(font, NeededText(workbook, cell)) + kTextMargins;
 }
@@ -50,18 +50,31 @@ GridVisibleRange VisibleRange() {
     return range;
 }
 
-void SetWidth(Workbook& workbook, int column, int units) {
+void ApplyWidth(const Workbook& workbook, int column, int units) {
     SetColumnWidth(column - VisibleRange().firstColumn, PixelsOf(workbook, units));
-    workbook.widths.set(column, units);
+}
+
+void ApplyHeight(const Workbook& workbook, int row, int units) {
+    SetRowHeight(row - VisibleRange().firstRow, PixelsOf(workbook, units));
+}
+
+void SetWidth(Workbook& workbook, int column, int units) {
+    ApplyWidth(workbook, column, units);
+    workbook.sheetView().widths.set(column, units);
+}
+
+void SetHeight(Workbook& workbook, int row, int units) {
+    ApplyHeight(workbook, row, units);
+    workbook.sheetView().heights[row] = units;
 }
 
 void FitColumn(Workbook& workbook, int column) {
     int units = kDefaultColumnWidth;
     for (const CellAddress cell :
-         workbook.document.sheet().occupiedIn({column, 0, column, kJudgedRows - 1})) {
+         workbook.sheet().occupiedIn({column, 0, column, kJudgedRows - 1})) {
         units = std::max(units, std::min(WidthOf(workbook, cell), kWidestColumn));
     }
-    if (units != workbook.widths.of(column)) SetWidth(workbook, column, units);
+    if (units != workbook.sheetView().widths.of(column)) SetWidth(workbook, column, units);
 }
 
 int LinesIn(const Sheet& sheet, int row) {
@@ -78,14 +91,23 @@ int LinesIn(const Sheet& sheet, int row) {
 }  // namespace
 
 void FitSizes(Workbook& workbook) {
-    const Sheet& sheet = workbook.document.sheet();
+    const Sheet& sheet = workbook.sheet();
     const SheetExtent extent = sheet.extent();
     for (int column = 0; column < extent.columns; ++column) FitColumn(workbook, column);
     for (int row = 0; row < std::min(extent.rows, kJudgedRows); ++row) {
         const int lines = LinesIn(sheet, row);
         if (lines == 1) continue;
-        SetRowHeight(row - VisibleRange().firstRow, PixelsOf(workbook, lines * kLineHeight + 1));
+        SetHeight(workbook, row, lines * kLineHeight + 1);
     }
+}
+
+void ApplySizes(const Workbook& workbook) {
+    const SheetView& view = workbook.sheetView();
+    for (int column = 0; column < kColumnCount; ++column) {
+        const int units = view.widths.of(column);
+        if (units != kDefaultColumnWidth) ApplyWidth(workbook, column, units);
+    }
+    for (const auto& [row, units] : view.heights) ApplyHeight(workbook, row, units);
 }
 
 }  // namespace workbook

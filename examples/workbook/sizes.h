@@ -10,4 +10,7 @@ struct Workbook;
 // default. Repaints nothing.
 void FitSizes(Workbook& workbook);
 
+// Gives a grid that was reset the sizes of the current sheet. Repaints nothing.
+void ApplySizes(const Workbook& workbook);
+
 }  // namespace workbook

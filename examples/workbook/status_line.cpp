@@ -33,7 +33,7 @@ std::wstring Figures(const Sheet& sheet, const Block& block) {
 }
 
 std::wstring SelectionText(const Workbook& workbook, const Block& block) {
-    const Sheet& sheet = workbook.document.sheet();
+    const Sheet& sheet = workbook.sheet();
     const CellAddress current = {block.left, block.top};
     const std::wstring address = FormatBlock(block);
     if (!workbook.shown.notice.empty()) return address + kGap + workbook.shown.notice;

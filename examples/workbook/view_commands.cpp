@@ -3,13 +3,9 @@
 #include <algorithm>
 #include <iterator>
 
-#include "chart_view.h"
 #include "equation_bar.h"
-#include "model/survey.h"
-#include "selection.h"
 #include "sizes.h"
 #include "workbook.h"
-#include "workbook_window.h"
 
 namespace workbook {
 
@@ -47,7 +43,7 @@ int StepsPerNotch() {
 }  // namespace
 
 void UpdateScrollRanges(const Workbook& workbook) {
-    const SheetExtent extent = workbook.document.sheet().extent();
+    const SheetExtent extent = workbook.sheet().extent();
     SetHorizontalDataRange(
         std::clamp(extent.columns + kSpareColumns, kFewestColumns, kColumnCount));
     SetVerticalDataRange(std::clamp(extent.rows + kSpareRows, kFewestRows, kRowCount));
@@ -84,7 +80,7 @@ void ToggleVerticalBar(Workbook& workbook) {
 }
 
 void ToggleTitleRow(Workbook& workbook) {
-    workbook.view.titleRow = !workbook.view.titleRow;
+    workbook.sheetView().titleRow = !workbook.sheetView().titleRow;
     KorGrid_Redraw(workbook.grid);
 }
 
@@ -106,19 +102,6 @@ void OnMouseWheel(Workbook& workbook, WORD keys, int distance) {
         const UINT message = keys & MK_SHIFT ? WM_HSCROLL : WM_VSCROLL;
         ScrollBy(workbook, message, -notches * StepsPerNotch());
     }
-}
-
-void ShowDocumentFromStart(Workbook& workbook) {
-    ResetGrid();
-    workbook.widths.reset();
-    workbook.view.titleRow = FirstRowIsHeader(workbook.document.sheet());
-    FitSizes(workbook);
-    SetFirstVisibleCell(KORGRID_CELL(0, 0));
-    UpdateScrollRanges(workbook);
-    Select(workbook, BlockOf({0, 0}));
-    workbook.shown.notice.clear();
-    ShowTitle(workbook);
-    ChartNewDocument(workbook);
 }
 
 }  // namespace workbook

@@ -23,7 +23,4 @@ void FitSizesAndRedraw(Workbook& workbook);
 // The mouse wheel: rows; columns with Shift; zoom with Ctrl.
 void OnMouseWheel(Workbook& workbook, WORD keys, int distance);
 
-// Shows the document from its beginning, with sizes of its own.
-void ShowDocumentFromStart(Workbook& workbook);
-
 }  // namespace workbook

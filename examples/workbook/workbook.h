@@ -1,4 +1,4 @@
-// All that the program knows: its windows, the document, and how it is shown.
+// All that the program knows: its windows, the open sheets, and how they are shown.
 #pragma once
 
 #include <windows.h>
@@ -9,8 +9,8 @@
 
 #include "cell_styles.h"
 #include "chart.h"
-#include "column_widths.h"
-#include "model/document.h"
+#include "open_sheets.h"
+#include "side_panel.h"
 #include "text_measure.h"
 
 namespace workbook {
@@ -24,7 +24,6 @@ struct ViewOptions {
     bool gridLines = true;
     bool horizontalScrollBar = true;
     bool verticalScrollBar = true;
-    bool titleRow = false;  // row 1 in bold on a tinted background
     DWORD zoom = kFullZoom;
 };
 
@@ -49,19 +48,28 @@ struct Workbook {
     HWND window = nullptr;
     HWND grid = nullptr;
     HWND statusBar = nullptr;
+    HWND sheetBar = nullptr;
     HACCEL keysAlways = nullptr;
     HACCEL keysInGrid = nullptr;
 
-    Document document;
+    OpenSheets sheets;
     CellStyles styles;
     TextMeasure measure;
-    ColumnWidths widths;
     ViewOptions view;
     ShownState shown;
     PressState press;
     Chart chart;
-    int wheelDistance = 0;       // turned, but less than a notch so far
-    bool isOutOfMemory = false;  // to be told when no message is being handled
+    SidePanel panel;
+    HIMAGELIST sheetImages = nullptr;  // of bar and tree
+    int wheelDistance = 0;             // turned, but less than a notch so far
+    bool isOutOfMemory = false;        // to be told when no message is being handled
+
+    // Of the current sheet.
+    Document& document() { return sheets.current().document; }
+    const Document& document() const { return sheets.current().document; }
+    const Sheet& sheet() const { return document().sheet(); }
+    SheetView& sheetView() { return sheets.current().view; }
+    const SheetView& sheetView() const { return sheets.current().view; }
 };
 
 }  // namespace workbook

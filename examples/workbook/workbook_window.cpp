@@ -5,13 +5,17 @@
 #include <algorithm>
 #include <new>
 
+#include "chart_bar.h"
 #include "chart_pane.h"
 #include "chart_view.h"
 #include "commands.h"
 #include "equation_bar.h"
 #include "file_commands.h"
 #include "grid_host.h"
+#include "header_pointer.h"
 #include "resource.h"
+#include "sheet_bar.h"
+#include "sheet_switch.h"
 #include "status_line.h"
 #include "view_commands.h"
 #include "workbook.h"
@@ -25,6 +29,8 @@ constexpr int kFirstWidth = 960;
 constexpr int kFirstHeight = 680;
 constexpr int kLeastWidth = 320;
 constexpr int kLeastHeight = 240;
+constexpr int kSheetBarWidth = 250;
+constexpr int kSheetBarHeight = 18;  // of one line of its text, which it draws at the top
 constexpr DWORD kGridStyle = WS_CHILD | WS_VISIBLE | WS_CLIPCHILDREN | WS_HSCROLL | WS_VSCROLL;
 
 // ---- Birth and death ----
@@ -37,7 +43,10 @@ bool OnCreate(Workbook& workbook, HWND window) {
     workbook.grid =
         CreateWindowExW(0, KORGRID_CLASS, nullptr, kGridStyle, 0, 0, 0, 0, window,
                         reinterpret_cast<HMENU>(INT_PTR{IDC_GRID}), workbook.instance, nullptr);
-    if (!workbook.grid || !workbook.statusBar || !CreateChartPane(workbook)) return false;
+    if (!workbook.grid || !workbook.statusBar || !CreateChartPane(workbook) ||
+        !CreateChartBar(workbook) || !CreateSheetBar(workbook) || !CreateSidePanel(workbook)) {
+        return false;
+    }
     PrepareEquationBar(workbook);
     SetFunctionButtonMessageID(IDM_FUNCTIONS);
     DragAcceptFiles(window, TRUE);
@@ -45,6 +54,8 @@ bool OnCreate(Workbook& workbook, HWND window) {
 }
 
 void OnDestroy(Workbook& workbook) {
+    DestroySidePanel(workbook);
+    DestroySheetBar(workbook);
     workbook.measure.close();
     DeleteCellStyles(workbook.styles);
     workbook.grid = nullptr;
@@ -69,15 +80,20 @@ void OnSetFocus(const Workbook& workbook) {
 // window's border, would stay.
 //   result  whether the cursor is set
 bool OnSetCursor(const Workbook& workbook, HWND window, UINT place) {
-    const bool isGrid = window == workbook.grid || IsGridHeader(workbook, window);
-    if (!isGrid || place != HTCLIENT) return false;
-    SetCursor(LoadCursorW(nullptr, IDC_ARROW));
+    const bool isHeader = IsGridHeader(workbook, window);
+    if ((!isHeader && window != workbook.grid) || place != HTCLIENT) return false;
+    SetCursor(LoadCursorW(nullptr, isHeader ? HeaderPointer(window) : IDC_ARROW));
     return true;
 }
 
 void OnGetMinMaxInfo(MINMAXINFO& info) { info.ptMinTrackSize = {kLeastWidth, kLeastHeight}; }
 
 // ---- Dispatch ----
+
+void OnSheetBarNotify(Workbook& workbook, LPARAM lParam) {
+    const auto& chosen = *reinterpret_cast<const FunkyBarNotification*>(lParam);
+    if (chosen.header.code == FBN_SELECTED) OnSheetChosen(workbook, chosen);
+}
 
 LRESULT Dispatch(Workbook& workbook, UINT message, WPARAM wParam, LPARAM lParam) {
     const HWND window = workbook.window;
@@ -86,6 +102,7 @@ LRESULT Dispatch(Workbook& workbook, UINT message, WPARAM wParam, LPARAM lParam)
     case WM_SETFOCUS: OnSetFocus(workbook); return 0;
     case WM_NOTIFY:
         if (OnGridNotify(workbook, static_cast<UINT>(wParam), lParam)) return 0;
+        if (wParam == IDC_SHEET_BAR) OnSheetBarNotify(workbook, lParam);
         break;
     case GRIDN_EQUATIONENTERED:
         OnEquationEntered(workbook, reinterpret_cast<const wchar_t*>(wParam), lParam);
@@ -97,16 +114,20 @@ LRESULT Dispatch(Workbook& workbook, UINT message, WPARAM wParam, LPARAM lParam)
     case WM_SETCURSOR:
         if (OnSetCursor(workbook, reinterpret_cast<HWND>(wParam), LOWORD(lParam))) return TRUE;
         break;
-    case WM_COMMAND: RunCommand(workbook, LOWORD(wParam)); return 0;
+    case WM_COMMAND:
+        if (!OnChartBarCommand(workbook, LOWORD(wParam), HIWORD(wParam))) {
+            RunCommand(workbook, LOWORD(wParam));
+        }
+        return 0;
     case WM_INITMENUPOPUP: PrepareMenu(workbook, reinterpret_cast<HMENU>(wParam)); return 0;
     case WM_MOUSEWHEEL:
         OnMouseWheel(workbook, LOWORD(wParam), static_cast<short>(HIWORD(wParam)));
         return 0;
     case WM_DROPFILES: OnDropFiles(workbook, reinterpret_cast<HDROP>(wParam)); return 0;
     case WM_CLOSE:
-        if (MayDiscard(workbook)) DestroyWindow(window);
+        if (MayEnd(workbook)) DestroyWindow(window);
         return 0;
-    case WM_QUERYENDSESSION: return MayDiscard(workbook);
+    case WM_QUERYENDSESSION: return MayEnd(workbook);
     case WM_DESTROY: OnDestroy(workbook); return 0;
     default: break;
     }
@@ -147,7 +168,7 @@ bool RegisterWorkbookClass(HINSTANCE instance) {
 
 }  // namespace
 
-bool CreateWorkbookWindow(Workbook& workbook, const std::wstring& file, int show) {
+bool CreateWorkbookWindow(Workbook& workbook, const std::vector<std::wstring>& files, int show) {
     if (!RegisterGridControl(workbook.instance) || !RegisterWorkbookClass(workbook.instance)) {
         return false;
     }
@@ -158,11 +179,11 @@ bool CreateWorkbookWindow(Workbook& workbook, const std::wstring& file, int show
                          workbook.instance, &workbook)) {
         return false;
     }
-    ShowDocumentFromStart(workbook);
+    ShowSheet(workbook);
     UpdateStatusBar(workbook);
     ShowWindow(workbook.window, show);
     UpdateWindow(workbook.window);
-    if (!file.empty()) OpenFile(workbook, file);
+    for (const std::wstring& file : files) OpenFile(workbook, file);
     return true;
 }
 
@@ -170,14 +191,22 @@ void LayOutWindow(const Workbook& workbook) {
     RECT area = {};
     GetClientRect(workbook.window, &area);
     const int width = static_cast<int>(area.right);
-    const int height = std::max(0, static_cast<int>(area.bottom) - LayoutStatusBar(workbook));
-    const int gridWidth = width - ChartPaneWidth(workbook, width);
-    MoveWindow(workbook.grid, 0, 0, gridWidth, height, TRUE);
-    MoveWindow(workbook.chart.pane, gridWidth, 0, width - gridWidth, height, TRUE);
+    const int top = ChartBarHeight(workbook);
+    const int bottom = static_cast<int>(area.bottom) - LayoutStatusBar(workbook);
+    const int height = std::max(0, bottom - top);
+    const int gridLeft = SidePanelWidth(workbook, width);
+    const int gridRight = width - ChartPaneWidth(workbook, width);
+    MoveWindow(workbook.sheetBar, 0, (top - kSheetBarHeight) / 2, kSheetBarWidth, kSheetBarHeight,
+               TRUE);
+    MoveWindow(workbook.chart.bar.window, kSheetBarWidth, 0, width - kSheetBarWidth, top, TRUE);
+    MoveWindow(workbook.panel.window, 0, top, gridLeft, height, TRUE);
+    MoveWindow(workbook.grid, gridLeft, top, gridRight - gridLeft, height, TRUE);
+    MoveWindow(workbook.chart.pane, gridRight, top, width - gridRight, height, TRUE);
 }
 
-void ShowTitle(const Workbook& workbook) {
-    const Document& document = workbook.document;
+void ShowTitle(Workbook& workbook) {
+    workbook.panel.isStale = true;
+    const Document& document = workbook.document();
     const std::wstring title = document.name() + L" - Workbook";
     SetWindowTextW(workbook.window, ((document.isModified() ? L"*" : L"") + title).c_str());
 }
@@ -188,6 +217,9 @@ void OnIdle(Workbook& workbook) noexcept {
         CatchUpWithGrid(workbook);
         RefreshChart(workbook);
         KeepTooltipsInPane(workbook);
+        RefreshChartBar(workbook);
+        RefreshSheetBar(workbook);
+        RefreshSidePanel(workbook);
     } catch (const std::bad_alloc&) {
         workbook.isOutOfMemory = true;
     }

@@ -5,20 +5,21 @@
 #include <windows.h>
 
 #include <string>
+#include <vector>
 
 namespace workbook {
 
 struct Workbook;
 
-// Creates and shows the window and opens a file, if one is named. `workbook` must outlive the
+// Creates and shows the window and opens the files, each as a sheet. `workbook` must outlive the
 // window.
 //   result  whether the window exists
-bool CreateWorkbookWindow(Workbook& workbook, const std::wstring& file, int show);
+bool CreateWorkbookWindow(Workbook& workbook, const std::vector<std::wstring>& files, int show);
 
 // "*sunspots.csv - Workbook"; the star means unsaved changes.
-void ShowTitle(const Workbook& workbook);
+void ShowTitle(Workbook& workbook);
 
-// Gives grid, chart and status bar their places.
+// Gives bars, panes and the grid their places.
 void LayOutWindow(const Workbook& workbook);
 
 // To be called when no message is waiting.

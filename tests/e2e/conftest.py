@@ -8,6 +8,7 @@ import shutil
 
 import pytest
 
+from clipboard import Clipboard
 from desktop import ROOT, Desktop
 from probe import Probe
 from workbook_app import Workbook, windows_path
@@ -51,6 +52,11 @@ def probe(desktop, programs):
     started = Probe(desktop, programs / "window_probe.exe")
     yield started
     started.close()
+
+
+@pytest.fixture
+def clipboard(desktop, programs):
+    return Clipboard(desktop, programs / "window_probe.exe")
 
 
 @pytest.fixture

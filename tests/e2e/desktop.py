@@ -13,6 +13,7 @@ from picture import Picture
 ROOT = pathlib.Path(__file__).resolve().parents[2]
 WINE_RUN = ROOT / "scripts" / "wine-run"
 WIDTH, HEIGHT = 1024, 768
+OUT_OF_THE_WAY = WIDTH - 1, HEIGHT - 1
 DOUBLE_CLICK_SECONDS = 0.6
 
 
@@ -133,6 +134,9 @@ class Desktop:
         self._xdotool("mousemove", x, y, "click", 1)
         self._last_click = (x, y), time.monotonic()
 
+    def right_click(self, x, y):
+        self._xdotool("mousemove", x, y, "click", 3)
+
     def drag(self, *points, release=True):
         """Presses at the first point and moves to the others; each is an (x, y) pair."""
         (x, y), *rest = points
@@ -158,7 +162,7 @@ class Desktop:
         self._xdotool("key", "--delay", 5, *names)
 
     def type(self, text):
-        self._xdotool("type", "--delay", 5, text)
+        self._xdotool("type", "--delay", 5, "--", text)
 
     # ---- Eyes ----
 

@@ -18,6 +18,8 @@ class Window:
         self.parts = description.get("parts")
         self.sizes = description.get("sizes")
         self.first_label = description.get("firstLabel")
+        self.rows = description.get("rows")
+        self.items = description.get("items")
         self.children = [Window(child) for child in description["children"]]
 
     def all(self):

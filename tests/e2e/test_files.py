@@ -95,7 +95,7 @@ def test_a_malformed_file_is_refused_with_its_line(open_workbook, stations, malf
     assert workbook.settle().crop(workbook.view().grid.rect).difference(before) is None
 
 
-def test_another_file_is_opened_in_place_of_the_first(open_workbook, stations, sunspots):
+def test_another_file_is_opened_as_another_sheet(open_workbook, stations, sunspots):
     workbook = open_workbook(sunspots)
     workbook.click_cell("A30")
     open_with_dialog(workbook, stations)
@@ -103,6 +103,10 @@ def test_another_file_is_opened_in_place_of_the_first(open_workbook, stations, s
     view = workbook.view()
     assert (view.first_column, view.first_row) == (0, 0)
     assert view.equation.text == "Station"
+
+    workbook.desktop.key("ctrl+Prior")
+    expect(title(workbook), "sunspots.csv - Workbook")
+    expect(lambda: workbook.view().status.split()[0], "A30")
 
 
 def test_a_file_that_is_not_there_is_told_at_start(open_workbook, tmp_path):

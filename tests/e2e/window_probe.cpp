@@ -1,7 +1,9 @@
 // Prints what a person would see of the running programs' windows, as JSON: one line per question.
 //
-//   window_probe          answers once
-//   window_probe --serve  answers each line of standard input, until its end
+//   window_probe              answers once
+//   window_probe --serve      answers each line of standard input, until its end
+//   window_probe --clipboard  prints what is on the clipboard: its text, and a picture's size
+//   window_probe --put        puts standard input, UTF-8, on the clipboard
 //
 // An answer is the list of visible top-level windows, each with its visible children. Rectangles
 // are [left, top, right, bottom] in screen pixels, right and bottom exclusive.
@@ -9,8 +11,12 @@
 
 #include <commctrl.h>
 
+#include <fcntl.h>
+#include <io.h>
+
 #include <cstring>
 #include <iostream>
+#include <iterator>
 #include <string>
 #include <vector>
 
@@ -82,6 +88,10 @@ public:
     }
     template <typename Value> Value read() const { return read<Value>(page_); }
 
+    template <typename Value> void write(const Value& value) const {
+        WriteProcessMemory(process_, page_, &value, sizeof value, nullptr);
+    }
+
 private:
     HANDLE process_ = nullptr;
     void* page_ = nullptr;
@@ -134,6 +144,79 @@ std::string StatusParts(HWND bar) {
     return List(parts);
 }
 
+// ---- Lists and trees ----
+
+// Room for a text beside the structure that a message fills.
+constexpr LPARAM kTextOffset = 1024;
+
+template <typename Item> Item ItemWithRoom(const RemotePage& page) {
+    Item item = {};
+    item.pszText = reinterpret_cast<wchar_t*>(page.address() + kTextOffset);
+    item.cchTextMax = 512;
+    return item;
+}
+
+std::string ListText(HWND list, const RemotePage& page, int row, int column) {
+    auto item = ItemWithRoom<LVITEMW>(page);
+    item.iSubItem = column;
+    page.write(item);
+    SendMessageW(list, LVM_GETITEMTEXTW, static_cast<WPARAM>(row), page.address());
+    return Quoted(page.read<ShortText>(item.pszText).string());
+}
+
+RECT RemoteRectangle(HWND window, const RemotePage& page) {
+    RECT place = page.read<RECT>();
+    MapWindowPoints(window, nullptr, reinterpret_cast<POINT*>(&place), 2);
+    return place;
+}
+
+// Each row: its texts, its rectangle, whether it is selected.
+std::string ListRows(HWND list) {
+    const RemotePage page(list);
+    const auto header = reinterpret_cast<HWND>(SendMessageW(list, LVM_GETHEADER, 0, 0));
+    const int columns = static_cast<int>(SendMessageW(header, HDM_GETITEMCOUNT, 0, 0));
+    const int count = static_cast<int>(SendMessageW(list, LVM_GETITEMCOUNT, 0, 0));
+    std::vector<std::string> rows;
+    for (int row = 0; row < count; ++row) {
+        std::vector<std::string> texts;
+        for (int column = 0; column < columns; ++column) {
+            texts.push_back(ListText(list, page, row, column));
+        }
+        page.write(RECT{LVIR_LABEL, 0, 0, 0});
+        SendMessageW(list, LVM_GETITEMRECT, static_cast<WPARAM>(row), page.address());
+        const bool selected = SendMessageW(list, LVM_GETITEMSTATE, static_cast<WPARAM>(row),
+                                           LVIS_SELECTED) != 0;
+        rows.push_back("{\"texts\": " + List(texts) +
+                       ", \"rect\": " + Rectangle(RemoteRectangle(list, page)) +
+                       ", \"selected\": " + (selected ? "true" : "false") + "}");
+    }
+    return List(rows);
+}
+
+// The items that are not folded away, from the top.
+std::string TreeItems(HWND tree) {
+    const RemotePage page(tree);
+    std::vector<std::string> items;
+    LRESULT handle = SendMessageW(tree, TVM_GETNEXTITEM, TVGN_ROOT, 0);
+    for (; handle; handle = SendMessageW(tree, TVM_GETNEXTITEM, TVGN_NEXTVISIBLE, handle)) {
+        auto item = ItemWithRoom<TVITEMW>(page);
+        item.mask = TVIF_HANDLE | TVIF_TEXT;
+        item.hItem = reinterpret_cast<HTREEITEM>(handle);
+        page.write(item);
+        SendMessageW(tree, TVM_GETITEMW, 0, page.address());
+        const std::string text = Quoted(page.read<ShortText>(item.pszText).string());
+        page.write(item.hItem);  // in the rectangle's place, as the message wants it
+        const WPARAM ofTextOnly = TRUE;
+        const LRESULT shown = SendMessageW(tree, TVM_GETITEMRECT, ofTextOnly, page.address());
+        if (!shown) continue;
+        items.push_back("{\"text\": " + text +
+                        ", \"rect\": " + Rectangle(RemoteRectangle(tree, page)) + "}");
+    }
+    return List(items);
+}
+
+// ---- Headers ----
+
 std::string HeaderSizes(HWND header) {
     std::vector<std::string> sizes;
     const LRESULT count = SendMessageW(header, HCM_GETITEMCOUNT, 0, 0);
@@ -179,6 +262,8 @@ std::string Describe(HWND window) {
     if (windowClass == KORHEADER_CLASS) {
         extra = ", \"sizes\": " + HeaderSizes(window) + ", \"firstLabel\": " + FirstLabel(window);
     }
+    if (windowClass == WC_LISTVIEWW) extra = ", \"rows\": " + ListRows(window);
+    if (windowClass == WC_TREEVIEWW) extra = ", \"items\": " + TreeItems(window);
     return "{\"class\": " + Quoted(windowClass) +
            ", \"id\": " + std::to_string(GetDlgCtrlID(window)) +
            ", \"text\": " + Quoted(TextOf(window)) + ", \"rect\": " + Rectangle(outer) +
@@ -194,11 +279,61 @@ void Answer() {
     std::cout << List(windows) << std::endl;
 }
 
+// ---- The clipboard ----
+
+std::string ClipboardText() {
+    const HANDLE block = GetClipboardData(CF_UNICODETEXT);
+    if (!block) return "null";
+    const std::string text = Quoted(static_cast<const wchar_t*>(GlobalLock(block)));
+    GlobalUnlock(block);
+    return text;
+}
+
+std::string ClipboardPicture() {
+    const HANDLE block = GetClipboardData(CF_DIB);
+    if (!block) return "null";
+    const auto& header = *static_cast<const BITMAPINFOHEADER*>(GlobalLock(block));
+    const std::string size =
+        List({std::to_string(header.biWidth), std::to_string(header.biHeight)});
+    GlobalUnlock(block);
+    return size;
+}
+
+void PrintClipboard() {
+    if (!OpenClipboard(nullptr)) return;
+    std::cout << "{\"text\": " + ClipboardText() + ", \"picture\": " + ClipboardPicture() + "}"
+              << std::endl;
+    CloseClipboard();
+}
+
+void PutOnClipboard(const std::string& utf8) {
+    const int length = MultiByteToWideChar(CP_UTF8, 0, utf8.data(), static_cast<int>(utf8.size()),
+                                           nullptr, 0);
+    const HGLOBAL block =
+        GlobalAlloc(GMEM_MOVEABLE | GMEM_ZEROINIT, (static_cast<size_t>(length) + 1) * 2);
+    MultiByteToWideChar(CP_UTF8, 0, utf8.data(), static_cast<int>(utf8.size()),
+                        static_cast<wchar_t*>(GlobalLock(block)), length);
+    GlobalUnlock(block);
+    if (!OpenClipboard(nullptr)) return;
+    EmptyClipboard();
+    SetClipboardData(CF_UNICODETEXT, block);
+    CloseClipboard();
+}
+
+std::string ReadInput() {
+    _setmode(_fileno(stdin), _O_BINARY);
+    return {std::istreambuf_iterator<char>(std::cin), std::istreambuf_iterator<char>()};
+}
+
 } // namespace
 
 int main(int count, char** arguments) {
     if (count == 2 && std::strcmp(arguments[1], "--serve") == 0) {
         for (std::string line; std::getline(std::cin, line);) Answer();
+    } else if (count == 2 && std::strcmp(arguments[1], "--clipboard") == 0) {
+        PrintClipboard();
+    } else if (count == 2 && std::strcmp(arguments[1], "--put") == 0) {
+        PutOnClipboard(ReadInput());
     } else {
         Answer();
     }

@@ -5,7 +5,7 @@ import re
 import subprocess
 import time
 
-from desktop import HEIGHT, WIDTH, wait_until
+from desktop import OUT_OF_THE_WAY, wait_until
 
 GRID, HEADER, STATUS_BAR = "KV Grid Control", "korvane Header", "msctls_statusbar32"
 DIALOG, MENU = "#32770", "#32768"
@@ -155,7 +155,7 @@ class Workbook:
     def settle(self, seconds=5):
         """Moves the pointer out of the way, waits until nothing changes any more (two pictures a
         moment apart are the same), and returns the picture."""
-        self.desktop.move(WIDTH - 1, HEIGHT - 1)
+        self.desktop.move(*OUT_OF_THE_WAY)
         end = time.monotonic() + seconds
         before = self.desktop.picture()
         while time.monotonic() < end:

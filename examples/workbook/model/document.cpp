@@ -101,7 +101,10 @@ std::optional<FileProblem> Document::save(const std::wstring& path) noexcept {
     }
 }
 
-std::wstring Document::name() const { return path_.empty() ? L"Untitled" : FileNameOf(path_); }
+std::wstring Document::name() const {
+    if (!path_.empty()) return FileNameOf(path_);
+    return number_ == 1 ? L"Untitled" : L"Untitled " + std::to_wstring(number_);
+}
 
 EditResult Document::setCell(CellAddress cell, std::wstring text) noexcept {
     try {

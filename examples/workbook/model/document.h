@@ -26,6 +26,9 @@ std::wstring EditMessage(EditResult result);
 
 class Document {
 public:
+    // `number` tells unnamed documents apart: "Untitled", "Untitled 2", "Untitled 3"...
+    explicit Document(int number = 1) : number_(number) {}
+
     const Sheet& sheet() const { return sheet_; }
 
     // ---- File. Nothing is thrown; a problem leaves the document, and the file, as they were.
@@ -40,6 +43,7 @@ public:
 
     const std::wstring& path() const { return path_; }  // empty while unnamed
     std::wstring name() const;                          // without folders; "Untitled" while unnamed
+    int number() const { return number_; }
     const CsvFormat& format() const { return format_; }
 
     // Whether the sheet differs from the file. Undoing (or redoing) to the state that was saved
@@ -77,6 +81,7 @@ private:
     Sheet sheet_;
     CsvFormat format_;
     std::wstring path_;
+    int number_;
     EditHistory history_;
 };
 

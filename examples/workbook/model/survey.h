@@ -14,6 +14,8 @@ struct BlockStatistics {
     double average = 0;  // 0 without numbers
     double lowest = 0;
     double highest = 0;
+
+    friend bool operator==(const BlockStatistics&, const BlockStatistics&) = default;
 };
 
 // Errors and texts in the block are passed over. Walks occupied cells only.
