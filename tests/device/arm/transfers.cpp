@@ -84,7 +84,8 @@ uint32_t LoadExtended(Cpu& cpu, uint32_t address) {
 template <unsigned bits, unsigned kind>
 void TransferHalfword(Cpu& cpu, uint32_t instruction) {
     constexpr Mode mode = ModeOf(bits);
-    if (FieldD(instruction) == kPc || (!mode.isBefore && mode.writesBack)) {
+    const bool hasStrayBits = !mode.isByte && FieldS(instruction) != 0;
+    if (FieldD(instruction) == kPc || (!mode.isBefore && mode.writesBack) || hasStrayBits) {
         Refuse(cpu, kUnpredictable);
     }
     const uint32_t offset = mode.isByte ? (instruction >> 4 & 0xF0) | (instruction & 15)

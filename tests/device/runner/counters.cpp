@@ -5,7 +5,6 @@
 #include <windows.h>
 
 #include <algorithm>
-#include <cstdio>
 
 namespace device {
 namespace {
@@ -35,8 +34,8 @@ Stretch StretchAt(uint32_t address) {
 Counters& counters() { return *shared; }
 
 void PrepareCounters() {
-    wchar_t name[64];
-    swprintf(name, L"Local\\korcontrols-device-%lu", GetCurrentProcessId());
+    wchar_t name[kCountersNameCapacity] = L"";
+    CountersName(name);
     const HANDLE mapping = CreateFileMappingW(INVALID_HANDLE_VALUE, nullptr, PAGE_READWRITE, 0,
                                               sizeof(Counters), name);
     void* view = mapping ? MapViewOfFile(mapping, FILE_MAP_ALL_ACCESS, 0, 0, 0) : nullptr;

@@ -19,7 +19,6 @@ namespace {
 constexpr uint32_t kStackSize = 1024 * 1024;
 constexpr uint32_t kStackGuard = 64 * 1024;  // without access, below the stack
 constexpr uint32_t kStackHeadroom = 256;     // callees are given words beyond their arguments
-constexpr uint32_t kStackFill = 0xA5A5A5A5;
 constexpr uint32_t kExitsSize = 64 * 1024;
 constexpr uint32_t kPoison = 0xDEAD0000;       // plus the register's number
 constexpr uint32_t kKeptPattern = 0xCAFE0000;  // the same, in registers that a callee must keep
@@ -109,7 +108,7 @@ void PrepareGuestCalls() {
     auto* stack =
         room ? VirtualAlloc(room + kStackGuard, kStackSize, MEM_COMMIT, PAGE_READWRITE) : nullptr;
     if (!exits || !stack) Fail("no room for the guest's stack");
-    std::memset(stack, kStackFill & 0xFF, kStackSize);
+    std::memset(stack, kUnusedStack & 0xFF, kStackSize);
     cpu.writes.stackLow = reinterpret_cast<uint32_t>(stack);
     cpu.writes.stackSize = kStackSize;
     cpu.writes.pages = writablePages;

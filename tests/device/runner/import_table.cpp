@@ -35,6 +35,22 @@ const char* const kRuntimeOfWords[] = {
     "memcmp",       "memcpy",       "memmove", "memset", "realloc", "swprintf",
     "wcscat",       "wcschr",       "wcscmp",  "wcscpy", "wcslen",  "wcsncpy"};
 
+struct Destination {
+    const char* function;
+    int lengthArgument;
+};
+
+constexpr Destination kDestinations[] = {
+    {"_itow", kUnknownLength},
+    {"memcpy", 2},
+    {"memmove", 2},
+    {"memset", 2},
+    {"swprintf", kUnknownLength},
+    {"wcscat", kUnknownLength},
+    {"wcscpy", kUnknownLength},
+    {"wcsncpy", kUnknownLength},
+};
+
 constexpr ProcedurePlace kProcedures[] = {
     {"RegisterClassW", 0, offsetof(WNDCLASSW, lpfnWndProc), Procedure::Words4},
     {"SetWindowLongW", 2, kIsArgument, Procedure::Words4},
@@ -97,6 +113,15 @@ bool FindPassing(const std::string& guestName, const std::string& library, Passi
         return true;
     }
     return Contains(kRuntimeOfWords, guestName);
+}
+
+bool FindDestination(const std::string& guestName, int& lengthArgument) {
+    for (const Destination& entry : kDestinations) {
+        if (guestName != entry.function) continue;
+        lengthArgument = entry.lengthArgument;
+        return true;
+    }
+    return false;
 }
 
 bool TakesProcedures(const std::string& guestName) {

@@ -32,6 +32,12 @@ std::string DesktopName(const std::string& guestName);
 // How it is called. False for functions of the C runtime that nobody has looked at.
 bool FindPassing(const std::string& guestName, const std::string& library, Passing& passing);
 
+// What a function of the C runtime writes: from its first argument on, as many bytes as this
+// argument says. The functions of windows and drawing are not in this list; they know what they are
+// given.
+constexpr int kUnknownLength = -1;
+bool FindDestination(const std::string& guestName, int& lengthArgument);
+
 // Announces the procedures among a call's arguments.
 void AnnounceProcedures(const std::string& guestName, const uint32_t* words);
 bool TakesProcedures(const std::string& guestName);

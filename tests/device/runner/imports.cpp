@@ -1,5 +1,6 @@
 #include "runner/imports.h"
 
+#include "arm/operands.h"
 #include "runner/counters.h"
 #include "runner/failure.h"
 #include "runner/guest_calls.h"
@@ -13,8 +14,8 @@
 
 #include <algorithm>
 #include <cstring>
+#include <deque>
 #include <map>
-#include <vector>
 
 namespace device {
 namespace {
@@ -28,9 +29,11 @@ struct Binding {
     uint32_t function;  // the host's, where it is in no table
     OwnFunction own;    // with Passing::Own
     bool takesProcedures;
+    bool writes;         // from its first argument on
+    int lengthArgument;  // then; or kUnknownLength
 };
 
-std::vector<Binding> bindings;
+std::deque<Binding> bindings;              // references stay good while a call adds one
 std::map<std::string, int> neededImports;  // of own functions, by name
 
 // The desktop's libraries, by the names that its import libraries have for them.
@@ -58,7 +61,10 @@ Binding Bind(const GuestImport& import) {
                     kNoImport,
                     0,
                     FindOwnFunction(import.name),
-                    TakesProcedures(import.name)};
+                    TakesProcedures(import.name),
+                    false,
+                    kUnknownLength};
+    binding.writes = FindDestination(import.name, binding.lengthArgument);
     if (!FindPassing(import.name, library, binding.passing)) {
         Fail("%s!%s: no entry says how it is called", import.library.c_str(), import.name.c_str());
     }
@@ -80,6 +86,21 @@ struct Words {
     }
     uint32_t values[kHostWords];
 };
+
+// What the runtime writes for the guest must be the guest's: each page of it, or, where the length
+// is not known, the beginning.
+void CheckDestination(arm::Cpu& machine, const Binding& binding, const uint32_t* words) {
+    const uint32_t begin = words[0];
+    const uint32_t length =
+        binding.lengthArgument == kUnknownLength ? sizeof(wchar_t) : words[binding.lengthArgument];
+    if (!length) return;
+    if (begin + length < begin) arm::Refuse(machine, "a write around the end of memory", begin);
+    constexpr uint32_t kPage = 1u << arm::kPageBits;
+    for (uint32_t at = begin; at - begin < length; at = (at | (kPage - 1)) + 1) {
+        arm::CheckWrite(machine, at, 1);
+    }
+    arm::CheckWrite(machine, begin + length - 1, 1);
+}
 
 uint64_t BitsOf(double value) {
     uint64_t bits = 0;
@@ -104,9 +125,10 @@ void BindImports() {
 uint64_t CallImportedFunction(unsigned index, arm::Cpu& machine, bool& isWide) {
     if (index >= bindings.size()) Fail("a jump to an import that does not exist");
     ++counters().importCalls;
-    const Binding binding = bindings[index];
+    const Binding& binding = bindings[index];
     const Words words(machine);
     if (binding.takesProcedures) AnnounceProcedures(binding.name, words.values);
+    if (binding.writes) CheckDestination(machine, binding, words.values);
     const uint32_t target =
         binding.import == kNoImport ? binding.function : ImportTarget(binding.import);
     switch (binding.passing) {
@@ -118,10 +140,10 @@ uint64_t CallImportedFunction(unsigned index, arm::Cpu& machine, bool& isWide) {
     }
 }
 
-uint64_t CallDesktop(const std::string& name, std::initializer_list<uint32_t> words) {
+uint32_t CallDesktop(const std::string& name, std::initializer_list<uint32_t> words) {
     uint32_t arguments[kHostWords] = {};
     std::copy(words.begin(), words.end(), arguments);
-    return CallHost(ImportTarget(neededImports.at(name)), arguments);
+    return static_cast<uint32_t>(CallHost(ImportTarget(neededImports.at(name)), arguments));
 }
 
 uint32_t GuestAddressOf(uint32_t function) {
@@ -131,7 +153,7 @@ uint32_t GuestAddressOf(uint32_t function) {
             return ImportAddress(static_cast<unsigned>(i));
         }
     }
-    bindings.push_back({"", Passing::Words, kNoImport, function, nullptr, false});
+    bindings.push_back({"", Passing::Words, kNoImport, function, nullptr, false, false, 0});
     return ImportAddress(static_cast<unsigned>(bindings.size() - 1));
 }
 

@@ -19,7 +19,7 @@ uint64_t CallImportedFunction(unsigned index, arm::Cpu& cpu, bool& isWide);
 
 // Calls a function of the desktop through the table that tests see. Only those that an own function
 // has asked for.
-uint64_t CallDesktop(const std::string& name, std::initializer_list<uint32_t> words);
+uint32_t CallDesktop(const std::string& name, std::initializer_list<uint32_t> words);
 
 // An address at which the guest can call a function of the host, such as one found by name.
 uint32_t GuestAddressOf(uint32_t function);

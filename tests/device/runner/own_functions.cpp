@@ -44,20 +44,27 @@ uint64_t ProcAddress(uint32_t target, const uint32_t* words) {
     return GuestAddressOf(static_cast<uint32_t>(CallHost(target, arguments)));
 }
 
-// The clipboard takes blocks of the local heap; the desktop's takes movable ones of the global
-// heap.
-uint64_t SetClipboard(uint32_t target, const uint32_t* words) {
-    const auto size = static_cast<uint32_t>(CallDesktop("LocalSize", {words[1]}));
-    const auto copy = static_cast<uint32_t>(CallDesktop("GlobalAlloc", {GMEM_MOVEABLE, size}));
+// A movable block of the global heap with the bytes of a local one; 0 for none, or without memory.
+uint32_t MovableCopy(uint32_t block) {
+    if (!block) return 0;
+    const auto size = CallDesktop("LocalSize", {block});
+    const auto copy = CallDesktop("GlobalAlloc", {GMEM_MOVEABLE, size});
     if (!copy) return 0;
-    const auto bytes = static_cast<uint32_t>(CallDesktop("GlobalLock", {copy}));
-    if (bytes) std::memcpy(As<void*>(bytes), As<const void*>(words[1]), size);
+    const auto bytes = CallDesktop("GlobalLock", {copy});
+    if (bytes) std::memcpy(As<void*>(bytes), As<const void*>(block), size);
     CallDesktop("GlobalUnlock", {copy});
+    return copy;
+}
+
+// The clipboard takes blocks of the local heap; the desktop's takes movable ones of the global
+// heap. A block that is not taken stays the guest's.
+uint64_t SetClipboard(uint32_t target, const uint32_t* words) {
+    const uint32_t copy = MovableCopy(words[1]);
     uint32_t arguments[kHostWords] = {words[0], copy};
-    const uint64_t taken = CallHost(target, arguments);
-    if (taken) {
+    const auto taken = static_cast<uint32_t>(CallHost(target, arguments));
+    if (taken && copy) {
         CallDesktop("LocalFree", {words[1]});
-    } else {
+    } else if (copy) {
         CallDesktop("GlobalFree", {copy});
     }
     return taken;
