@@ -31,11 +31,12 @@ foreach(_tool AR RANLIB LINKER OBJDUMP NM DLLTOOL)
 endforeach()
 
 # The calling convention is Windows CE's: -mabi=apcs-gnu, 64-bit arguments in the next two words, a
-# stack aligned to words. Characters are signed, wide ones have 16 bits, enumerations have 32.
+# stack aligned to words. Characters are signed, wide ones have 16 bits, enumerations have 32. Stacks are
+# small there and grow page by page, so a function takes half a page at most.
 string(JOIN " " _machine
   -march=armv4 -marm -mno-thumb-interwork -mabi=apcs-gnu -mfloat-abi=soft
   -fshort-wchar -fsigned-char -fno-short-enums
-  -fno-unwind-tables -fno-asynchronous-unwind-tables -fno-stack-protector
+  -fno-unwind-tables -fno-asynchronous-unwind-tables -fno-stack-protector -Wframe-larger-than=2048
   "\"-B${KOR_WINCE}/bin\"" "\"-Wa,--coff-assembler=${KOR_DEVICE_TOOLS}/as\"")
 
 # Headers: the desktop's, with its calling-convention words empty, since here there is one convention.

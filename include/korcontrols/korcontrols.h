@@ -2,8 +2,11 @@
  *
  * This header names what belongs to no single control. Each control has a header of its own:
  *
- *   <korcontrols/grid.h>    the spreadsheet grid
- *   <korcontrols/header.h>  the header strip that the grid uses for its letters and numbers
+ *   <korcontrols/grid.h>         the spreadsheet grid
+ *   <korcontrols/header.h>       the header strip that the grid uses for its letters and numbers
+ *   <korcontrols/graph.h>        the chart, with <korcontrols/legend.h> and <korcontrols/tooltip.h>
+ *   <korcontrols/funkybar.h>     the function bar
+ *   <korcontrols/listhelpers.h>  helpers for list views and tree views
  *
  * All headers are plain C (C90 and later) and C++. All text is UTF-16. All functions use the C
  * calling convention and are called from the one thread that owns the controls' windows. */

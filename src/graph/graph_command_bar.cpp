@@ -41,11 +41,6 @@ void HandOverToolTips(HWND bar) {
     SetCommandBarToolTips(bar, kToolTipCount, toolTips);
 }
 
-void AddButtons(HWND bar, const TBBUTTON* buttons, int count) {
-    if (count <= 0) return;
-    SendMessageW(bar, TB_ADDBUTTONS, static_cast<WPARAM>(count), reinterpret_cast<LPARAM>(buttons));
-}
-
 // An item's data is its place.
 template <int count>
 void AddItems(HWND combo, const wchar_t* const (&texts)[count]) {
@@ -93,7 +88,7 @@ extern "C" DWORD KORCONTROLS_API SetupGraphCommandBar(HINSTANCE instance, HWND c
     if (!commandBar) return 0;
     const int added = buttons && buttonCount > 0 ? static_cast<int>(buttonCount) : 0;
     AddCommandBarBitmap(commandBar, moduleInstance, kButtonImages, kButtonImageCount);
-    AddButtons(commandBar, buttons, added);
+    if (added) AddCommandBarButtons(commandBar, buttons, added);
     HWND typeCombo = InsertTypeCombo(commandBar, instance, typeComboId, added);
     if (typeComboOut) *typeComboOut = typeCombo;
     // At the same position, so that it comes to stand before the chart types.

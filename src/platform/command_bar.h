@@ -4,10 +4,15 @@
 
 #include "platform/platform.h"
 
+#include <commctrl.h>
+
 namespace kor {
 
 // Adds the images of a bitmap resource, `imageCount` of them side by side, in the bar's own size.
 void AddCommandBarBitmap(HWND bar, HINSTANCE instance, int bitmapId, int imageCount);
+
+// Adds buttons behind those that there are.
+void AddCommandBarButtons(HWND bar, const TBBUTTON* buttons, int count);
 
 // Puts a combo box at a button position; what stands there moves to the right. The combo box is a
 // child of the bar and belongs to it. Null when it could not be made.

@@ -12,8 +12,8 @@ struct PrintDialogRecord {
     DWORD size;  // of this record
     HWND owner;
     HDC dc;             // out: the printer's, the caller's to delete
-    DWORD flags;        // 0 for the usual dialog
-    RECT leastMargins;  // paper and margins; the library leaves all that follows 0
+    DWORD flags;        // the library leaves this and all that follows 0, and
+    RECT leastMargins;  // the companion does not look at it
     RECT margins;
     HINSTANCE instance;
     LPARAM customData;

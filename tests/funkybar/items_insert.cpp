@@ -102,7 +102,8 @@ TEST_F(BarInsertion, KeepsTheTextInABlockOfItsOwnSize) {
     const auto blocks = spy.callsOf("LocalAlloc");
     ASSERT_EQ(blocks.size(), 2u);
     EXPECT_EQ(blocks[1].arguments[1], 5 * sizeof(wchar_t));
-    for (const auto& block : blocks) EXPECT_EQ(block.arguments[0], UINT{LMEM_ZEROINIT});
+    for (const auto& block : blocks)
+        EXPECT_EQ(static_cast<UINT>(block.arguments[0]), UINT{LMEM_ZEROINIT});
 }
 
 TEST_F(BarInsertion, TakesWhatTheMaskNames) {

@@ -26,9 +26,9 @@ TEST_F(BarMenu, IsOpenedBelowTheBarForACommand) {
     EXPECT_EQ(press(), 0);
     ASSERT_EQ(tracking.size(), 6u);
     EXPECT_EQ(tracking[0], spy.callsOf("CreatePopupMenu")[0].result);
-    EXPECT_EQ(tracking[1], UINT{TPM_RETURNCMD});
-    EXPECT_EQ(tracking[2], 3u);
-    EXPECT_EQ(tracking[3], static_cast<ULONG_PTR>(place.bottom));
+    EXPECT_EQ(static_cast<UINT>(tracking[1]), UINT{TPM_RETURNCMD});
+    EXPECT_EQ(static_cast<int>(tracking[2]), 3);
+    EXPECT_EQ(static_cast<int>(tracking[3]), place.bottom);
     EXPECT_EQ(reinterpret_cast<HWND>(tracking[4]), bar);
     EXPECT_EQ(tracking[5], 0u);
 }

@@ -7,7 +7,6 @@ const char* NameOf(UINT message) {
     switch (message) {
     case TB_ADDBITMAP: return "TB_ADDBITMAP";
     case TB_ADDBUTTONSW: return "TB_ADDBUTTONS";
-    case TB_ADDBUTTONSA: return "TB_ADDBUTTONS";
     case TB_INSERTBUTTONW: return "TB_INSERTBUTTON";
     case kSetToolTips: return "tooltips";
     default: return nullptr;

@@ -189,7 +189,10 @@ TEST_F(CommandBarSetup, WithoutButtonsTheCombosStandFirst) {
 // Two combo boxes of one id are a host's mistake; they still stand side by side.
 TEST_F(CommandBarSetup, EqualIdsDoNotMakeTheCombosOverlap) {
     SetupGraphCommandBar(GetModuleHandleW(nullptr), bar, nullptr, 0, &zoom, 7, &type, 7);
-    EXPECT_GE(PlaceIn(bar, type).left, PlaceIn(bar, zoom).right);
+    const RECT gaps[] = {placeOf(0), placeOf(1)};
+    const RECT places[] = {PlaceIn(bar, zoom), PlaceIn(bar, type)};
+    for (int i = 0; i < 2; ++i)
+        EXPECT_EQ(places[i].left + places[i].right, gaps[i].left + gaps[i].right) << i;
 }
 
 // ---- Failures ---------------------------------------------------------------------------------

@@ -113,7 +113,7 @@ BOOL PrintingTest::printDialog(kor::PrintDialogRecord* dialog) {
     if (test.inside[kPrintDialog]) test.inside[kPrintDialog]();
     if (!test.givesDC) return test.isChosen;
     if (!test.page) test.makePage();
-    if (test.isChosen) dialog->dc = test.page;
+    dialog->dc = test.page;  // also when it is cancelled: only the answer counts
     return test.isChosen;
 }
 
@@ -145,6 +145,10 @@ void PrintingTest::makePage() {
     pageBitmap_ = CreateCompatibleBitmap(screen, printer.width, printer.height);
     ReleaseDC(nullptr, screen);
     blank_ = SelectObject(page, pageBitmap_);
+    const HBRUSH paper = CreateSolidBrush(kPaper);
+    const RECT sheet = {0, 0, printer.width, printer.height};
+    FillRect(page, &sheet, paper);
+    DeleteObject(paper);
 }
 
 void PrintingTest::deletePage() {

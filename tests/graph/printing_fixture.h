@@ -15,6 +15,8 @@
 
 namespace kortest {
 
+constexpr COLORREF kPaper = RGB(255, 254, 253);  // what no chart draws
+
 // The printer that the dialog gives. Its page is a bitmap of `width` by `height` pixels.
 struct FakePrinter {
     int width = 300;

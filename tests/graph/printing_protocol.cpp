@@ -185,6 +185,7 @@ TEST_F(PrintProtocol, ChartThatCouldNotBeFinishedPrintsWhatItHas) {
     transcript.clear();
     print();
     EXPECT_EQ(transcript, printWithout({"EnableWindow 0"}));
+    EXPECT_GT(printed.count(RGB(0, 0, 0)), 100) << "axes at least";
     DestroyWindow(graph);
     graph = whole;
 }
@@ -195,7 +196,7 @@ TEST_F(PrintProtocol, UnknownChartTypeGivesAnEmptyPage) {
     transcript.clear();
     print();
     EXPECT_EQ(transcript, kWholePrint);
-    EXPECT_EQ(printed.count(RGB(0, 0, 0)), printer.width * printer.height) << "as the page was";
+    EXPECT_EQ(printed.count(kPaper), printer.width * printer.height);
 }
 
 TEST_F(PrintProtocol, DialogResourceIsThere) {

@@ -140,6 +140,16 @@ TEST_F(PrintState, FontsAreMadeForThePrinterAndThenForTheScreen) {
     EXPECT_EQ(std::memcmp(&turned, &turnedAfter, sizeof turned), 0);
 }
 
+TEST_F(PrintState, ClipRegionIsTheScreensAgain) {
+    createFull();
+    print();
+    RECT box{};
+    GetRgnBox(record().hrgnClip, &box);
+    EXPECT_EQ(box, (RECT{0, 0, 231, 131}));
+    EXPECT_EQ(GetClipBox(imageDC, &box), SIMPLEREGION);
+    EXPECT_EQ(box, (RECT{0, 0, 231, 131})) << "cut to the bitmap, which is a little larger";
+}
+
 TEST_F(PrintState, PanArrowsAreHitWhereTheyAre) {
     createFull();
     pan();

@@ -10,9 +10,9 @@ def build_extra(build, folder, code):
     compiled = run(compile_command(build, source, output), build)
     if compiled.returncode:
         return compiled
-    command = link_command(build, folder / "korcontrols.dll")
-    # A linker leaves out what nobody asks for.
-    linked = run(command + [str(output), "--no-gc-sections"], build)
+    # Before the libraries, which are searched in order; and nothing left out that nobody asks for.
+    linker, *arguments = link_command(build, folder / "korcontrols.dll")
+    linked = run([linker, str(output), *arguments, "--no-gc-sections"], build)
     return linked if linked.returncode else None
 
 

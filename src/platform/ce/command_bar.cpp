@@ -13,13 +13,17 @@ HWND CommandBar_InsertComboBox(HWND bar, HINSTANCE instance, int width, UINT sty
                                WORD position);
 }
 
-constexpr UINT kSetToolTips =
-    WM_USER + 81;  // TB_SETTOOLTIPS, also what CommandBar_AddToolTips sends
+constexpr UINT kAddButtons = WM_USER + 20;   // TB_ADDBUTTONS, which has one number here
+constexpr UINT kSetToolTips = WM_USER + 81;  // TB_SETTOOLTIPS, another message on the desktop
 
 }  // namespace
 
 void AddCommandBarBitmap(HWND bar, HINSTANCE instance, int bitmapId, int imageCount) {
     CommandBar_AddBitmap(bar, instance, bitmapId, imageCount, 0, 0);
+}
+
+void AddCommandBarButtons(HWND bar, const TBBUTTON* buttons, int count) {
+    SendMessageW(bar, kAddButtons, static_cast<WPARAM>(count), reinterpret_cast<LPARAM>(buttons));
 }
 
 HWND InsertCommandBarComboBox(HWND bar, HINSTANCE instance, int width, DWORD style, UINT id,

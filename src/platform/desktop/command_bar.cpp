@@ -2,8 +2,6 @@
 // width, which carries its id and, as data, its window.
 #include "platform/command_bar.h"
 
-#include <commctrl.h>
-
 namespace kor {
 
 namespace {
@@ -81,6 +79,11 @@ void AddCommandBarBitmap(HWND bar, HINSTANCE instance, int bitmapId, int imageCo
     TBADDBITMAP images = {instance, static_cast<UINT_PTR>(bitmapId)};
     SendMessageW(bar, TB_ADDBITMAP, static_cast<WPARAM>(imageCount),
                  reinterpret_cast<LPARAM>(&images));
+}
+
+void AddCommandBarButtons(HWND bar, const TBBUTTON* buttons, int count) {
+    SendMessageW(bar, TB_ADDBUTTONSW, static_cast<WPARAM>(count),
+                 reinterpret_cast<LPARAM>(buttons));
 }
 
 HWND InsertCommandBarComboBox(HWND bar, HINSTANCE instance, int width, DWORD style, UINT id,

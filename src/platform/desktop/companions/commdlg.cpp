@@ -7,11 +7,8 @@
 namespace {
 
 // One page is all there is to print, and the driver makes the copies.
-constexpr DWORD kAlways =
+constexpr DWORD kFlags =
     PD_RETURNDC | PD_NOSELECTION | PD_NOPAGENUMS | PD_USEDEVMODECOPIESANDCOLLATE;
-
-// What a caller may ask for: the default printer at once, without a dialog.
-constexpr DWORD kOnRequest = PD_RETURNDEFAULT;
 
 void Free(HGLOBAL block) {
     if (block) GlobalFree(block);
@@ -24,7 +21,7 @@ extern "C" BOOL WINAPI PrintDlg(kor::PrintDialogRecord* record) {
     PRINTDLGW dialog = {};
     dialog.lStructSize = sizeof dialog;
     dialog.hwndOwner = record->owner;
-    dialog.Flags = kAlways | (record->flags & kOnRequest);
+    dialog.Flags = kFlags;
     const BOOL isChosen = PrintDlgW(&dialog);
     Free(dialog.hDevMode);
     Free(dialog.hDevNames);
