@@ -16,7 +16,9 @@ namespace {
 // Marks the index of a system colour on Windows CE; see src/platform/platform.h.
 constexpr uint32_t kSystemColourFlag = 0x40000000;
 
-// The same number means something else to a toolbar of the desktop.
+// Messages to a command bar, whose numbers mean something else to a toolbar of the desktop. The
+// library sends them to nobody else.
+constexpr UINT kAddButtons = WM_USER + 20;
 constexpr UINT kSetToolTips = WM_USER + 81;
 
 template <typename Value = uint32_t>
@@ -70,11 +72,18 @@ uint64_t SetClipboard(uint32_t target, const uint32_t* words) {
     return taken;
 }
 
-uint64_t SendMessageOrToolTips(uint32_t target, const uint32_t* words) {
-    if (words[1] != kSetToolTips) return CallHost(target, words);
-    kor::SetCommandBarToolTips(As<HWND>(words[0]), static_cast<int>(words[2]),
-                               As<const wchar_t* const*>(words[3]));
-    return 0;
+uint64_t SendMessageOrCommand(uint32_t target, const uint32_t* words) {
+    const auto bar = As<HWND>(words[0]);
+    const auto count = static_cast<int>(words[2]);
+    switch (words[1]) {
+    case kAddButtons:
+        kor::AddCommandBarButtons(bar, As<const TBBUTTON*>(words[3]), count);
+        return 0;
+    case kSetToolTips:
+        kor::SetCommandBarToolTips(bar, count, As<const wchar_t* const*>(words[3]));
+        return 0;
+    default: return CallHost(target, words);
+    }
 }
 
 uint64_t CommandBarBitmap(uint32_t, const uint32_t* words) {
@@ -106,7 +115,7 @@ const Entry kEntries[] = {
     {"GetStockObject", StockObject, {"GetSysColorBrush"}},
     {"GetSysColor", SystemColour, {}},
     {"GetSysColorBrush", SystemColour, {}},
-    {"SendMessageW", SendMessageOrToolTips, {}},
+    {"SendMessageW", SendMessageOrCommand, {}},
     {"SetClipboardData",
      SetClipboard,
      {"GlobalAlloc", "GlobalFree", "GlobalLock", "GlobalUnlock", "LocalFree", "LocalSize"}},
