@@ -37,6 +37,7 @@ foreach(line IN LISTS lines)
       endif()
     endforeach()
     if(reason)
+      message("device.${test} is skipped: ${reason}")
       add_test(device.${test} ${CMAKE} -E echo "does not apply to the device: ${reason}")
       set_tests_properties(device.${test} PROPERTIES
         LABELS device SKIP_REGULAR_EXPRESSION "does not apply to the device")
