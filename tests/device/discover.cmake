@@ -2,7 +2,7 @@
 # on the device's image. The names come from the program beside the desktop's library (LISTED), what
 # runs is its twin beside the stand-in (TESTED). Tests of NOT_APPLICABLE, a file with a test's name and
 # a reason in each line, say the reason and count as skipped.
-set(listing ${CMAKE_CURRENT_LIST_DIR}/${PROGRAM}.tests)
+set(listing ${FOLDER}/${PROGRAM}.tests)
 if(NOT EXISTS ${LISTED})
   add_test(device.${PROGRAM}_NOT_BUILT ${PROGRAM}_NOT_BUILT)
   return()
