@@ -1,6 +1,6 @@
 """Fixtures: one desktop for each machine, and workbooks that are closed whatever happens.
 
-    python3 -m pytest tests/e2e [--machine i686] [--machine x86_64] [--build build]
+    python3 -m pytest tests/e2e [--machine i686] [--machine x86_64] [--machine device] [--build build]
 """
 
 import pathlib
@@ -18,7 +18,7 @@ FAILURES = ROOT / "build" / "e2e-failures"
 
 
 def pytest_addoption(parser):
-    parser.addoption("--machine", action="append", help="i686 or x86_64 (default: both)")
+    parser.addoption("--machine", action="append", help="i686, x86_64 (default: both) or device")
     parser.addoption("--build", default=ROOT / "build", help="the folder of the presets' builds")
 
 
@@ -38,7 +38,8 @@ def pytest_runtest_makereport(item, call):
 @pytest.fixture(scope="session")
 def programs(machine, pytestconfig):
     """The folder with workbook.exe and window_probe.exe."""
-    return pathlib.Path(pytestconfig.getoption("build")).absolute() / machine / "bin"
+    folder = "i686/device" if machine == "device" else f"{machine}/bin"
+    return pathlib.Path(pytestconfig.getoption("build")).absolute() / folder
 
 
 @pytest.fixture(scope="session")

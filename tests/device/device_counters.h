@@ -1,0 +1,50 @@
+// What the stand-in for the device's library has counted in this process, for benchmarks and tests.
+// It lies in shared memory, so that the library's list of exports stays as it is.
+#pragma once
+
+#include <windows.h>
+
+#include <cstdint>
+#include <cwchar>
+
+namespace device {
+
+struct Counters {
+    uint64_t instructions;  // of the guest, those included whose condition did not hold
+    uint64_t softFloat;     // those of them in the helpers for arithmetic that the processor lacks
+    uint64_t importCalls;   // calls of the platform by the guest
+    uint64_t callbacks;     // calls of the guest by the platform
+    uint64_t exportCalls;   // calls of the guest by the program
+    uint32_t stackLow;      // the guest's stack in this process; never used words hold kUnusedStack
+    uint32_t stackSize;
+};
+
+constexpr uint32_t kUnusedStack = 0xA5A5A5A5;
+
+constexpr size_t kCountersNameCapacity = 48;
+
+inline void CountersName(wchar_t (&name)[kCountersNameCapacity]) {
+    _snwprintf(name, kCountersNameCapacity, L"Local\\korcontrols-device-%lu",
+               GetCurrentProcessId());
+}
+
+// Null where the library is not the device's.
+inline const Counters* FindCounters() {
+    wchar_t name[kCountersNameCapacity] = L"";
+    CountersName(name);
+    const HANDLE mapping = OpenFileMappingW(FILE_MAP_READ, FALSE, name);
+    if (!mapping) return nullptr;
+    const void* view = MapViewOfFile(mapping, FILE_MAP_READ, 0, 0, 0);
+    CloseHandle(mapping);
+    return static_cast<const Counters*>(view);
+}
+
+// Bytes of the guest's stack that have ever been in use.
+inline uint32_t DeepestStack(const Counters& counters) {
+    const auto* stack = reinterpret_cast<const uint32_t*>(uintptr_t{counters.stackLow});
+    uint32_t unused = 0;
+    while (unused < counters.stackSize / 4 && stack[unused] == kUnusedStack) ++unused;
+    return counters.stackSize - 4 * unused;
+}
+
+}  // namespace device
