@@ -33,14 +33,16 @@ public:
 
     void RedrawChart() const { Redraw(chart_); }
 
-    // Draws the floor into a memory DC and copies it to the window.
+    // Draws the floor into a memory DC and has a plain window of the same size show it: the least
+    // that a program does which draws for itself.
     void DrawFloor() const;
 
-    // Whether the last floor has the chart's pixels, and shows anything at all.
+    // Whether both windows show the same, and anything at all.
     bool ShowsTheSame() const;
 
 private:
     HWND chart_;
+    HWND floorWindow_ = nullptr;
     HDC dc_;
     HBITMAP bitmap_;
     HGDIOBJ blank_;

@@ -10,17 +10,18 @@ namespace kor {
 
 namespace {
 
-// Up to so many corners within so many rows of the view Polygon is faster.
-constexpr int kFewCorners = 48;
-constexpr int kNearRows = 2048;
+// Polygon's time grows with the rows that its corners span, times the square of their number: up to
+// about so many it is the faster way.
+constexpr double kPolygonWork = 5e6;
 
-bool SuitsPolygon(HDC dc, const RECT& view, const AreaOutline& outline) {
+bool SuitsPolygon(HDC dc, const AreaOutline& outline) {
     // A printer's driver takes a whole polygon, and its page has very many columns.
     if (GetDeviceCaps(dc, TECHNOLOGY) != DT_RASDISPLAY) return true;
-    if (outline.count > kFewCorners) return false;
-    return std::all_of(outline.corners, outline.corners + outline.count, [&](const POINT& corner) {
-        return corner.y > view.top - kNearRows && corner.y < view.bottom + kNearRows;
-    });
+    const auto isHigher = [](const POINT& a, const POINT& b) { return a.y < b.y; };
+    const auto [highest, lowest] =
+        std::minmax_element(outline.corners, outline.corners + outline.count, isHigher);
+    const double count = outline.count;
+    return count * count * (static_cast<double>(lowest->y) - highest->y) <= kPolygonWork;
 }
 
 // Rows [top, bottom).
@@ -110,7 +111,7 @@ void FillColumns(HDC dc, const RECT& view, const AreaOutline& outline) {
 }  // namespace
 
 void DrawArea(HDC dc, const RECT& view, const AreaOutline& outline) {
-    if (SuitsPolygon(dc, view, outline)) {
+    if (SuitsPolygon(dc, outline)) {
         Polygon(dc, outline.corners, outline.count);
         return;
     }

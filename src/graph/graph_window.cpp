@@ -172,6 +172,9 @@ LRESULT CALLBACK GraphProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam
     case WM_SIZE: return OnSize(*graph, hwnd, wParam, lParam);
     case WM_PAINT:
         if (graph->hwnd) PaintFromImage(*graph);
+        // Default processing begins and ends a paint of its own, which takes as long as drawing a
+        // small chart: it is left out where there is nothing to paint any more.
+        if (!GetUpdateRect(hwnd, nullptr, FALSE)) return 0;
         break;
     case WM_ERASEBKGND: return OnEraseBackground(*graph, reinterpret_cast<HDC>(wParam));
     case WM_SHOWWINDOW: ReloadShowGraphToolTip(wParam != 0); break;
