@@ -81,14 +81,19 @@ public:
 
     LPARAM address() const { return reinterpret_cast<LPARAM>(page_); }
 
-    template <typename Value> Value read(const void* address) const {
+    template <typename Value>
+    Value read(const void* address) const {
         Value value = {};
         ReadProcessMemory(process_, address, &value, sizeof value, nullptr);
         return value;
     }
-    template <typename Value> Value read() const { return read<Value>(page_); }
+    template <typename Value>
+    Value read() const {
+        return read<Value>(page_);
+    }
 
-    template <typename Value> void write(const Value& value) const {
+    template <typename Value>
+    void write(const Value& value) const {
         WriteProcessMemory(process_, page_, &value, sizeof value, nullptr);
     }
 
@@ -149,7 +154,8 @@ std::string StatusParts(HWND bar) {
 // Room for a text beside the structure that a message fills.
 constexpr LPARAM kTextOffset = 1024;
 
-template <typename Item> Item ItemWithRoom(const RemotePage& page) {
+template <typename Item>
+Item ItemWithRoom(const RemotePage& page) {
     Item item = {};
     item.pszText = reinterpret_cast<wchar_t*>(page.address() + kTextOffset);
     item.cchTextMax = 512;
@@ -184,8 +190,8 @@ std::string ListRows(HWND list) {
         }
         page.write(RECT{LVIR_LABEL, 0, 0, 0});
         SendMessageW(list, LVM_GETITEMRECT, static_cast<WPARAM>(row), page.address());
-        const bool selected = SendMessageW(list, LVM_GETITEMSTATE, static_cast<WPARAM>(row),
-                                           LVIS_SELECTED) != 0;
+        const bool selected =
+            SendMessageW(list, LVM_GETITEMSTATE, static_cast<WPARAM>(row), LVIS_SELECTED) != 0;
         rows.push_back("{\"texts\": " + List(texts) +
                        ", \"rect\": " + Rectangle(RemoteRectangle(list, page)) +
                        ", \"selected\": " + (selected ? "true" : "false") + "}");
@@ -307,8 +313,8 @@ void PrintClipboard() {
 }
 
 void PutOnClipboard(const std::string& utf8) {
-    const int length = MultiByteToWideChar(CP_UTF8, 0, utf8.data(), static_cast<int>(utf8.size()),
-                                           nullptr, 0);
+    const int length =
+        MultiByteToWideChar(CP_UTF8, 0, utf8.data(), static_cast<int>(utf8.size()), nullptr, 0);
     const HGLOBAL block =
         GlobalAlloc(GMEM_MOVEABLE | GMEM_ZEROINIT, (static_cast<size_t>(length) + 1) * 2);
     MultiByteToWideChar(CP_UTF8, 0, utf8.data(), static_cast<int>(utf8.size()),
@@ -325,7 +331,7 @@ std::string ReadInput() {
     return {std::istreambuf_iterator<char>(std::cin), std::istreambuf_iterator<char>()};
 }
 
-} // namespace
+}  // namespace
 
 int main(int count, char** arguments) {
     if (count == 2 && std::strcmp(arguments[1], "--serve") == 0) {
