@@ -43,7 +43,7 @@ typedef struct GridSelection {
     WORD right;
     WORD top;
     WORD bottom;
-} GridSelection;
+} KORCONTROLS_EVEN GridSelection;
 
 #define KORGRID_PAIR(low, high) ((DWORD)(WORD)(low) | (DWORD)(WORD)(high) << 16)
 
@@ -53,13 +53,13 @@ typedef struct GridVisibleRange {
     WORD endColumn;
     WORD firstRow;
     WORD endRow;
-} GridVisibleRange;
+} KORCONTROLS_EVEN GridVisibleRange;
 
 /* A cell as notifications point to it. 4 bytes. */
 typedef struct GridCellPair {
     WORD column;
     WORD row;
-} GridCellPair;
+} KORCONTROLS_EVEN GridCellPair;
 
 /* ---- Notifications to the parent ----
  *

@@ -17,6 +17,14 @@
 
 #define KORCONTROLS_API __cdecl
 
+/* A record of WORDs lies on even addresses, no coarser ones. Some compilers for ARM would take it
+ * to lie on multiples of 4. */
+#ifdef __GNUC__
+#define KORCONTROLS_EVEN __attribute__((packed, aligned(2)))
+#else
+#define KORCONTROLS_EVEN
+#endif
+
 #ifdef __cplusplus
 extern "C" {
 #endif
