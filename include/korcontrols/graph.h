@@ -93,7 +93,8 @@ typedef struct GraphRange {
 /* GM_ADDSERIES: adds a series; its colour is the next one of the palette.
  *   wParam  0
  *   lParam  const GraphSeriesData*
- *   result  0, or 1 for a null pointer, a count below 1 or no memory (nothing is added then) */
+ *   result  0, or 1 for a null pointer, a count below 1, no memory, or while the chart stands on a
+ *           page that is printed (nothing is added then) */
 #define GM_ADDSERIES (WM_USER + 6000)
 
 /* GM_SETTITLE, GM_SETXTITLE, GM_SETYTITLE: set the chart's and the axes' titles.
@@ -116,7 +117,8 @@ typedef struct GraphRange {
 /* GM_SETCATEGORIES: names the points; label i stands at point i.
  *   wParam  count; below 1 removes all labels
  *   lParam  const LPCWSTR*, count texts, copied; single ones may be null
- *   result  0, or 1 when there was no memory (the labels copied so far stay) */
+ *   result  0, or 1 when there was no memory (the labels copied so far stay), or while the chart
+ *           stands on a page that is printed (nothing changes then) */
 #define GM_SETCATEGORIES (WM_USER + 6008)
 
 /* GM_SETTYPE: changes the chart type and draws. Between Bar and the others the axes trade places.
