@@ -272,9 +272,12 @@ LPCWSTR KORCONTROLS_API GetGraphControlClassName(void);
  * The tooltip texts (of the first two buttons, the zoom and the type combo box, and one more) go to
  * the bar as WM_USER + 81 (wParam 5, lParam LPCWSTR*). Array and texts belong to the library and
  * stay valid; the first text changes with the chart, "Show Grid" while it is shown and "Show Graph"
- * while it is hidden, so a bar must read it anew each time. On a desktop the message goes only to a
- * bar with a procedure of its own, since a plain toolbar takes it for another one: a host that
- * subclasses the toolbar must answer it there.
+ * while it is hidden, so a bar must read it anew each time.
+ *
+ * On a desktop a toolbar takes the message for another one and would read the count as a pointer.
+ * So a toolbar gets it only when the host has set the window property "korcontrols tooltips" on it,
+ * to anything but null. By that the host says that its own procedure answers the message and does
+ * not pass it on. A bar of another window class is always told.
  *   instance       the host's, under which the combo boxes are created
  *   commandBar     a command bar, or on a desktop a toolbar that was sent TB_BUTTONSTRUCTSIZE
  *   buttons        buttonCount descriptions, added as they are; null or a count of 0 adds none
