@@ -134,7 +134,9 @@ typedef struct GraphRange {
 #define GM_GETTYPE (WM_USER + 6010)
 
 /* GM_SETRANGE: fixes an axis. Equal ends show one unit. The category axis of a bar chart (y)
- * ignores the ends given and follows the number of points. wParam  0 lParam  const GraphRange*
+ * ignores the ends given and follows the number of points.
+ *   wParam  0
+ *   lParam  const GraphRange*
  *   result  0 */
 #define GM_SETRANGE (WM_USER + 6011)
 
@@ -168,8 +170,9 @@ typedef struct GraphRange {
 #define GN_RESET (WM_USER + 6016)
 
 /* GN_PROPERTIES, inside WM_NOTIFY: runs the modal property sheet "Graph Properties", with a page of
- * the titles and a page of ranges, type and zoom. OK applies both pages and draws. It comes back
- * when the sheet is closed; the host's messages go on meanwhile.
+ * the titles and a page of ranges, type and zoom. OK applies the pages that were shown, and draws
+ * if anything was sent. It comes back when the sheet is closed; the host's messages go on
+ * meanwhile.
  *   lParam  0
  *   result  0 */
 #define GN_PROPERTIES (WM_USER + 6017)
