@@ -8,6 +8,9 @@ namespace {
 
 constexpr int kImageSize = 16;
 
+// By it a toolbar asks for the tooltip texts.
+constexpr wchar_t kToolTipsProperty[] = L"korcontrols tooltips";
+
 // What a bar remembers, in its user data until WM_NCDESTROY.
 struct ToolTips {
     WNDPROC toolbar;  // the procedure that ours stands before
@@ -93,6 +96,7 @@ LRESULT CALLBACK BarProc(HWND bar, UINT message, WPARAM wParam, LPARAM lParam) {
         }
         break;
     case WM_NCDESTROY:
+        RemovePropW(bar, kToolTipsProperty);
         SetWindowLongPtrW(bar, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(toolbar));
         delete tips;
         break;
@@ -116,6 +120,7 @@ HWND Create(HWND parent, HINSTANCE instance, int id) {
     SetWindowLongPtrW(bar, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(tips));
     tips->toolbar = reinterpret_cast<WNDPROC>(
         SetWindowLongPtrW(bar, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(BarProc)));
+    SetPropW(bar, kToolTipsProperty, bar);  // from here on the message is answered
     return bar;
 }
 

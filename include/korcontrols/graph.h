@@ -93,7 +93,8 @@ typedef struct GraphRange {
 /* GM_ADDSERIES: adds a series; its colour is the next one of the palette.
  *   wParam  0
  *   lParam  const GraphSeriesData*
- *   result  0, or 1 for a null pointer, a count below 1 or no memory (nothing is added then) */
+ *   result  0, or 1 for a null pointer, a count below 1, no memory, or while the chart stands on a
+ *           page that is printed (nothing is added then) */
 #define GM_ADDSERIES (WM_USER + 6000)
 
 /* GM_SETTITLE, GM_SETXTITLE, GM_SETYTITLE: set the chart's and the axes' titles.
@@ -116,7 +117,8 @@ typedef struct GraphRange {
 /* GM_SETCATEGORIES: names the points; label i stands at point i.
  *   wParam  count; below 1 removes all labels
  *   lParam  const LPCWSTR*, count texts, copied; single ones may be null
- *   result  0, or 1 when there was no memory (the labels copied so far stay) */
+ *   result  0, or 1 when there was no memory (the labels copied so far stay), or while the chart
+ *           stands on a page that is printed (nothing changes then) */
 #define GM_SETCATEGORIES (WM_USER + 6008)
 
 /* GM_SETTYPE: changes the chart type and draws. Between Bar and the others the axes trade places.
@@ -132,7 +134,9 @@ typedef struct GraphRange {
 #define GM_GETTYPE (WM_USER + 6010)
 
 /* GM_SETRANGE: fixes an axis. Equal ends show one unit. The category axis of a bar chart (y)
- * ignores the ends given and follows the number of points. wParam  0 lParam  const GraphRange*
+ * ignores the ends given and follows the number of points.
+ *   wParam  0
+ *   lParam  const GraphRange*
  *   result  0 */
 #define GM_SETRANGE (WM_USER + 6011)
 
@@ -166,8 +170,9 @@ typedef struct GraphRange {
 #define GN_RESET (WM_USER + 6016)
 
 /* GN_PROPERTIES, inside WM_NOTIFY: runs the modal property sheet "Graph Properties", with a page of
- * the titles and a page of ranges, type and zoom. OK applies both pages and draws. It comes back
- * when the sheet is closed; the host's messages go on meanwhile.
+ * the titles and a page of ranges, type and zoom. OK applies the pages that were shown, and draws
+ * if anything was sent. It comes back when the sheet is closed; the host's messages go on
+ * meanwhile.
  *   lParam  0
  *   result  0 */
 #define GN_PROPERTIES (WM_USER + 6017)
@@ -270,9 +275,12 @@ LPCWSTR KORCONTROLS_API GetGraphControlClassName(void);
  * The tooltip texts (of the first two buttons, the zoom and the type combo box, and one more) go to
  * the bar as WM_USER + 81 (wParam 5, lParam LPCWSTR*). Array and texts belong to the library and
  * stay valid; the first text changes with the chart, "Show Grid" while it is shown and "Show Graph"
- * while it is hidden, so a bar must read it anew each time. On a desktop the message goes only to a
- * bar with a procedure of its own, since a plain toolbar takes it for another one: a host that
- * subclasses the toolbar must answer it there.
+ * while it is hidden, so a bar must read it anew each time.
+ *
+ * On a desktop a toolbar takes the message for another one and would read the count as a pointer.
+ * So a toolbar gets it only when the host has set the window property "korcontrols tooltips" on it,
+ * to anything but null. By that the host says that its own procedure answers the message and does
+ * not pass it on. A bar of another window class is always told.
  *   instance       the host's, under which the combo boxes are created
  *   commandBar     a command bar, or on a desktop a toolbar that was sent TB_BUTTONSTRUCTSIZE
  *   buttons        buttonCount descriptions, added as they are; null or a count of 0 adds none

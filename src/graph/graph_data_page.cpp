@@ -1,9 +1,6 @@
 // The page of the shown ranges, the chart type and the zoom.
 #include <korcontrols/graph.h>
 
-#include <algorithm>
-#include <iterator>
-
 #include "graph/graph_choices.h"
 #include "graph/graph_numbers.h"
 #include "graph/graph_pages.h"
@@ -37,11 +34,6 @@ void FillCombo(HWND page, int comboId, const wchar_t* const (&texts)[count], int
     SendDlgItemMessageW(page, comboId, CB_SETCURSEL, static_cast<WPARAM>(selection), 0);
 }
 
-int ZoomChoice(double zoom) {
-    constexpr double kZooms[] = {0.25, 0.5, 1.0};  // and anything else
-    return static_cast<int>(std::find(kZooms, std::end(kZooms), zoom) - kZooms);
-}
-
 void InitialisePage(HWND page, LPARAM parameter) {
     HWND graph = TakeGraphOfPage(page, parameter);
     FillNumber(page, kXMinEdit, GraphXMin(graph));
@@ -49,7 +41,7 @@ void InitialisePage(HWND page, LPARAM parameter) {
     FillNumber(page, kYMinEdit, GraphYMin(graph));
     FillNumber(page, kYMaxEdit, GraphYMax(graph));
     FillCombo(page, kTypeCombo, kTypeChoices, KorGraph_GetType(graph));
-    FillCombo(page, kZoomCombo, kZoomChoices, ZoomChoice(GraphZoom(graph)));
+    FillCombo(page, kZoomCombo, kZoomChoices, PlaceOfZoom(GraphZoom(graph)));
     SetFocus(GetDlgItem(page, kTypeCombo));
     SetFocus(GetDlgItem(page, kZoomCombo));
 }
@@ -90,6 +82,7 @@ void Apply(HWND page) {
     HWND graph = GraphOfPage(page);
     bool isChanged = ApplyRange(page, graph, KORGRAPH_X, kXMinEdit, kXMaxEdit);
     isChanged |= ApplyRange(page, graph, KORGRAPH_Y, kYMinEdit, kYMaxEdit);
+    if (!IsWindow(page)) return;  // gone while a range was refused in a box
     isChanged |= ApplyChoice(page, graph, kTypeCombo, GM_SETTYPE);
     isChanged |= ApplyChoice(page, graph, kZoomCombo, GM_SETZOOM);
     if (isChanged) KorGraph_Redraw(graph);

@@ -7,6 +7,7 @@
 #include "graph/graph_scale.h"
 #include "graph/graph_series.h"
 #include "platform/gdi_scopes.h"
+#include "platform/windows_helpers.h"
 
 namespace kor {
 
@@ -25,10 +26,6 @@ struct LastReach {
 };
 
 constinit LastReach lastReach = {};
-
-void Invalidate(const GraphRecord& graph, const RECT& area) {
-    if (graph.hwnd) InvalidateRect(graph.hwnd, &area, FALSE);
-}
 
 // A sweep can begin on an empty chart.
 bool EnsureSeries(GraphRecord& graph) {
@@ -51,8 +48,8 @@ void Sweep(GraphRecord& graph) {
     }
     points[kNewest] = {xPixel(graph, graph.liveIndex), yPixel(graph, series.values[0])};
     series.livePointCount = kSweepPoints;
-    Invalidate(graph, {points[kCurrent].x - 1, graph.rcPlot.top, points[kNewest].x + 1,
-                       graph.rcPlot.bottom});
+    InvalidateArea(graph.hwnd, {points[kCurrent].x - 1, graph.rcPlot.top, points[kNewest].x + 1,
+                                graph.rcPlot.bottom});
     ++graph.liveIndex;
 }
 
@@ -83,9 +80,9 @@ void Replace(GraphRecord& graph) {
         GraphSeries* series = graph.series[i];
         if (series && series->values && series->liveBuffer) TraceSeries(graph, *series, reach);
     }
-    Invalidate(graph,
-               {xPixel(graph, 1) - 1, std::min(lastReach.top, reach.top),
-                std::max(lastReach.right, reach.right), std::max(lastReach.bottom, reach.bottom)});
+    InvalidateArea(graph.hwnd, {xPixel(graph, 1) - 1, std::min(lastReach.top, reach.top),
+                                std::max(lastReach.right, reach.right),
+                                std::max(lastReach.bottom, reach.bottom)});
     lastReach = {true, reach.top, reach.right, reach.bottom};
 }
 

@@ -6,6 +6,7 @@
 
 #include <prsht.h>
 
+#include "graph/graph_choices.h"
 #include "platform/input_panel.h"
 #include "platform/module.h"
 #include "platform/records.h"
@@ -16,8 +17,6 @@ namespace {
 
 constexpr int kTitlesDialog = 3000;
 constexpr int kDataDialog = 3001;
-
-constexpr double kZooms[] = {0.25, 0.5, 1.0, 2.0};
 
 GraphRange RangeOf(HWND graph, LONG axis) {
     GraphRange range = {};
@@ -83,7 +82,8 @@ HWND GraphOfPage(HWND page) {
 }
 
 bool IsApply(LPARAM notification) {
-    return reinterpret_cast<const NMHDR*>(notification)->code == PSN_APPLY;
+    const auto* header = reinterpret_cast<const NMHDR*>(notification);
+    return header && header->code == PSN_APPLY;
 }
 
 double GraphXMin(HWND graph) { return RangeOf(graph, KORGRAPH_X).min; }
@@ -97,7 +97,7 @@ double GraphYMax(HWND graph) { return RangeOf(graph, KORGRAPH_Y).max; }
 double GraphZoom(HWND graph) {
     LONG index = -1;
     SendMessageW(graph, GM_GETZOOM, 0, reinterpret_cast<LPARAM>(&index));
-    return index >= 0 && index < static_cast<LONG>(std::size(kZooms)) ? kZooms[index] : 0.0;
+    return index >= 0 && index < kZoomCount ? kZoomFactors[index] : 0.0;
 }
 
 }  // namespace kor

@@ -113,10 +113,12 @@ struct GraphRecord {
     int32_t barWidth;
     int32_t barHeight;
 
-    // The library's own, behind the specified fields.
+    // The library's own, behind the fields above.
     HGDIOBJ blankBitmap;        // what hdcMem held at first; back before hbmMem is deleted
     NumberWidths numberWidths;  // in hfontAxis
     PrintState printing;
+    bool paintMissed;  // WM_PAINT came while the record stood for a page
+    bool sizeMissed;   // WM_SIZE likewise
 };
 
 constexpr uint32_t kPanLeft = 1;

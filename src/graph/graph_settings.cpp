@@ -1,9 +1,8 @@
 #include "graph/graph_settings.h"
 
-#include <algorithm>
-#include <iterator>
 #include <utility>
 
+#include "graph/graph_choices.h"
 #include "graph/graph_layout.h"
 #include "graph/graph_redraw.h"
 #include "graph/graph_scale.h"
@@ -12,8 +11,6 @@
 namespace kor {
 
 namespace {
-
-constexpr double kZooms[] = {0.25, 0.5, 1.0, 2.0};
 
 void LayOutAndRescale(GraphRecord& graph) {
     LayoutGraphMargins(graph, graph.hdcMem);
@@ -58,15 +55,12 @@ void ToggleOptions(GraphRecord& graph, uint32_t options) {
 }
 
 void SetZoomIndex(GraphRecord& graph, int index) {
-    if (index < 0 || index >= static_cast<int>(std::size(kZooms))) return;
-    SetZoomFactor(graph, kZooms[index]);
+    if (index < 0 || index >= kZoomCount) return;
+    SetZoomFactor(graph, kZoomFactors[index]);
     RedrawGraph(graph);
 }
 
-int ZoomIndex(const GraphRecord& graph) {
-    constexpr int kLast = static_cast<int>(std::size(kZooms)) - 1;
-    return static_cast<int>(std::find(kZooms, kZooms + kLast, graph.zoom) - kZooms);
-}
+int ZoomIndex(const GraphRecord& graph) { return PlaceOfZoom(graph.zoom); }
 
 void SetBackgroundColour(GraphRecord& graph, COLORREF colour) {
     graph.crBack = colour;

@@ -22,12 +22,13 @@ constexpr WPARAM kTypedCharacters = 20;  // at most; a longer title of the host 
 
 // In the middle of the screen's upper edge, clear of an input panel at the lower one.
 void PlaceSheet(HWND page) {
-    WindowDC screen(page);
+    WindowDC dc(page);
+    if (!dc.get()) return;
     HWND sheet = GetParent(page);
     RECT place = {};
     GetWindowRect(sheet, &place);
     const int width = place.right - place.left;
-    const int left = (GetDeviceCaps(screen.get(), HORZRES) - width) / 2;
+    const int left = (GetDeviceCaps(dc.get(), HORZRES) - width) / 2;
     MoveWindow(sheet, left, 0, width, place.bottom - place.top, TRUE);
 }
 

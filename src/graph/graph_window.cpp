@@ -157,13 +157,27 @@ bool OnNotify(GraphRecord& graph, WPARAM code, LPARAM argument) {
     }
 }
 
+// The record stands for a page: whatever arrives is kept away from it, and what the window itself
+// needs is noted for the time after.
+LRESULT AnswerOnPage(GraphRecord& graph, HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
+    switch (message) {
+    case WM_PAINT: graph.paintMissed = true; break;
+    case WM_SIZE: graph.sizeMissed = true; break;
+    case GM_ADDSERIES:
+    case GM_SETCATEGORIES: return 1;  // nothing was taken
+    default: break;
+    }
+    return DefWindowProcW(hwnd, message, wParam, lParam);
+}
+
 LRESULT CALLBACK GraphProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
     GraphRecord* graph = UserDataOf<GraphRecord>(hwnd);
     if (message == WM_CREATE && !graph) {
         return OnCreate(hwnd, reinterpret_cast<CREATESTRUCTW*>(lParam));
     }
-    if (!graph || (graph->printing == PrintState::onPage && message != WM_DESTROY)) {
-        return DefWindowProcW(hwnd, message, wParam, lParam);
+    if (!graph) return DefWindowProcW(hwnd, message, wParam, lParam);
+    if (graph->printing == PrintState::onPage && message != WM_DESTROY) {
+        return AnswerOnPage(*graph, hwnd, message, wParam, lParam);
     }
 
     const auto number = static_cast<int32_t>(lParam);

@@ -1,13 +1,16 @@
 // Drawing is the screen's, so for the time of a page the record stands for the page: hdcMem and
 // rcPlot are the printer's, and fonts, margins and scaling follow from them. Meanwhile the window
-// procedure keeps all messages away from the record.
+// procedure keeps all messages away from the record; a paint and a new size are made up for after
+// it.
 #include "graph/printing.h"
 
 #include "graph/graph_frame.h"
+#include "graph/graph_image.h"
 #include "graph/graph_layout.h"
 #include "graph/graph_redraw.h"
 #include "graph/graph_scale.h"
 #include "graph/printing_calls.h"
+#include "platform/windows_helpers.h"
 
 namespace kor {
 
@@ -38,7 +41,22 @@ void BecomeScreen(GraphRecord& graph, const GraphRecord& screen) {
     graph.hfontLabel = page.hfontLabel;
     graph.hfontAxis = page.hfontAxis;
     graph.printing = page.printing;
+    graph.paintMissed = page.paintMissed;
+    graph.sizeMissed = page.sizeMissed;
     ClipToSurface(graph, graph.hdcMem);
+}
+
+// Default processing has validated the window and left the image in its old size.
+void CatchUp(GraphRecord& graph) {
+    if (graph.printing != PrintState::onPage) return;
+    graph.printing = PrintState::underWay;
+    const RECT client = ClientRectOf(graph.hwnd);
+    const bool fits = client.right == graph.rcPlot.right && client.bottom == graph.rcPlot.bottom;
+    if (graph.sizeMissed && !fits && graph.hdcMem) {
+        ResizeImage(graph, client.right, client.bottom);
+    }
+    if (graph.paintMissed) InvalidateArea(graph.hwnd, client);
+    graph.paintMissed = graph.sizeMissed = false;
 }
 
 void PrintOn(GraphRecord& graph, HDC printer) {
@@ -52,6 +70,7 @@ void PrintOn(GraphRecord& graph, HDC printer) {
     EndPrintJob(printer);
     DeleteDC(printer);
     BecomeScreen(graph, screen);
+    CatchUp(graph);
 }
 
 }  // namespace

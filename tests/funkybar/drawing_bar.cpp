@@ -137,6 +137,26 @@ TEST_F(BarDrawing, WithAnImageOfEitherParity) {
     }
 }
 
+TEST_F(BarDrawing, AsksForTheWholeTextAndSeeThroughImages) {
+    createWide();
+    KorFunkyBar_SetImageList(bar, makeImages(12, 10, {kRed}));
+    FunkyBarItemDesc item = described(L"Calendar");
+    item.mask |= FBIF_IMAGE;
+    insert(item);
+    settle();
+    spy.watchAll({"DrawTextW", "ImageList_Draw"});
+    InvalidateRect(bar, nullptr, FALSE);
+    UpdateWindow(bar);
+    ASSERT_EQ(spy.count("DrawTextW"), 1);
+    const ImportCall text = spy.callsOf("DrawTextW")[0];
+    EXPECT_EQ(static_cast<int>(text.arguments[2]), -1);
+    EXPECT_EQ(static_cast<UINT>(text.arguments[4]), UINT{DT_VCENTER});
+    const auto images = spy.callsOf("ImageList_Draw");
+    ASSERT_EQ(images.size(), 2u) << "the item's and the arrow";
+    for (const ImportCall& image : images)
+        EXPECT_EQ(static_cast<UINT>(image.arguments[5]), UINT{ILD_TRANSPARENT});
+}
+
 TEST_F(BarDrawing, WithoutAnImageListKeepsTheGap) {
     createWide();
     FunkyBarItemDesc item = described(L"Calendar");

@@ -136,6 +136,20 @@ TEST_F(BarMenuDrawing, OfADestroyedImageList) {
     EXPECT_EQ(measured(entry(0)).cx, textSize(L"text").cx + 6);
 }
 
+TEST_F(BarMenuDrawing, AsksForTheWholeTextAndTheImageOnItsBackground) {
+    KorFunkyBar_SetImageList(bar, makeImages(14, 10, {kBlue}));
+    insert(withImage(L"text", 0));
+    const ULONG_PTR data = entry(0);
+    spy.watchAll({"DrawTextW", "ImageList_Draw"});
+    drawn(data);
+    ASSERT_EQ(spy.count("DrawTextW"), 1);
+    const ImportCall text = spy.callsOf("DrawTextW")[0];
+    EXPECT_EQ(static_cast<int>(text.arguments[2]), -1);
+    EXPECT_EQ(static_cast<UINT>(text.arguments[4]), UINT{DT_VCENTER});
+    ASSERT_EQ(spy.count("ImageList_Draw"), 1);
+    EXPECT_EQ(static_cast<UINT>(spy.callsOf("ImageList_Draw")[0].arguments[5]), UINT{ILD_NORMAL});
+}
+
 TEST_F(BarMenuDrawing, MeasuresAText) {
     insert(L"Some text");
     const SIZE text = textSize(L"Some text");

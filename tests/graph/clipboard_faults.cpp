@@ -4,14 +4,24 @@
 namespace kortest {
 namespace {
 
+// A black picture, with its head, of a chart of 101 by 50 pixels.
+void ExpectBlackDib() {
+    const ColourDib dib = ParseDib(ReadClipboard());
+    EXPECT_EQ(dib.header.biWidth, 104);
+    EXPECT_EQ(dib.header.biHeight, 52);
+    ASSERT_EQ(dib.colours.size(), 19u);
+    EXPECT_EQ(dib.colours[1], RGB(255, 255, 255));
+    EXPECT_EQ(dib.picture.count(RGB(0, 0, 0)), 104 * 52);
+}
+
 class ClipboardFaults : public GraphTest {
 protected:
     ClipboardFaults() {
         PutText(L"before");
         create(101, 50);
-        spy.watchAll({"LocalAlloc", "LocalFree", "GlobalAlloc", "GlobalFree", "CreateDIBSection",
-                      "OpenClipboard", "EmptyClipboard", "SetClipboardData", "CloseClipboard",
-                      "SetLastError"});
+        spy.watchAll({"LocalAlloc", "LocalFree", "GlobalAlloc", "GlobalLock", "GlobalFree",
+                      "CreateDIBSection", "OpenClipboard", "EmptyClipboard", "SetClipboardData",
+                      "CloseClipboard", "SetLastError"});
         spy.clearCalls();
     }
 
@@ -25,16 +35,6 @@ protected:
         EXPECT_EQ(spy.count("EmptyClipboard"), 1);
         EXPECT_EQ(spy.count("CloseClipboard"), 1);
         EXPECT_EQ(ClipboardText(), L"");
-    }
-
-    // A black picture of the right size with its head.
-    static void expectBlackDib() {
-        const ColourDib dib = ParseDib(ReadClipboard());
-        EXPECT_EQ(dib.header.biWidth, 104);
-        EXPECT_EQ(dib.header.biHeight, 52);
-        ASSERT_EQ(dib.colours.size(), 19u);
-        EXPECT_EQ(dib.colours[1], RGB(255, 255, 255));
-        EXPECT_EQ(dib.picture.count(RGB(0, 0, 0)), 104 * 52);
     }
 
     ClipboardTurn turn;
@@ -57,16 +57,26 @@ TEST_F(ClipboardFaults, WithoutMemoryForTheMovableBlockToo) {
     expectNullDib();
 }
 
+TEST_F(ClipboardFaults, ABlockThatCannotBeWrittenIsFreed) {
+    spy.failNth("GlobalLock", 1);
+    EXPECT_EQ(send(GM_COPY), 0);
+    ASSERT_EQ(spy.count("GlobalFree"), 1);
+    EXPECT_EQ(spy.callsOf("GlobalFree").at(0).arguments.at(0),
+              spy.callsOf("GlobalAlloc").at(0).result);
+    EXPECT_EQ(spy.count("LocalFree"), 1);
+    expectNullDib();
+}
+
 TEST_F(ClipboardFaults, WithoutASectionTheBitmapIsBlack) {
     spy.failNth("CreateDIBSection", 1);
     EXPECT_EQ(send(GM_COPY), 0);
-    expectBlackDib();
+    ExpectBlackDib();
 }
 
 TEST_F(ClipboardFaults, WithoutADcTheBitmapIsBlack) {
     spy.failNth("CreateCompatibleDC", 1);
     EXPECT_EQ(send(GM_COPY), 0);
-    expectBlackDib();
+    ExpectBlackDib();
 }
 
 TEST_F(ClipboardFaults, ABlockThatIsNotTakenIsFreed) {
@@ -106,6 +116,36 @@ TEST_F(ClipboardFaults, EveryHandleIsGivenBack) {
         send(GM_COPY);
         EXPECT_EQ(UnreturnedHandles(spy), std::vector<std::string>{}) << failing;
     }
+}
+
+// ---- Charts that could not be finished --------------------------------------------------------
+
+class ClipboardOfAnUnfinishedChart : public GuardedGraphTest {
+protected:
+    void createUnfinished(HWND parent, DWORD style) {
+        RegisterGraphClass();
+        graph = CreateGraphWindow(parent, style, {0, 0, 101, 50}, GetModuleHandleW(nullptr));
+        ASSERT_NE(graph, nullptr);
+    }
+
+    ClipboardTurn turn;
+};
+
+TEST_F(ClipboardOfAnUnfinishedChart, WithoutAParentIsAHeadAlone) {
+    PutText(L"before");
+    createUnfinished(nullptr, WS_POPUP);
+    EXPECT_EQ(send(GM_COPY), 0);
+    const Bytes bytes = ReadClipboard();
+    EXPECT_EQ(bytes.size(), 116u);
+    EXPECT_EQ(ParseDib(bytes).header.biHeight, 0) << "it does not know its window";
+    DestroyWindow(graph);
+}
+
+TEST_F(ClipboardOfAnUnfinishedChart, WithoutAnImageIsBlack) {
+    spy.failNth("CreateCompatibleDC", 1);
+    createUnfinished(host.window(), WS_CHILD | WS_VISIBLE);
+    EXPECT_EQ(send(GM_COPY), 0);
+    ExpectBlackDib();
 }
 
 class GuardedClipboard : public GuardedGraphTest {

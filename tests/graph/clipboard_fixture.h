@@ -16,8 +16,10 @@ Bytes ReadClipboard();
 // The same, read by another process.
 Bytes ReadClipboardElsewhere();
 
-// Puts a text on the clipboard, or checks that it is there still.
+// Empties the clipboard and puts a text on it.
 void PutText(const std::wstring& text);
+
+// The text on the clipboard; empty when there is none.
 std::wstring ClipboardText();
 
 // There is one clipboard for all tests that run at the same time, each a process of its own: while

@@ -1,9 +1,8 @@
 // Another program at the clipboard.
 //
 //   clipboard_partner read FILE        writes the CF_DIB on the clipboard to a file
-//   clipboard_partner hold EVENT END   opens the clipboard, sets the first event, and closes it
-//   when
-//                                      the second is set
+//   clipboard_partner hold EVENT END   opens the clipboard, sets the first event,
+//                                      and closes it when the second is set
 //
 // Exit status 0, or 1 when that was not possible.
 #include <windows.h>

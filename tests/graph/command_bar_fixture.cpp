@@ -15,7 +15,7 @@ const char* NameOf(UINT message) {
 
 }  // namespace
 
-std::vector<TBBUTTON> TwoButtons() {
+std::vector<TBBUTTON> HostButtons() {
     TBBUTTON show{}, space{}, properties{};
     show.idCommand = kShowCommand;
     show.fsState = properties.fsState = TBSTATE_ENABLED;

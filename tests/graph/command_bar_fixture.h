@@ -15,8 +15,8 @@ constexpr int kPropertiesCommand = 502;
 constexpr UINT kZoomComboId = 503;
 constexpr UINT kTypeComboId = 504;
 
-// Three buttons, the middle one a plain separator.
-std::vector<TBBUTTON> TwoButtons();
+// Two buttons with a plain separator between them.
+std::vector<TBBUTTON> HostButtons();
 
 // A toolbar without any procedure but its own, ready for buttons.
 HWND CreatePlainToolbar(HWND parent);
@@ -27,7 +27,7 @@ protected:
     void createBar() { bar = command_bar::Create(host.window(), GetModuleHandleW(nullptr), 500); }
 
     // Fills the bar; the combo boxes go to `zoom` and `type`.
-    DWORD setUp(const std::vector<TBBUTTON>& buttons = TwoButtons());
+    DWORD setUp(const std::vector<TBBUTTON>& buttons = HostButtons());
 
     // From now on the library's messages to the bar are written down: "TB_ADDBITMAP 3".
     void watchMessages();

@@ -151,7 +151,7 @@ TEST_F(CommandBarSetup, AnotherBarIsIndependent) {
 TEST_F(CommandBarSetup, ANullBarIsRefused) {
     createBar();
     zoom = type = host.window();
-    const TBBUTTON button = TwoButtons()[0];
+    const TBBUTTON button = HostButtons()[0];
     EXPECT_EQ(SetupGraphCommandBar(GetModuleHandleW(nullptr), nullptr, &button, 1, &zoom,
                                    kZoomComboId, &type, kTypeComboId),
               0u);
@@ -160,7 +160,7 @@ TEST_F(CommandBarSetup, ANullBarIsRefused) {
 }
 
 TEST_F(CommandBarSetup, NobodyNeedsToHearOfTheCombos) {
-    const TBBUTTON button = TwoButtons()[0];
+    const TBBUTTON button = HostButtons()[0];
     EXPECT_EQ(SetupGraphCommandBar(GetModuleHandleW(nullptr), bar, &button, 1, nullptr,
                                    kZoomComboId, nullptr, kTypeComboId),
               1u);
@@ -170,7 +170,7 @@ TEST_F(CommandBarSetup, NobodyNeedsToHearOfTheCombos) {
 }
 
 TEST_F(CommandBarSetup, WithoutButtonsTheCombosStandFirst) {
-    const TBBUTTON button = TwoButtons()[0];
+    const TBBUTTON button = HostButtons()[0];
     const struct {
         const TBBUTTON* buttons;
         LONG count;

@@ -14,11 +14,17 @@ protected:
         std::vector<std::wstring> atOnce;
     };
 
-    void createOwnBar() {
+    // A toolbar that answers the message and has not said so yet.
+    void createSilentBar() {
         bar = CreatePlainToolbar(host.window());
         SetPropW(bar, kProperty, this);
         toolbarProc_ = reinterpret_cast<WNDPROC>(
             SetWindowLongPtrW(bar, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(&barProc)));
+    }
+
+    void createOwnBar() {
+        createSilentBar();
+        SetPropW(bar, kAsksForTexts, bar);
     }
 
     Handed handed;
@@ -26,12 +32,16 @@ protected:
 
 private:
     static constexpr wchar_t kProperty[] = L"tooltip test";
+    static constexpr wchar_t kAsksForTexts[] = L"korcontrols tooltips";
 
     static LRESULT CALLBACK barProc(HWND window, UINT message, WPARAM wParam, LPARAM lParam) {
         auto* test = static_cast<CommandBarToolTips*>(GetPropW(window, kProperty));
         const WNDPROC original = test->toolbarProc_;
         if (message == kSetToolTips) return test->take(wParam, lParam);
-        if (message == WM_NCDESTROY) RemovePropW(window, kProperty);
+        if (message == WM_NCDESTROY) {
+            RemovePropW(window, kProperty);
+            RemovePropW(window, kAsksForTexts);
+        }
         return CallWindowProcW(original, window, message, wParam, lParam);
     }
 
@@ -104,11 +114,35 @@ TEST_F(CommandBarToolTips, APlainToolbarIsSpared) {
     EXPECT_GE(PlaceIn(bar, type).left, PlaceIn(bar, zoom).right);
 }
 
+// It may have been subclassed for anything, and pass the message on.
+TEST_F(CommandBarToolTips, AToolbarWithAnotherProcedureIsSparedToo) {
+    createSilentBar();
+    watchMessages();
+    EXPECT_EQ(setUp(), 1u);
+    EXPECT_EQ(times, 0);
+    EXPECT_EQ(messages.back(), "TB_INSERTBUTTON 3");
+}
+
 TEST_F(CommandBarToolTips, AWindowOfAnotherClassIsTold) {
     bar = host.window();
     watchMessages();
     EXPECT_EQ(setUp(), 1u);
     EXPECT_EQ(messages.back(), "tooltips 5");
+}
+
+TEST_F(CommandBarToolTips, AreLoadedIntoEightyCharacters) {
+    createOwnBar();
+    create();
+    ShowWindow(graph, SW_HIDE);
+    spy.watch("LoadStringW");
+    setUp();
+    ShowWindow(graph, SW_SHOW);
+    std::vector<DWORD> ids;
+    for (const ImportCall& call : spy.callsOf("LoadStringW")) {
+        ids.push_back(NumberAt(call, 1));
+        EXPECT_EQ(NumberAt(call, 3), 80u) << ids.back();
+    }
+    EXPECT_EQ(ids, (std::vector<DWORD>{1, 2, 3, 4, 5, 10}));
 }
 
 TEST_F(CommandBarToolTips, WithoutStringsTheTextsAreEmpty) {
@@ -170,7 +204,7 @@ TEST_F(CommandBarOfAHost, ReadsTheFirstTextAnew) {
 }
 
 TEST_F(CommandBarOfAHost, HasNoTextBeyondTheArray) {
-    std::vector<TBBUTTON> more(6, TwoButtons()[0]);
+    std::vector<TBBUTTON> more(6, HostButtons()[0]);
     for (size_t i = 0; i < more.size(); ++i) more[i].idCommand = 600 + static_cast<int>(i);
     createBar();
     setUp(more);

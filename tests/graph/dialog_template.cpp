@@ -41,6 +41,7 @@ private:
 };
 
 std::wstring ClassName(const std::wstring& stored) {
+    if (stored == L"\x80") return L"BUTTON";
     if (stored == L"\x81") return L"EDIT";
     if (stored == L"\x82") return L"STATIC";
     if (stored == L"\x85") return L"COMBOBOX";

@@ -14,6 +14,11 @@ protected:
         settle();
         transcript.clear();
     }
+
+    // Those that say that nothing was taken.
+    static bool takesData(UINT message) {
+        return message == GM_ADDSERIES || message == GM_SETCATEGORIES;
+    }
 };
 
 TEST_F(PrintInterruption, SecondPrintInsideTheDialogIsRefused) {
@@ -54,7 +59,7 @@ TEST_F(PrintInterruption, MessagesCannotReachARecordThatStandsForThePage) {
     const Picture before = image();
     inside[kEndPage] = [this] {
         for (UINT message = GM_ADDSERIES; message <= WM_USER + 6030; ++message)
-            EXPECT_EQ(send(message), 0) << message;
+            EXPECT_EQ(send(message), takesData(message) ? 1 : 0) << message;
         for (UINT code = GN_RESET; code <= GN_CLEAR; ++code) notify(code);
         PressAt(graph, 2, 60);
         ReleaseAt(graph, 2, 60);
@@ -66,6 +71,62 @@ TEST_F(PrintInterruption, MessagesCannotReachARecordThatStandsForThePage) {
     EXPECT_TRUE(SamePicture(before, image()));
     EXPECT_EQ(KorGraph_GetType(graph), KORGRAPH_LINE);
 }
+
+TEST_F(PrintInterruption, DataThatComesOnThePageIsRefused) {
+    createWithData();
+    inside[kEndPage] = [this] {
+        EXPECT_EQ(add({4, 4, 4, 4}, L"rye"), 1);
+        EXPECT_EQ(categories({L"a", L"b"}), 1);
+    };
+    print();
+    EXPECT_EQ(record().seriesCount, 1);
+    EXPECT_EQ(record().categoryCount, 0);
+}
+
+TEST_F(PrintInterruption, PaintThatComesOnThePageIsMadeUpFor) {
+    createWithData();
+    const Picture before = ReadWindow(graph);
+    inside[kEndPage] = [this] {
+        EXPECT_TRUE(GetUpdateRect(graph, nullptr, FALSE));
+        const HDC dc = GetDC(graph);
+        PatBlt(dc, 0, 0, 230, 130, BLACKNESS);  // what a menu over the window may leave
+        ReleaseDC(graph, dc);
+        UpdateWindow(graph);
+        EXPECT_FALSE(GetUpdateRect(graph, nullptr, FALSE));
+    };
+    print();
+    RECT waiting{};
+    EXPECT_TRUE(GetUpdateRect(graph, &waiting, FALSE));
+    EXPECT_EQ(waiting, ClientOf(graph));
+    UpdateWindow(graph);
+    EXPECT_TRUE(SamePicture(before, ReadWindow(graph)));
+    UpdateWindow(graph);
+    watchInvalidations();
+    inside[kEndPage] = nullptr;
+    print();
+    EXPECT_EQ(invalidationsOf(graph).size(), 1u) << "the next print has missed nothing";
+}
+
+class PrintWithResize : public PrintInterruption, public ::testing::WithParamInterface<bool> {};
+
+TEST_P(PrintWithResize, OnThePageIsFollowed) {
+    createWithData();
+    inside[kEndPage] = [this] {
+        resize(120, 90);
+        if (GetParam()) UpdateWindow(graph);
+    };
+    print();
+    EXPECT_EQ(record().rcPlot, (RECT{0, 0, 120, 90}));
+    EXPECT_EQ(bitmapSize().cx, 120);
+    EXPECT_EQ(bitmapSize().cy, 92);
+    EXPECT_TRUE(GetUpdateRect(graph, nullptr, FALSE));
+    const Picture followed = image();
+    resize(60, 50);
+    resize(120, 90);
+    EXPECT_TRUE(SamePicture(image(), followed));
+}
+
+INSTANTIATE_TEST_SUITE_P(Painted, PrintWithResize, ::testing::Bool());
 
 // ---- The window goes --------------------------------------------------------------------------
 

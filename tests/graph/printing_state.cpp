@@ -150,6 +150,24 @@ TEST_F(PrintState, ClipRegionIsTheScreensAgain) {
     EXPECT_EQ(box, (RECT{0, 0, 231, 131})) << "cut to the bitmap, which is a little larger";
 }
 
+TEST_F(PrintState, ClipRegionIsThePagesMeanwhile) {
+    createFull();
+    KorGraph_SetType(graph, 9);  // draws nothing, so nothing else sets the clip
+    inside[kStartPage] = [this] {
+        const HRGN corner = CreateRectRgn(10, 10, 20, 20);
+        SelectClipRgn(page, corner);
+        DeleteObject(corner);
+    };
+    RECT region{}, clip{};
+    inside[kEndPage] = [&] {
+        GetRgnBox(record().hrgnClip, &region);
+        GetClipBox(page, &clip);
+    };
+    print();
+    EXPECT_EQ(region, (RECT{0, 0, 901, 1201}));
+    EXPECT_EQ(clip, (RECT{0, 0, 900, 1200})) << "cut to the paper";
+}
+
 TEST_F(PrintState, PanArrowsAreHitWhereTheyAre) {
     createFull();
     pan();

@@ -1,6 +1,9 @@
 // The page of ranges, type and zoom.
 #include "graph/properties_fixture.h"
 
+#include <commctrl.h>
+#include <prsht.h>
+
 namespace kortest {
 namespace {
 
@@ -115,6 +118,29 @@ TEST_F(RangeEdits, TheBoxIsTheChartsOwn) {
     ASSERT_EQ(calls.size(), 1u);
     EXPECT_EQ(reinterpret_cast<HWND>(calls[0].arguments[0]), graph);
     EXPECT_EQ(NumberAt(calls[0], 3), static_cast<DWORD>(MB_OK));
+}
+
+// The dead page's combo boxes would answer 0, the first type and the first zoom.
+TEST_F(RangeEdits, APageThatGoesWhileTheBoxIsOpenAppliesNoMore) {
+    openSheet([](HWND sheet) {
+        Choose(ShowPage(sheet, kDataPage), kZoomCombo, KORGRAPH_ZOOM50);
+        PressOk(sheet);
+    });
+    sent.clear();
+    spy.watch("MessageBoxW");
+    openSheet([this](HWND sheet) {
+        const HWND page = ShowPage(sheet, kDataPage);
+        spy.replace("MessageBoxW", [page](ULONG_PTR*) -> ULONG_PTR {
+            DestroyWindow(page);
+            return IDOK;
+        });
+        TypeInto(page, kXMaxEdit, L"-1");
+        NMHDR apply = {sheet, 0, static_cast<UINT>(PSN_APPLY)};
+        SendMessageW(page, WM_NOTIFY, 0, reinterpret_cast<LPARAM>(&apply));
+        EXPECT_FALSE(IsWindow(page));
+    });
+    EXPECT_EQ(spy.count("MessageBoxW"), 1);
+    EXPECT_EQ(sent, Lines{});
 }
 
 TEST_F(RangeEdits, EqualEndsShowOneUnit) {

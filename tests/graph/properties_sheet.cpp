@@ -137,6 +137,42 @@ TEST_F(PropertiesSheet, IsDescribedToThePlatformAsItShould) {
     EXPECT_EQ(descriptions, (std::vector<std::wstring>{L"Titles", L"3000", L"Ranges", L"3001"}));
 }
 
+TEST_F(PropertiesSheet, IsMovedInItsOwnSize) {
+    RECT before{};
+    int width = 0, height = 0;
+    spy.watch("MoveWindow");
+    spy.replace("MoveWindow", [&](ULONG_PTR* arguments) {
+        GetWindowRect(reinterpret_cast<HWND>(arguments[0]), &before);
+        width = static_cast<int>(arguments[3]);
+        height = static_cast<int>(arguments[4]);
+        return spy.callReal("MoveWindow", arguments);
+    });
+    openSheet([](HWND) {});
+    EXPECT_GT(before.right - before.left, 100);
+    EXPECT_EQ(width, before.right - before.left);
+    EXPECT_EQ(height, before.bottom - before.top);
+}
+
+TEST_F(PropertiesSheet, PagesKeepTheirChart) {
+    openSheet([this](HWND sheet) {
+        for (const int page : {kTitlesPage, kDataPage}) {
+            const LONG_PTR kept = GetWindowLongPtrW(ShowPage(sheet, page), GWLP_USERDATA);
+            EXPECT_EQ(reinterpret_cast<HWND>(kept), graph) << page;
+        }
+    });
+}
+
+TEST_F(PropertiesSheet, HandsTheFocusToTheTypeAndThenToTheZoom) {
+    std::vector<int> focused;
+    spy.watch("SetFocus");
+    spy.replace("SetFocus", [&](ULONG_PTR* arguments) {
+        focused.push_back(GetDlgCtrlID(reinterpret_cast<HWND>(arguments[0])));
+        return spy.callReal("SetFocus", arguments);
+    });
+    openSheet([](HWND sheet) { ShowPage(sheet, kDataPage); });
+    EXPECT_EQ(focused, (std::vector<int>{kTypeCombo, kZoomCombo}));
+}
+
 TEST_F(PropertiesSheet, HandsTheFocusToTheZoom) {
     openSheet([](HWND sheet) {
         const HWND page = ShowPage(sheet, kDataPage);
@@ -213,6 +249,22 @@ TEST_F(PropertiesFailures, ASheetThatDoesNotOpenChangesNothing) {
     spy.watch("PropertySheetW");
     spy.failNth("PropertySheetW", 1, static_cast<ULONG_PTR>(-1));
     EXPECT_EQ(notify(GN_PROPERTIES), 0);
+    EXPECT_EQ(sent, Lines{});
+}
+
+TEST_F(PropertiesFailures, WithoutADcTheSheetStaysWhereItIs) {
+    spy.watchAll({"GetDC", "MoveWindow"});
+    spy.failAlways("GetDC");
+    openSheet([](HWND sheet) { EXPECT_EQ(TextOf(sheet), L"Graph Properties"); });
+    EXPECT_GT(spy.count("GetDC"), 0);
+    EXPECT_EQ(spy.count("MoveWindow"), 0);
+}
+
+TEST_F(PropertiesFailures, ANotificationOfNothingAppliesNothing) {
+    openSheet([](HWND sheet) {
+        for (const int page : {kTitlesPage, kDataPage})
+            EXPECT_EQ(SendMessageW(ShowPage(sheet, page), WM_NOTIFY, 0, 0), 0) << page;
+    });
     EXPECT_EQ(sent, Lines{});
 }
 

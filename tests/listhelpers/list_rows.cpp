@@ -48,6 +48,19 @@ TEST_F(ListRows, AreDeletedFromTheLastToTheFirst) {
     EXPECT_EQ(sent[3].wParam, 0u);
 }
 
+TEST_F(ListRows, GiveTheAnswerToTheLastDeletion) {
+    fill({L"a", L"b"});
+    watchMessages();
+    for (const LRESULT last : {7, 0}) {
+        answer = [last](const SentMessage& message, LRESULT* result) {
+            if (message.message != LVM_DELETEITEM) return false;
+            *result = message.wParam == 0 ? last : 5;
+            return true;
+        };
+        EXPECT_EQ(KorListView_DeleteAll(list, FALSE, FALSE), last);
+    }
+}
+
 TEST_F(ListRows, OfAnEmptyListAreNone) {
     watchMessages();
     EXPECT_EQ(KorListView_DeleteAll(list, FALSE, TRUE), 0);

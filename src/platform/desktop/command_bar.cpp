@@ -9,6 +9,7 @@ namespace {
 constexpr int kGapBesideCombo = 4;   // pixels between a combo box and each of its neighbours
 constexpr int kDroppedHeight = 150;  // of a combo box with its open list
 constexpr UINT kSetToolTips = WM_USER + 81;
+constexpr wchar_t kToolTipsProperty[] = L"korcontrols tooltips";
 constexpr int kClassNameCapacity = 32;
 
 int ButtonCount(HWND bar) { return static_cast<int>(SendMessageW(bar, TB_BUTTONCOUNT, 0, 0)); }
@@ -64,13 +65,10 @@ HWND CreateCombo(HWND bar, HINSTANCE instance, int width, DWORD style, UINT id) 
     return combo;
 }
 
-// A toolbar with the procedure of its class.
-bool IsPlainToolbar(HWND bar) {
+bool IsToolbar(HWND window) {
     wchar_t name[kClassNameCapacity] = {};
-    GetClassNameW(bar, name, kClassNameCapacity);
-    return lstrcmpiW(name, TOOLBARCLASSNAMEW) == 0 &&
-           static_cast<ULONG_PTR>(GetWindowLongPtrW(bar, GWLP_WNDPROC)) ==
-               GetClassLongPtrW(bar, GCLP_WNDPROC);
+    GetClassNameW(window, name, kClassNameCapacity);
+    return lstrcmpiW(name, TOOLBARCLASSNAMEW) == 0;
 }
 
 }  // namespace
@@ -96,9 +94,10 @@ HWND InsertCommandBarComboBox(HWND bar, HINSTANCE instance, int width, DWORD sty
 }
 
 // The toolbar's own procedure takes the number for TB_INSERTMARKHITTEST and the count for a pointer
-// that it reads through.
+// that it reads through. Whether a host's procedure before it keeps the message from it cannot be
+// seen, so the host says it by a window property.
 void SetCommandBarToolTips(HWND bar, int count, const wchar_t* const* texts) {
-    if (IsPlainToolbar(bar)) return;
+    if (IsToolbar(bar) && !GetPropW(bar, kToolTipsProperty)) return;
     SendMessageW(bar, kSetToolTips, static_cast<WPARAM>(count), reinterpret_cast<LPARAM>(texts));
 }
 
