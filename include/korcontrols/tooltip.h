@@ -15,11 +15,10 @@ extern "C" {
 /* What to show and where, in client coordinates of the tooltip's parent. 16 bytes on 32-bit
  * systems, 24 on 64-bit ones. */
 typedef struct ToolTipRequest {
-    LPCWSTR
-        text; /* may hold line breaks; up to 128 characters are shown whole, of longer texts 127 */
-    LONG x;   /* left edge */
-    LONG y;   /* bottom edge */
-    LONG limit; /* the right edge stays below this */
+    LPCWSTR text; /* with line breaks; of more than 128 characters 127 are shown */
+    LONG x;       /* left edge */
+    LONG y;       /* bottom edge */
+    LONG limit;   /* the right edge stays below this */
 } ToolTipRequest;
 
 /* TIPM_SHOW: sets the text, sizes and places the tooltip, and shows it.
