@@ -5,10 +5,10 @@
 #include <korcontrols/tooltip.h>
 
 #include <algorithm>
-#include <new>
 
 #include "chart_live.h"
 #include "chart_view.h"
+#include "pane_class.h"
 #include "resource.h"
 #include "workbook.h"
 
@@ -70,27 +70,6 @@ LRESULT Dispatch(Workbook& workbook, UINT message, WPARAM wParam, LPARAM lParam)
     return DefWindowProcW(workbook.chart.pane, message, wParam, lParam);
 }
 
-LRESULT CALLBACK PaneProc(HWND window, UINT message, WPARAM wParam, LPARAM lParam) noexcept {
-    auto* const workbook = reinterpret_cast<Workbook*>(GetWindowLongPtrW(window, GWLP_USERDATA));
-    if (!workbook) return DefWindowProcW(window, message, wParam, lParam);
-    try {
-        return Dispatch(*workbook, message, wParam, lParam);
-    } catch (const std::bad_alloc&) {
-        workbook->isOutOfMemory = true;
-        return 0;
-    }
-}
-
-bool RegisterPaneClass(HINSTANCE instance) {
-    WNDCLASSEXW windowClass = {};
-    windowClass.cbSize = sizeof windowClass;
-    windowClass.lpfnWndProc = PaneProc;
-    windowClass.hInstance = instance;
-    windowClass.hbrBackground = reinterpret_cast<HBRUSH>(INT_PTR{COLOR_BTNFACE + 1});
-    windowClass.lpszClassName = kPaneClass;
-    return RegisterClassExW(&windowClass) != 0;
-}
-
 void KeepInPane(HWND pane, HWND tooltip) {
     RECT place = {};
     GetWindowRect(tooltip, &place);
@@ -104,7 +83,8 @@ void KeepInPane(HWND pane, HWND tooltip) {
 }  // namespace
 
 bool CreateChartPane(Workbook& workbook) {
-    if (!RegisterGraphControl(workbook.instance) || !RegisterPaneClass(workbook.instance)) {
+    if (!RegisterGraphControl(workbook.instance) ||
+        !RegisterPaneClass(workbook.instance, kPaneClass, PaneProc<Dispatch>)) {
         return false;
     }
     Chart& chart = workbook.chart;

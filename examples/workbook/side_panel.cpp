@@ -1,10 +1,10 @@
 #include "side_panel.h"
 
 #include <algorithm>
-#include <new>
 
 #include "equation_bar.h"
 #include "file_tree.h"
+#include "pane_class.h"
 #include "resource.h"
 #include "statistics_list.h"
 #include "view_commands.h"
@@ -71,31 +71,10 @@ LRESULT Dispatch(Workbook& workbook, UINT message, WPARAM wParam, LPARAM lParam)
     return DefWindowProcW(window, message, wParam, lParam);
 }
 
-LRESULT CALLBACK PanelProc(HWND window, UINT message, WPARAM wParam, LPARAM lParam) noexcept {
-    auto* const workbook = reinterpret_cast<Workbook*>(GetWindowLongPtrW(window, GWLP_USERDATA));
-    if (!workbook) return DefWindowProcW(window, message, wParam, lParam);
-    try {
-        return Dispatch(*workbook, message, wParam, lParam);
-    } catch (const std::bad_alloc&) {
-        workbook->isOutOfMemory = true;
-        return 0;
-    }
-}
-
-bool RegisterPanelClass(HINSTANCE instance) {
-    WNDCLASSEXW windowClass = {};
-    windowClass.cbSize = sizeof windowClass;
-    windowClass.lpfnWndProc = PanelProc;
-    windowClass.hInstance = instance;
-    windowClass.hbrBackground = reinterpret_cast<HBRUSH>(INT_PTR{COLOR_BTNFACE + 1});
-    windowClass.lpszClassName = kPanelClass;
-    return RegisterClassExW(&windowClass) != 0;
-}
-
 }  // namespace
 
 bool CreateSidePanel(Workbook& workbook) {
-    if (!RegisterPanelClass(workbook.instance)) return false;
+    if (!RegisterPaneClass(workbook.instance, kPanelClass, PaneProc<Dispatch>)) return false;
     SidePanel& panel = workbook.panel;
     panel.window =
         CreateWindowExW(WS_EX_CONTROLPARENT, kPanelClass, nullptr, WS_CHILD | WS_CLIPCHILDREN, 0, 0,

@@ -3,6 +3,7 @@
 #include "graph/number_graph.h"
 
 #include "graph/graph_points.h"
+#include "support/bitmap_canvas.h"
 
 #include <cmath>
 #include <limits>
@@ -14,41 +15,15 @@ namespace {
 constexpr int kWidth = 230;
 constexpr int kHeight = 130;
 
-// A bitmap that a polyline is drawn on.
-class LineCanvas {
+class LineCanvas : public BitmapCanvas {
 public:
-    LineCanvas() : dc_(CreateCompatibleDC(nullptr)) {
-        BITMAPINFO info{};
-        info.bmiHeader.biSize = sizeof info.bmiHeader;
-        info.bmiHeader.biWidth = kWidth;
-        info.bmiHeader.biHeight = -kHeight;
-        info.bmiHeader.biPlanes = 1;
-        info.bmiHeader.biBitCount = 32;
-        void* bits = nullptr;
-        bitmap_ = CreateDIBSection(dc_, &info, DIB_RGB_COLORS, &bits, nullptr, 0);
-        pixels_ = static_cast<const uint32_t*>(bits);
-        blank_ = SelectObject(dc_, bitmap_);
-    }
-    ~LineCanvas() {
-        SelectObject(dc_, blank_);
-        DeleteObject(bitmap_);
-        DeleteDC(dc_);
-    }
-    LineCanvas(const LineCanvas&) = delete;
-    LineCanvas& operator=(const LineCanvas&) = delete;
+    LineCanvas() : BitmapCanvas(kWidth, kHeight) {}
 
     std::vector<uint32_t> Draw(const POINT* points, int count) const {
-        PatBlt(dc_, 0, 0, kWidth, kHeight, WHITENESS);
-        Polyline(dc_, points, count);
-        GdiFlush();
-        return {pixels_, pixels_ + kWidth * kHeight};
+        clear();
+        Polyline(dc(), points, count);
+        return pixels();
     }
-
-private:
-    HDC dc_;
-    HBITMAP bitmap_ = nullptr;
-    HGDIOBJ blank_ = nullptr;
-    const uint32_t* pixels_ = nullptr;
 };
 
 class GraphPolyline : public NumberGraph {

@@ -33,15 +33,15 @@ public:
     void Draw(HFONT font, const kor::NumberWidths& widths, const std::wstring& text, RECT area,
               UINT format) {
         for (Canvas* canvas : {&literal_, &run_}) {
-            canvas->Clear();
+            canvas->clear();
             SetTextColor(canvas->dc(), RGB(10, 60, 200));
             SetBkColor(canvas->dc(), RGB(250, 240, 200));
             SelectObject(canvas->dc(), font);
         }
         kor::DrawNumberText(run_.dc(), widths, text.c_str(), area, format);
         DrawTextW(literal_.dc(), text.c_str(), -1, &area, format);
-        expected = literal_.Pixels();
-        actual = run_.Pixels();
+        expected = literal_.pixels();
+        actual = run_.pixels();
         for (Canvas* canvas : {&literal_, &run_}) {
             SelectObject(canvas->dc(), GetStockObject(SYSTEM_FONT));
         }

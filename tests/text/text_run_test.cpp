@@ -57,7 +57,7 @@ TEST(TextRun, DrawsThePixelsOfDrawText) {
         const RECT area = RandomArea(random);
         HFONT font = RandomFont(random);
         for (Canvas* canvas : {&literal, &run}) {
-            canvas->Clear();
+            canvas->clear();
             SelectObject(canvas->dc(), font);
             SetTextColor(canvas->dc(), RGB(10, 60, 200));
             SetBkColor(canvas->dc(), RGB(250, 240, 200));
@@ -65,8 +65,8 @@ TEST(TextRun, DrawsThePixelsOfDrawText) {
         RECT copy = area;
         DrawTextW(literal.dc(), text.c_str(), -1, &copy, format);
         kor::TextRun(run.dc(), text.c_str()).Draw(area, format);
-        const auto expected = literal.Pixels();
-        ASSERT_EQ(run.Pixels(), expected) << "picture " << i << ", format " << format;
+        const auto expected = literal.pixels();
+        ASSERT_EQ(run.pixels(), expected) << "picture " << i << ", format " << format;
         drawn += expected != std::vector<uint32_t>(kWidth * kHeight, expected[0]);
         for (Canvas* canvas : {&literal, &run}) {
             SelectObject(canvas->dc(), GetStockObject(SYSTEM_FONT));
