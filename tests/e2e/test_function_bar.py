@@ -21,10 +21,10 @@ def running_host(desktop, probe, programs):
 
 
 def shown(desktop, probe, view):
-    """The host's window if it shows a view: the view's colour fills it below the bar."""
+    """The host's window if it is laid out and shows a view: its colour fills it below the bar."""
     window = next((w for w in probe.windows() if w.text == "Function bar"), None)
     bar = window and window.find(BAR)
-    if not bar:
+    if not bar or bar.rect[1] == bar.rect[3]:
         return None
     _, _, right, bottom = window.client
     return window if desktop.picture().pixel(right - 5, bottom - 5) == COLOURS[view] else None
