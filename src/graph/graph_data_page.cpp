@@ -91,13 +91,7 @@ void Apply(HWND page) {
 }  // namespace
 
 INT_PTR CALLBACK DataPageProc(HWND page, UINT message, WPARAM, LPARAM lParam) {
-    switch (message) {
-    case WM_INITDIALOG: InitialisePage(page, lParam); return TRUE;
-    case WM_NOTIFY:
-        if (IsApply(lParam)) Apply(page);
-        return 0;
-    default: return FALSE;
-    }
+    return AnswerPage({InitialisePage, Apply}, page, message, lParam);
 }
 
 }  // namespace kor

@@ -52,6 +52,12 @@ void RunSheet(HWND graph, HPROPSHEETPAGE (&pages)[2]) {
     HideInputPanel();
 }
 
+// Whether a WM_NOTIFY tells the page to apply what was typed.
+bool IsApply(LPARAM notification) {
+    const auto* header = reinterpret_cast<const NMHDR*>(notification);
+    return header && header->code == PSN_APPLY;
+}
+
 }  // namespace
 
 void RunGraphProperties(HWND graph) {
@@ -81,9 +87,14 @@ HWND GraphOfPage(HWND page) {
     return reinterpret_cast<HWND>(GetWindowLongPtrW(page, GWLP_USERDATA));
 }
 
-bool IsApply(LPARAM notification) {
-    const auto* header = reinterpret_cast<const NMHDR*>(notification);
-    return header && header->code == PSN_APPLY;
+INT_PTR AnswerPage(const PageActions& actions, HWND page, UINT message, LPARAM lParam) {
+    switch (message) {
+    case WM_INITDIALOG: actions.initialise(page, lParam); return TRUE;
+    case WM_NOTIFY:
+        if (IsApply(lParam)) actions.apply(page);
+        return 0;
+    default: return FALSE;
+    }
 }
 
 double GraphXMin(HWND graph) { return RangeOf(graph, KORGRAPH_X).min; }

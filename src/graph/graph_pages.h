@@ -21,8 +21,14 @@ bool IsEdited(HWND page, int editId);
 HWND TakeGraphOfPage(HWND page, LPARAM parameter);
 HWND GraphOfPage(HWND page);
 
-// Whether a WM_NOTIFY tells the page to apply what was typed.
-bool IsApply(LPARAM notification);
+// What a page does with its two messages.
+struct PageActions {
+    void (*initialise)(HWND page, LPARAM parameter);
+    void (*apply)(HWND page);
+};
+
+// The dialog procedure of every page.
+INT_PTR AnswerPage(const PageActions& actions, HWND page, UINT message, LPARAM lParam);
 
 // What the chart shows, from its messages; 0.0 from a window that does not answer them.
 double GraphXMin(HWND graph);

@@ -133,6 +133,17 @@ std::vector<Invalidation> GraphTest::invalidationsOf(HWND window) const {
     return found;
 }
 
+RECT GraphTest::onlyInvalidation() const {
+    const auto calls = invalidationsOf(graph);
+    if (calls.size() != 1) {
+        ADD_FAILURE() << calls.size() << " invalidations";
+        return {};
+    }
+    EXPECT_FALSE(calls[0].isWhole);
+    EXPECT_FALSE(calls[0].erases);
+    return calls[0].area;
+}
+
 std::vector<std::wstring> GraphTest::textsOf(const std::function<void()>& action) {
     std::vector<std::wstring> texts;
     const auto keep = [&](ULONG_PTR text, ULONG_PTR length) {

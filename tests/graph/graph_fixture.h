@@ -93,6 +93,9 @@ protected:
     void watchInvalidations();
     std::vector<Invalidation> invalidationsOf(HWND window) const;
 
+    // The area of the only one that the chart had since the list was cleared: a part, not erased.
+    RECT onlyInvalidation() const;
+
     // The texts that the library draws meanwhile, in order; measuring is left out.
     std::vector<std::wstring> textsOf(const std::function<void()>& action);
 

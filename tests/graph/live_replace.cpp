@@ -23,14 +23,7 @@ protected:
         const GraphSeriesData data = {static_cast<LONG>(values.size()), nullptr, values.data(),
                                       series};
         EXPECT_EQ(notify(GN_LIVEUPDATE, reinterpret_cast<LPARAM>(&data)), 0);
-        const auto calls = invalidationsOf(graph);
-        if (calls.size() != 1) {
-            ADD_FAILURE() << calls.size() << " invalidations";
-            return {};
-        }
-        EXPECT_FALSE(calls[0].isWhole);
-        EXPECT_FALSE(calls[0].erases);
-        return calls[0].area;
+        return onlyInvalidation();
     }
 };
 

@@ -24,14 +24,7 @@ protected:
     RECT step(LPARAM sample) {
         invalidations.clear();
         EXPECT_EQ(notify(GN_LIVEUPDATE, sample), 0);
-        const auto calls = invalidationsOf(graph);
-        if (calls.size() != 1) {
-            ADD_FAILURE() << calls.size() << " invalidations";
-            return {};
-        }
-        EXPECT_FALSE(calls[0].isWhole);
-        EXPECT_FALSE(calls[0].erases);
-        return calls[0].area;
+        return onlyInvalidation();
     }
 };
 
