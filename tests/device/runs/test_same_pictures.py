@@ -3,11 +3,12 @@
 import itertools
 import pathlib
 
+from desktop import wait_until
 from tour import opened, steps
 
 ROOT = pathlib.Path(__file__).resolve().parents[3]
 SUNSPOTS = ROOT / "examples" / "workbook" / "data" / "sunspots.csv"
-PICTURES = 9
+PICTURES = 12
 
 
 def pictures(programs):
@@ -15,8 +16,21 @@ def pictures(programs):
     seen = {}
     with opened(programs, SUNSPOTS) as workbook:
         for step in steps(workbook, SUNSPOTS):
-            seen[step] = workbook.settle().crop(workbook.view().main.rect)
+            seen[step] = picture(workbook)
     return seen
+
+
+def picture(workbook):
+    """What its window shows, with the text caret where there is one (it blinks)."""
+    window = workbook.view().main.rect
+    shown = workbook.settle().crop(window)
+    if workbook.view().mode == "Ready":
+        return shown
+    blinked = wait_until(
+        lambda: [other for other in [workbook.desktop.picture().crop(window)] if other != shown],
+        "the caret blinks",
+    )[0]
+    return min(shown, blinked, key=lambda phase: sum(phase.pixels))
 
 
 def test_the_tour_shows_the_same(desktop_programs, device_programs, tmp_path):
