@@ -47,7 +47,10 @@ typedef struct GridSelection {
 
 #define KORGRID_PAIR(low, high) ((DWORD)(WORD)(low) | (DWORD)(WORD)(high) << 16)
 
-/* The visible cells, ends exclusive. A partly visible last column or row counts. 8 bytes. */
+/* The visible cells, ends exclusive. A partly visible last column or row counts. After a horizontal
+ * scroll, SetFirstVisibleCell or a column's resizing, columns are counted over the whole client
+ * width, as if the row header were not there, so that the last one, or more if they are narrow, may
+ * lie outside the window; WM_SIZE and GRIDM_REDRAW count over the cells alone. 8 bytes. */
 typedef struct GridVisibleRange {
     WORD firstColumn;
     WORD endColumn;
@@ -74,7 +77,8 @@ typedef struct GridCellPair {
 #define GRIDN_PAINTCELLS 3425
 
 /* WM_NOTIFY: the left button was pressed. lParam: const GridCellPair*, the cell under the pointer.
- */
+ * Beyond the last visible column or row the answer is 0; but up to one default size past the last
+ * column or row of the sheet it is KORGRID_COLUMNS or KORGRID_ROWS, so check before indexing. */
 #define GRIDN_CELLCLICKED 3427
 
 /* WM_NOTIFY: a column's, or row's, border was dragged and let go.
@@ -186,8 +190,8 @@ DWORD KORCONTROLS_API ToggleGridLines(void);
 /* Sets a size in pixels at the current zoom (the low 16 bits count). Repaints nothing.
  *   column, row  counted from the first visible one
  *   result       1; 0 when there was no memory or the column or row lies outside the sheet
- * A size larger than the cell area is cut to the area less 10 (never below 0); before the grid has
- * a window nothing is cut. */
+ * The size in units is compared with the cell area in pixels, at any zoom: a larger one becomes the
+ * area less 10, in units (never below 0). Without a client area nothing is cut. */
 DWORD KORCONTROLS_API SetColumnWidth(LONG column, LONG width);
 DWORD KORCONTROLS_API SetRowHeight(LONG row, LONG height);
 
@@ -225,7 +229,8 @@ void KORCONTROLS_API GetVisibleRange(GridVisibleRange* range);
 DWORD KORCONTROLS_API GetNumberOfVisibleColumns(void);
 DWORD KORCONTROLS_API GetNumberOfVisibleRows(void);
 
-/* Whether a cell is in the visible range, or whole inside the client area.
+/* Whether a cell is in the visible range, or whole inside the client area. Only cells of the last
+ * visible column and row are measured; all others count as whole.
  *   result  1 or 0 */
 DWORD KORCONTROLS_API IsIndexVisible(CellIndex cell);
 DWORD KORCONTROLS_API IsIndexCompletelyVisible(CellIndex cell);
@@ -256,7 +261,8 @@ HWND KORCONTROLS_API GetControlWithFocus(void);
 /* Sets the WM_COMMAND number that a press on "fx" posts to the parent. */
 void KORCONTROLS_API SetFunctionButtonMessageID(DWORD id);
 
-/* Commits the equation bar as a click on "OK" does.
+/* Commits the equation bar. The current cell stays, unlike after a click on "OK", which then moves
+ * it down.
  *   result  0, or 1 when nothing had been typed */
 LONG KORCONTROLS_API PressOKButton(void);
 

@@ -81,8 +81,9 @@ typedef struct HeaderItemDesc {
  *   result  pixels along the strip, or -1 for a bad index or a strip without a record */
 #define HCM_GETITEMSIZE (WM_USER + 7)
 
-/* HCN_ITEMCLICK (posted to the parent): an item was pressed, or the pointer moved onto another one
- * with the button still down.
+/* HCN_ITEMCLICK (posted to the parent): an item was pressed, or the pointer moved, with the button
+ * still down, onto an item that was not the last one to be reported so. The first move within the
+ * pressed item therefore reports it a second time, as a rule.
  *   wParam  the strip's window handle
  *   lParam  low word: item where the press began; high word: item under the pointer */
 #define HCN_ITEMCLICK (WM_USER + 587)

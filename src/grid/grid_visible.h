@@ -10,7 +10,8 @@ GridVisibleRange VisibleRange();
 // Whether a column and row lie in the visible range, a partly visible last one included.
 bool IsCellVisible(int column, int row);
 
-// Whether the cell lies whole inside the client area.
+// Whether the cell lies whole inside the client area. Only cells of the last visible column and
+// row are measured.
 bool IsCellCompletelyVisible(int column, int row);
 
 // A cell's box in client coordinates: right and bottom are the next cells' left and top. The cell

@@ -68,7 +68,7 @@ void EndResize(const HeaderRecord& header) {
     ReleaseCapture();
     if (!HasItem(header, resized)) return;
     const auto item = static_cast<uint32_t>(resized);
-    PostToParent(header, HCN_ITEMRESIZED, resized, UnitsFromPixels(header.sizes[item], zoomLevel));
+    PostToParent(header, HCN_ITEMRESIZED, resized, UnitsOfDraggedSize(header.sizes[item], zoomLevel));
     // The start is multiplied by the bare zoom level: usually too far along, and the parent
     // repaints the strip anyway.
     InvalidateFrom(header,
@@ -82,7 +82,7 @@ int DraggedSize(int size, int from, int to, int maximum) {
     return std::min(size + (to - from), maximum);
 }
 
-int UnitsFromPixels(int pixels, uint32_t zoom) {
+int UnitsOfDraggedSize(int pixels, uint32_t zoom) {
     return static_cast<int>((pixels + 0.5) * 4.0 / zoom);
 }
 

@@ -18,6 +18,6 @@ void UpdateSizeBounds(const HeaderRecord& header, int clientWidth, int clientHei
 int DraggedSize(int size, int from, int to, int maximum);
 
 // A size in pixels as units (pixels at 100 %), rounded to the middle of the pixel.
-int UnitsFromPixels(int pixels, uint32_t zoom);
+int UnitsOfDraggedSize(int pixels, uint32_t zoom);
 
 }  // namespace kor
