@@ -4,8 +4,8 @@
  * RegisterGraphControl, and drive it with the messages below. The chart keeps copies of all data
  * and texts it is given and draws into an off-screen image that WM_PAINT copies to the window.
  *
- * Changes of data, ranges, options and titles scale the axes again but draw nothing: make all
- * changes, then send GN_REDRAW once. A change of size, zoom or chart type draws by itself.
+ * New series and values, ranges, options and titles scale the axes again but draw nothing: make all
+ * changes, then send GN_REDRAW once. (GN_CLEAR and GN_RESET scale nothing.) A change of size, zoom or chart type draws by itself.
  *
  * Codes GN_... act only inside WM_NOTIFY (code in wParam, argument in lParam, no NMHDR); sent as
  * messages of their own they do nothing. The chart sends nothing to its parent.
@@ -165,7 +165,9 @@ typedef struct GraphRange {
 #define GM_GETOPTIONS (WM_USER + 6015)
 
 /* GN_RESET, inside WM_NOTIFY: removes all series and labels.
- *   lParam  nonzero also returns the ranges to automatic and 0 to 1; the zoom stays
+ *   lParam  nonzero also returns the ranges to automatic and 0 to 1; the zoom stays. One unit is one
+ *           pixel then, with a tick on each, until a new series, range, option or title scales the
+ *           axes: change one of them before the next redraw.
  *   result  0 */
 #define GN_RESET (WM_USER + 6016)
 

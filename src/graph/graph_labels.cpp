@@ -108,8 +108,8 @@ void DrawYAxisLabels(const GraphRecord& graph, HDC dc) {
 }
 
 void DrawGraphTitle(const GraphRecord& graph, HDC dc) {
-    if (!HasOption(graph, KORGRAPH_TITLE) || !graph.title) return;
     SelectScope font(dc, graph.hfontTitle);
+    if (!HasOption(graph, KORGRAPH_TITLE) || !graph.title) return;
     const RECT& surface = graph.rcPlot;
     DrawCentred(dc, graph.title, {surface.left, surface.top, surface.right, graph.marginTop});
 }

@@ -2,6 +2,7 @@
 
 #include <korcontrols/graph.h>
 
+#include "graph/graph_palette.h"
 #include "graph/graph_series.h"
 #include "platform/local_text.h"
 #include "platform/records.h"
@@ -26,6 +27,7 @@ GraphRecord* CreateGraphRecord() {
     graph->hpenThick = CreatePen(PS_SOLID, 2, kBlack);
     graph->hpenThin = CreatePen(PS_SOLID, 1, kBlack);
     graph->hpenGrid = CreatePen(PS_SOLID, 1, kGridColour);
+    graph->crBack = PaletteEntry(1);
     graph->labelHalfHeight = 10;
     graph->xTickHalfSpacing = 10;
     graph->labelMaxWidth = 10;

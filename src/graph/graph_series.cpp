@@ -83,6 +83,14 @@ bool InitialiseSeries(GraphSeries& series, int count, const double* values, bool
     return series.liveBuffer != nullptr;
 }
 
+// The series keeps its number of points; what is missing becomes 0.
+void OverwriteValues(GraphSeries& series, const GraphSeriesData& data) {
+    const int copied = std::clamp<int>(data.pointCount, 0, series.pointCount);
+    std::copy_n(data.values, copied, series.values);
+    std::fill(series.values + copied, series.values + series.pointCount, 0.0);
+    TakeValues(series, series.values);
+}
+
 void FreeSeries(GraphSeries* series) {
     if (!series) return;
     FreeLocal(series->values);
@@ -131,14 +139,22 @@ void FollowData(GraphRecord& graph) {
     if (graph.yAutoRange) AutoRange(graph, KORGRAPH_Y);
 }
 
+// Where a rescan begins; 0 where no value counts.
+double FirstFiniteValue(const GraphSeries& series) {
+    const double* begin = series.values;
+    const double* end = begin + series.pointCount;
+    const double* first = std::find_if(begin, end, IsFinite);
+    return first == end ? 0.0 : *first;
+}
+
 // The largest value anew. Its index moves only onto a larger value than the first one.
 void RescanMaximum(GraphSeries& series) {
-    series.maxValue = series.values[0];
+    series.maxValue = FirstFiniteValue(series);
     series.absSum = 0;
     for (int i = 0; i < series.pointCount; ++i) {
         const double value = series.values[i];
         if (!IsFinite(value)) continue;
-        if (!(value <= series.maxValue)) {
+        if (value > series.maxValue) {
             series.maxValue = value;
             series.maxIndex = i;
         }
@@ -147,12 +163,12 @@ void RescanMaximum(GraphSeries& series) {
 }
 
 void RescanMinimum(GraphSeries& series) {
-    series.minValue = series.values[0];
+    series.minValue = FirstFiniteValue(series);
     series.absSum = 0;
     for (int i = 0; i < series.pointCount; ++i) {
         const double value = series.values[i];
         if (!IsFinite(value)) continue;
-        if (!(value >= series.minValue)) {
+        if (value < series.minValue) {
             series.minValue = value;
             series.minIndex = i;
         }
@@ -213,16 +229,10 @@ void SetSeriesValue(GraphRecord& graph, const GraphValue& point) {
 void ReplaceSeriesValues(GraphRecord& graph, const GraphSeriesData& data) {
     GraphSeries* series = SeriesAt(graph, data.seriesIndex);
     if (!series) return;
-    if (data.values && data.pointCount >= 1) {
-        if (series->values) {
-            const int copied = std::min<int>(series->pointCount, data.pointCount);
-            std::copy_n(data.values, copied, series->values);
-            std::fill(series->values + copied, series->values + series->pointCount, 0.0);
-            TakeValues(*series, series->values);
-        } else {
-            InitialiseSeries(*series, data.pointCount, data.values,
-                             HasOption(graph, KORGRAPH_LIVE));
-        }
+    if (data.values && series->values) {
+        OverwriteValues(*series, data);
+    } else if (data.values && data.pointCount >= 1) {
+        InitialiseSeries(*series, data.pointCount, data.values, HasOption(graph, KORGRAPH_LIVE));
     }
     FollowData(graph);
 }

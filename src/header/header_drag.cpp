@@ -68,7 +68,8 @@ void EndResize(const HeaderRecord& header) {
     ReleaseCapture();
     if (!HasItem(header, resized)) return;
     const auto item = static_cast<uint32_t>(resized);
-    PostToParent(header, HCN_ITEMRESIZED, resized, UnitsOfDraggedSize(header.sizes[item], zoomLevel));
+    PostToParent(header, HCN_ITEMRESIZED, resized,
+                 UnitsOfDraggedSize(header.sizes[item], zoomLevel));
     // The start is multiplied by the bare zoom level: usually too far along, and the parent
     // repaints the strip anyway.
     InvalidateFrom(header,

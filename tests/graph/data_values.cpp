@@ -140,6 +140,38 @@ TEST_F(GraphSetValue, InfiniteOnesAreStoredAsGiven) {
     EXPECT_NE(series().values[2], series().values[2]);
 }
 
+// A rescan begins with the first value that counts.
+struct Rescan {
+    const char* name;
+    std::vector<double> values;
+    int index;
+    double value;
+    double least, most;
+};
+
+void PrintTo(const Rescan& rescan, std::ostream* out) { *out << rescan.name; }
+
+constexpr double kInfinity = std::numeric_limits<double>::infinity();
+constexpr double kNone = std::numeric_limits<double>::quiet_NaN();
+
+class GraphRescan : public GraphSetValue, public ::testing::WithParamInterface<Rescan> {};
+
+TEST_P(GraphRescan, NeverMakesAnExtremeOfWhatIsInfiniteOrNone) {
+    add(GetParam().values);
+    set(0, GetParam().index, GetParam().value);
+    EXPECT_EQ(series().minValue, GetParam().least);
+    EXPECT_EQ(series().maxValue, GetParam().most);
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    First, GraphRescan,
+    ::testing::Values(Rescan{"MaximumBecomesInfinite", {9, 5, 3}, 0, kInfinity, 3, 5},
+                      Rescan{"InfiniteBeforeTheMaximum", {kInfinity, 5, 3}, 1, 4, 3, 4},
+                      Rescan{"InfiniteBeforeTheMinimum", {-kInfinity, 5, 3}, 2, 4, 4, 5},
+                      Rescan{"OnlyOneBecomesNone", {5}, 0, kNone, 5, 0},
+                      Rescan{"MinimumBecomesNone", {3, 5, 9}, 0, kNone, 5, 9}),
+    [](const auto& rescan) { return rescan.param.name; });
+
 // ---- Replacing --------------------------------------------------------------------------------
 
 class GraphReplace : public GraphSetValue {};
@@ -195,12 +227,15 @@ TEST_F(GraphReplace, BadSeriesAreIgnored) {
     EXPECT_EQ(ValuesOf(series()), (std::vector<double>{1, 2}));
 }
 
-TEST_F(GraphReplace, CountsBelowOneCopyNothing) {
-    add({1, 2});
+TEST_F(GraphReplace, CountsBelowOneLeaveZeros) {
     const double values[] = {5, 6};
-    kor::ReplaceSeriesValues(graph, {-3, nullptr, values, 0});
-    EXPECT_EQ(series().pointCount, 2);
-    for (const double value : ValuesOf(series())) EXPECT_NE(value, 5);
+    for (const int count : {0, -3}) {
+        add({1, 2});
+        const int last = graph.seriesCount - 1;
+        kor::ReplaceSeriesValues(graph, {count, nullptr, values, last});
+        EXPECT_EQ(ValuesOf(series(last)), (std::vector<double>{0, 0})) << count;
+        EXPECT_EQ(series(last).maxValue, 0) << count;
+    }
 }
 
 TEST_F(GraphReplace, MissingArrayIsSurvived) {

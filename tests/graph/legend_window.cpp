@@ -154,6 +154,9 @@ TEST_F(LegendWindow, WithoutAParentIsAnEmptyWindow) {
     EXPECT_TRUE(GetUpdateRect(legend, nullptr, FALSE));
     EXPECT_EQ(SendMessageW(legend, WM_PAINT, 0, 0), 0);
     EXPECT_FALSE(GetUpdateRect(legend, nullptr, FALSE));
+    spy.watch("InvalidateRect");
+    EXPECT_EQ(SendMessageW(legend, WM_VSCROLL, SB_LINEDOWN, 0), 0);
+    EXPECT_TRUE(spy.callsOf("InvalidateRect").empty()) << "of no window is of every window";
     EXPECT_TRUE(DestroyWindow(legend));
 }
 

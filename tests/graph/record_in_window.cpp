@@ -1,7 +1,9 @@
 // Where a window keeps its record.
 #include "graph/graph_fixture.h"
 
+#include <algorithm>
 #include <cstring>
+#include <iterator>
 
 namespace kortest {
 namespace {
@@ -60,6 +62,29 @@ TEST_F(GraphRecordInWindow, SharesOneFontButForTheTurnedOne) {
     LOGFONTW font{};
     GetObjectW(field<HFONT>(84), sizeof font, &font);
     EXPECT_EQ(font.lfEscapement, 900);
+}
+
+// The host destroyed the legend, and what has its handle now is a window of its own.
+TEST_F(GraphRecordInWindow, OfALegendThatBecameAnotherWindowChangesNothing) {
+    constexpr size_t kPlaceOfLegend = 4 * sizeof(void*);
+    create();
+    const HWND legend = showLegend({5, 5, 60, 60});
+    WNDCLASSW another = {};
+    another.lpfnWndProc = DefWindowProcW;
+    another.lpszClassName = L"Another window";
+    ASSERT_NE(RegisterClassW(&another), 0);
+    const HWND reused = CreateWindowExW(0, another.lpszClassName, L"", WS_CHILD, 0, 0, 9, 9,
+                                        host.window(), nullptr, nullptr, nullptr);
+    ASSERT_NE(reused, nullptr);
+    LONG_PTR own[16];
+    std::fill(std::begin(own), std::end(own), 1234);
+    SetWindowLongPtrW(reused, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(own));
+    ASSERT_EQ(field<HWND>(kPlaceOfLegend), legend);
+    auto* record = reinterpret_cast<char*>(GetWindowLongPtrW(graph, GWLP_USERDATA));
+    std::memcpy(record + kPlaceOfLegend, &reused, sizeof reused);
+    destroy();
+    for (const LONG_PTR value : own) EXPECT_EQ(value, 1234);
+    DestroyWindow(reused);
 }
 
 }  // namespace

@@ -129,6 +129,8 @@ TEST_F(GraphRecordAtFirst, IsALineChartWithEveryOptionButLiveMode) {
     EXPECT_EQ(graph.liveIndex, 0);
 }
 
+TEST_F(GraphRecordAtFirst, HasAWhiteBackground) { EXPECT_EQ(graph.crBack, RGB(255, 255, 255)); }
+
 TEST_F(GraphRecordAtFirst, HasItsSizesInPixels) {
     const RECT onePixel = {0, 0, 1, 1};
     EXPECT_TRUE(EqualRect(&graph.rcPlot, &onePixel));

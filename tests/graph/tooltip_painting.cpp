@@ -82,6 +82,19 @@ TEST_F(ToolTipPicture, IsPaintedIntoAGivenDC) {
     EXPECT_EQ(canvas.picture().pixel(whole.width(), 5), RGB(9, 9, 9));
 }
 
+TEST_F(ToolTipPicture, StaysInTheWindowWhenADCIsGiven) {
+    show(L"Value:12.5");
+    Canvas canvas(100, 40, RGB(9, 9, 9));
+    const HDC own = GetDC(tip);
+    for (const HDC given : {canvas.dc(), own}) {
+        InvalidateRect(tip, nullptr, TRUE);
+        SendMessageW(tip, WM_PAINT, reinterpret_cast<WPARAM>(given), 0);
+        EXPECT_FALSE(GetUpdateRect(tip, nullptr, FALSE));
+        expectShown(L"Value:12.5");
+    }
+    ReleaseDC(tip, own);
+}
+
 TEST_F(ToolTipPicture, PaintingReachesDefaultProcessingAndValidates) {
     show(L"Value:12.5");
     InvalidateRect(tip, nullptr, FALSE);

@@ -43,6 +43,7 @@ constexpr Signature kStdcall[] = {
     {"DestroyWindow", 1},
     {"EnableWindow", 2},
     {"GetClassInfoW", 3},
+    {"GetClassNameW", 3},
     {"GetClientRect", 2},
     {"GetDlgItem", 2},
     {"GetFocus", 0},

@@ -3,6 +3,7 @@
 #include <korcontrols/legend.h>
 
 #include <algorithm>
+#include <iterator>
 
 #include "graph/graph_entries.h"
 #include "platform/gdi_scopes.h"
@@ -126,6 +127,7 @@ LRESULT OnScroll(LegendRecord& legend, int request) {
     case SB_TOP: legend.firstEntry = 0; break;
     default: break;
     }
+    if (!legend.window) return 0;  // the platform would repaint every window on the screen
     InvalidateRect(legend.window, nullptr, TRUE);
     UpdateWindow(legend.window);
     return 0;
@@ -166,6 +168,13 @@ LRESULT CALLBACK LegendProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lPara
     return DefWindowProcW(hwnd, message, wParam, lParam);
 }
 
+bool IsLegend(HWND hwnd) {
+    constexpr int kCapacity = static_cast<int>(std::size(className)) + 1;
+    wchar_t name[kCapacity] = L"";
+    return IsWindow(hwnd) && GetClassNameW(hwnd, name, kCapacity) != 0 &&
+           std::equal(std::begin(className), std::end(className), name);
+}
+
 }  // namespace
 
 bool RegisterLegendClass(HINSTANCE instance) {
@@ -187,8 +196,9 @@ bool AttachLegend(HWND hwnd, const GraphRecord* graph) {
     return true;
 }
 
+// The host may have destroyed the legend, and its handle be another window's now.
 void DetachLegend(HWND hwnd) {
-    if (!IsWindow(hwnd)) return;
+    if (!IsLegend(hwnd)) return;
     auto* legend = UserDataOf<LegendRecord>(hwnd);
     if (legend) legend->graph = nullptr;
 }

@@ -69,13 +69,13 @@ void DrawTip(const ToolTipRecord& tip, HDC dc) {
     DrawTextW(dc, tip.text, -1, &inside, 0);
 }
 
-// A pending erase happens first: default processing would erase what has been drawn.
+// A pending erase happens first: default processing would erase what has been drawn. Who gives a DC
+// does not lose what was to be painted in the window.
 void OnPaint(const ToolTipRecord& tip, HDC given) {
-    if (given) {
-        DrawTip(tip, given);
-        return;
-    }
+    const bool pending = GetUpdateRect(tip.window, nullptr, FALSE) != 0;
     { PaintScope validate(tip.window); }
+    if (given) DrawTip(tip, given);
+    if (given && !pending) return;
     WindowDC dc(tip.window);
     DrawTip(tip, dc.get());
 }
