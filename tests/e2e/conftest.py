@@ -42,6 +42,23 @@ def programs(machine, pytestconfig):
     return pathlib.Path(pytestconfig.getoption("build")).absolute() / folder
 
 
+@pytest.fixture
+def alone_with_library(machine, programs, tmp_path):
+    """alone_with_library("host.exe") is a copy of the program, in a folder that it shares with the
+    library and nothing else."""
+    library = ["korcontrols.dll"]  # on the device this is the stand-in, which reads the image
+    if machine == "device":
+        library.append("device/korcontrols.dll")
+
+    def copy(program):
+        for name in program, *library:
+            (tmp_path / name).parent.mkdir(exist_ok=True)
+            shutil.copy(programs / name, tmp_path / name)
+        return tmp_path / program
+
+    return copy
+
+
 @pytest.fixture(scope="session")
 def desktop(programs):
     with Desktop(programs / "workbook.exe") as started:

@@ -6,7 +6,6 @@ that a pixel of the printable area is a pixel of the chart.
 
 import math
 import re
-import shutil
 import subprocess
 from types import SimpleNamespace
 
@@ -117,10 +116,8 @@ def test_a_cancelled_dialog_prints_nothing(prints):
     assert not (prints.folder / "cancelled.ps").exists()
 
 
-def test_without_the_companion_modules_there_is_no_printing(programs, tmp_path):
-    for name in ("printing_host.exe", "korcontrols.dll"):
-        shutil.copy(programs / name, tmp_path)
-    prints = run_host(tmp_path / "printing_host.exe", tmp_path)
+def test_without_the_companion_modules_there_is_no_printing(alone_with_library, tmp_path):
+    prints = run_host(alone_with_library("printing_host.exe"), tmp_path)
     assert prints.lines[0] == "available 0"
     assert len(prints.lines) == 12
     assert all(line.endswith(' dialog "" window-enabled 1') for line in prints.lines[1:])
