@@ -8,8 +8,9 @@
  * There is one grid in a process: the functions take no window handle and act on that grid. Create
  * it as a child window of class KORGRID_CLASS with WS_CHILD | WS_VISIBLE | WS_CLIPCHILDREN, after
  * RegisterGridControl. A second window of the class takes everything over from the first, which
- * does not work again, not even when the second is gone. Positions are pixels in the grid's client area; ends of the visible range
- * are exclusive, ends of a selection inclusive. Sizes "in units" are pixels at 100 % zoom.
+ * does not work again, not even when the second is gone. Positions are pixels in the grid's client
+ * area; ends of the visible range are exclusive, ends of a selection inclusive. Sizes "in units"
+ * are pixels at 100 % zoom.
  *
  * Nothing tells the zoom level, a size, or what is hidden: the host remembers what it set.
  *
@@ -86,8 +87,8 @@ typedef struct GridCellPair {
  * column or row of the sheet it is KORGRID_COLUMNS or KORGRID_ROWS, so check before indexing. */
 #define GRIDN_CELLCLICKED 3427
 
-/* WM_NOTIFY: a column's, or row's, border was dragged and let go. The grid has drawn before, at zoom
- * levels other than 100 % perhaps too little: answer with GRIDM_REDRAW.
+/* WM_NOTIFY: a column's, or row's, border was dragged and let go. The grid has drawn before, at
+ * zoom levels other than 100 % perhaps too little: answer with GRIDM_REDRAW.
  * lParam (a value): low word the new size in units, high word the absolute column or row. */
 #define GRIDN_COLUMNRESIZED 3430
 #define GRIDN_ROWRESIZED 3431
@@ -269,8 +270,8 @@ DWORD KORCONTROLS_API GetCurrentSelectedCell(GridCellPair* cell);
 
 /* ---- Equation bar ---- */
 
-/* The equation bar's edit control, or 0 before the grid exists; after its end the handle of the edit
- * that is gone. It belongs to the grid. */
+/* The equation bar's edit control, or 0 before the grid exists; after its end the handle of the
+ * edit that is gone. It belongs to the grid. */
 HWND KORCONTROLS_API GetHandleToEquationControl(void);
 
 /* Which of the two had the focus last: the grid's window or the edit; 0 before either had it. */
