@@ -24,6 +24,11 @@ static LRESULT CALLBACK HostProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM 
         return 0;
     case WM_SIZE:
         MoveWindow(grid, 0, 0, LOWORD(lParam), HIWORD(lParam), TRUE);
+        SetHorizontalDataRange(KORGRID_COLUMNS); /* the scroll bars' thumbs follow the size */
+        SetVerticalDataRange(KORGRID_ROWS);
+        return 0;
+    case WM_SETFOCUS:
+        SetFocus(grid);
         return 0;
     case WM_DESTROY:
         PostQuitMessage(0);
@@ -45,8 +50,6 @@ int WINAPI WinMain(HINSTANCE instance, HINSTANCE previous, LPSTR commandLine, in
     grid = CreateWindowW(KORGRID_CLASS, L"",
                          WS_CHILD | WS_VISIBLE | WS_CLIPCHILDREN | WS_HSCROLL | WS_VSCROLL, 0, 0, 0,
                          0, window, NULL, instance, NULL);
-    SetHorizontalDataRange(KORGRID_COLUMNS);
-    SetVerticalDataRange(KORGRID_ROWS);
     ShowWindow(window, show);
     while (GetMessageW(&message, NULL, 0, 0) > 0) {
         TranslateMessage(&message);

@@ -40,7 +40,8 @@ extern "C" {
 typedef struct FunkyBarItemDesc {
     DWORD mask;                /* FBIF_...; other bits mean nothing */
     LONG index;                /* where to insert; which item to get */
-    LPWSTR text;               /* insert: the text, which is copied; get: a buffer to fill */
+    LPWSTR text;               /* insert: the text, which is copied ("&" underlines the next
+                                  character); get: a buffer to fill */
     LONG textCapacity;         /* get: characters that the buffer has room for */
     LONG image;                /* index into the image list */
     COLORREF textColour;       /* of the text in the bar and in the menu */
@@ -57,7 +58,7 @@ typedef struct FunkyBarNotification {
 /* ---- Messages ---- */
 
 /* FBM_INSERTITEM: inserts an item; only the places at both ends and behind the first item can be
- * reached. Without a current item the first one becomes it.
+ * reached. Without a current item the first one becomes it, and only then the bar is repainted.
  *   wParam  0
  *   lParam  const FunkyBarItemDesc*, FBIF_TEXT among its bits. Text and members named by the mask
  *           are copied. Index 0 inserts before the first item, 1 behind it, and an index of the

@@ -5,7 +5,13 @@
  * and texts it is given and draws into an off-screen image that WM_PAINT copies to the window.
  *
  * New series and values, ranges, options and titles scale the axes again but draw nothing: make all
- * changes, then send GN_REDRAW once. (GN_CLEAR and GN_RESET scale nothing.) A change of size, zoom or chart type draws by itself.
+ * changes, then send GN_REDRAW once. (GN_CLEAR and GN_RESET scale nothing.) A change of size, zoom
+ * or chart type draws by itself.
+ *
+ * Give the chart WS_CLIPSIBLINGS | WS_CLIPCHILDREN, or it paints over its tooltip (a sibling) and
+ * its legend (a child), and a parent without a frame: the tooltip is placed as if the parent's
+ * client area began at the corner of its window. The tooltip stays when the chart goes and ends
+ * with the parent, so a host that makes charts again and again makes a parent for each.
  *
  * Codes GN_... act only inside WM_NOTIFY (code in wParam, argument in lParam, no NMHDR); sent as
  * messages of their own they do nothing. The chart sends nothing to its parent.
@@ -121,7 +127,9 @@ typedef struct GraphRange {
  *           stands on a page that is printed (nothing changes then) */
 #define GM_SETCATEGORIES (WM_USER + 6008)
 
-/* GM_SETTYPE: changes the chart type and draws. Between Bar and the others the axes trade places.
+/* GM_SETTYPE: changes the chart type and draws. Between Bar and the others the axes trade their
+ * ranges and titles, but not whether they are automatic: an axis that was fixed is to be fixed
+ * anew.
  *   wParam  0
  *   lParam  KORGRAPH_LINE to KORGRAPH_PIE; another number is kept and draws nothing
  *   result  0 */
@@ -133,14 +141,16 @@ typedef struct GraphRange {
  *   result  0 */
 #define GM_GETTYPE (WM_USER + 6010)
 
-/* GM_SETRANGE: fixes an axis. Equal ends show one unit. The category axis of a bar chart (y)
- * ignores the ends given and follows the number of points.
+/* GM_SETRANGE: fixes an axis. Equal ends show one unit; the ends are not put in order, and a
+ * minimum above the maximum gives no useful picture. The category axis of a bar chart (y) ignores
+ * the ends given and follows the number of points.
  *   wParam  0
- *   lParam  const GraphRange*
+ *   lParam  const GraphRange*; an axis that is neither of the two changes nothing
  *   result  0 */
 #define GM_SETRANGE (WM_USER + 6011)
 
-/* GM_AUTORANGE: lets an axis follow the data again.
+/* GM_AUTORANGE: lets an axis follow the data again: the values that the series were added with.
+ * Those set or replaced later count for no automatic range; add the series anew when they matter.
  *   wParam  0
  *   lParam  KORGRAPH_X or KORGRAPH_Y
  *   result  0 */
@@ -165,16 +175,17 @@ typedef struct GraphRange {
 #define GM_GETOPTIONS (WM_USER + 6015)
 
 /* GN_RESET, inside WM_NOTIFY: removes all series and labels.
- *   lParam  nonzero also returns the ranges to automatic and 0 to 1; the zoom stays. One unit is one
- *           pixel then, with a tick on each, until a new series, range, option or title scales the
- *           axes: change one of them before the next redraw.
+ *   lParam  nonzero also returns the ranges to automatic and 0 to 1; the zoom stays. One unit is
+ *           one pixel then, with a tick on each, until a new series, range, option or title scales
+ *           the axes: change one of them before the next redraw.
  *   result  0 */
 #define GN_RESET (WM_USER + 6016)
 
 /* GN_PROPERTIES, inside WM_NOTIFY: runs the modal property sheet "Graph Properties", with a page of
  * the titles and a page of ranges, type and zoom. OK applies the pages that were shown, and draws
- * if anything was sent. It comes back when the sheet is closed; the host's messages go on
- * meanwhile.
+ * if anything was sent; the host is not told. It comes back when the sheet is closed; the host's
+ * messages go on meanwhile. The sheet's owner is the chart: whether more than the chart is disabled
+ * meanwhile is up to the platform, so a host does not send this while one is open.
  *   lParam  0
  *   result  0 */
 #define GN_PROPERTIES (WM_USER + 6017)
@@ -197,7 +208,9 @@ typedef struct GraphRange {
  *   result  0 */
 #define GN_PRINT (WM_USER + 6020)
 
-/* GN_LIVEUPDATE, inside WM_NOTIFY: one step of live mode.
+/* GN_LIVEUPDATE, inside WM_NOTIFY: one step of live mode; without KORGRAPH_LIVE it does nothing.
+ * The trace is drawn by the paint that follows, on the screen only: let one happen (UpdateWindow)
+ * before the next step.
  *   lParam  in sweep mode a whole number, the new sample; in replace mode const GraphSeriesData*
  *   result  0 */
 #define GN_LIVEUPDATE (WM_USER + 6021)
@@ -219,8 +232,9 @@ typedef struct GraphRange {
  *   result  0 */
 #define GM_SETDATAMODE (WM_USER + 6024)
 
-/* GM_SHOWLEGEND: creates the legend and shows it; ignored while there is one. Its height is rounded
- * up to whole lines.
+/* GM_SHOWLEGEND: creates the legend and shows it, once in a chart's life: later requests are
+ * ignored, also when the legend has been destroyed. Hide, show and move its window (GetDlgItem with
+ * KORLEGEND_ID) instead. Its height is rounded up to whole lines.
  *   wParam  0
  *   lParam  const RECT*, in the chart's client coordinates
  *   result  0 */

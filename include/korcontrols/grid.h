@@ -7,8 +7,12 @@
  *
  * There is one grid in a process: the functions take no window handle and act on that grid. Create
  * it as a child window of class KORGRID_CLASS with WS_CHILD | WS_VISIBLE | WS_CLIPCHILDREN, after
- * RegisterGridControl. Positions are pixels in the grid's client area; ends of the visible range
- * are exclusive, ends of a selection inclusive. Sizes "in units" are pixels at 100 % zoom.
+ * RegisterGridControl. A second window of the class takes everything over from the first, which
+ * does not work again, not even when the second is gone. Positions are pixels in the grid's client
+ * area; ends of the visible range are exclusive, ends of a selection inclusive. Sizes "in units"
+ * are pixels at 100 % zoom.
+ *
+ * Nothing tells the zoom level, a size, or what is hidden: the host remembers what it set.
  *
  * Functions called before the grid's window exists, or after it is gone, keep or return what the
  * grid knows and draw nothing. After it is gone those that redraw still ask its parent to paint
@@ -77,11 +81,14 @@ typedef struct GridCellPair {
 #define GRIDN_PAINTCELLS 3425
 
 /* WM_NOTIFY: the left button was pressed. lParam: const GridCellPair*, the cell under the pointer.
+ * No GRIDN_CURRENTCELL comes with it: show the current cell's text here as well (with Shift the
+ * current cell is another one than the cell pressed). A double click's second press is not told.
  * Beyond the last visible column or row the answer is 0; but up to one default size past the last
  * column or row of the sheet it is KORGRID_COLUMNS or KORGRID_ROWS, so check before indexing. */
 #define GRIDN_CELLCLICKED 3427
 
-/* WM_NOTIFY: a column's, or row's, border was dragged and let go.
+/* WM_NOTIFY: a column's, or row's, border was dragged and let go. The grid has drawn before, at
+ * zoom levels other than 100 % perhaps too little: answer with GRIDM_REDRAW.
  * lParam (a value): low word the new size in units, high word the absolute column or row. */
 #define GRIDN_COLUMNRESIZED 3430
 #define GRIDN_ROWRESIZED 3431
@@ -109,7 +116,8 @@ typedef struct GridCellPair {
 /* WM_NOTIFY: a drag changed the selection. lParam: const GridSelection*. */
 #define GRIDN_SELECTING 3435
 
-/* WM_NOTIFY: the left button was released. lParam: const GridSelection*. */
+/* WM_NOTIFY: the left button was released, after a double click twice. lParam: const
+ * GridSelection*. */
 #define GRIDN_SELECTIONDONE 3436
 
 /* WM_NOTIFY: the equation edit got the focus. lParam: 0. */
@@ -132,7 +140,7 @@ typedef struct GridCellPair {
 
 /* GRIDM_SETEQUATIONTEXT: shows a text in the equation bar; nothing is committed by it.
  *   wParam  passed on to the edit, 0
- *   lParam  LPCWSTR, copied
+ *   lParam  LPCWSTR, copied; null changes nothing
  *   result  0 */
 #define GRIDM_SETEQUATIONTEXT 3429
 
@@ -157,8 +165,9 @@ void KORCONTROLS_API ResetGrid(void);
  * Each does nothing for a cell outside the visible range. A cell's box is x, y to x + width,
  * y + height; its grid lines are the box's left and top edges. */
 
-/* Fills the box and the lines around it (one pixel more to the right and below). The brush stays
- * the caller's; a null brush draws nothing. */
+/* Fills the box and the lines around it (one pixel more to the right and below), so that a cell
+ * filled with white has no grid lines: fill only cells that have a colour of their own. The brush
+ * stays the caller's; a null brush draws nothing. */
 void KORCONTROLS_API SetCellBackGroundColor(CellIndex cell, HBRUSH brush);
 
 /* Draws the box's edges whose flags have any of the low 16 bits set. The pen stays the caller's. */
@@ -170,7 +179,8 @@ void KORCONTROLS_API SetCellBorder(CellIndex cell, HPEN pen, DWORD left, DWORD r
  *   font        font at 100 % zoom, scaled by the grid; 0: the image's current font, unscaled
  *   textColour  colour of the letters
  *   backColour  colour behind them: letters are drawn on a box of it, so pass the cell's own
- *   format      DrawTextW flags; 0 means DT_NOPREFIX | DT_VCENTER | DT_CENTER
+ *   format      DrawTextW flags; 0 means DT_NOPREFIX | DT_VCENTER | DT_CENTER. Without DT_NOPREFIX
+ *               a "&" underlines what follows it
  *   spanLeft    > 0: the text's rectangle begins this many columns further left (not before the
  *               first visible one)
  *   spanRight   > 0: it ends this many columns further right; < 0: it runs past the client area
@@ -187,8 +197,11 @@ DWORD KORCONTROLS_API ToggleGridLines(void);
 
 /* ---- Sizes and zoom ---- */
 
-/* Sets a size in pixels at the current zoom (the low 16 bits count). Repaints nothing.
- *   column, row  counted from the first visible one
+/* Sets a size in pixels at the current zoom (the low 16 bits count). Repaints nothing. A size in
+ * units is restored with (units * level + 3) / 4 pixels, exactly from 100 % on; below, not every
+ * size can be set.
+ *   column, row  counted from the first visible one; others than those in view may be given, and
+ *                negative numbers stand for those before it
  *   result       1; 0 when there was no memory or the column or row lies outside the sheet
  * The size in units is compared with the cell area in pixels, at any zoom: a larger one becomes the
  * area less 10, in units (never below 0). Without a client area nothing is cut. */
@@ -196,7 +209,7 @@ DWORD KORCONTROLS_API SetColumnWidth(LONG column, LONG width);
 DWORD KORCONTROLS_API SetRowHeight(LONG row, LONG height);
 
 /* Sets the zoom in quarters (4 = 100 %), lays everything out again and redraws. 0 is refused: the
- * level stays as it was.
+ * level stays as it was. There is no upper limit; from some level on no whole cell has room.
  *   result  nonzero when the headers are hidden */
 DWORD KORCONTROLS_API SetGridZoomLevel(DWORD level);
 
@@ -212,8 +225,11 @@ DWORD KORCONTROLS_API ToggleViewStateOfHeaders(void);
 DWORD KORCONTROLS_API SetFirstVisibleCell(CellIndex cell);
 
 /* Sets how many columns, or rows, the host's data has: the scroll bar's extent, at least the number
- * of visible ones.
- *   result  the scroll bar's position; the grid's window handle when there is no bar to set */
+ * of visible ones. The bar is set at once, with the number visible now as its page. Until the first
+ * call, or a scroll, a grid's bars have the system's range of 0 to 100; sizing and zooming leave
+ * them alone. So call these when the grid has its size, and again after WM_SIZE and a zoom.
+ *   result  the scroll bar's position; while the bar is hidden the grid's window handle, which is 0
+ *           before there is a grid. The number is kept in any case. */
 LONG KORCONTROLS_API SetHorizontalDataRange(LONG columns);
 LONG KORCONTROLS_API SetVerticalDataRange(LONG rows);
 
@@ -237,7 +253,9 @@ DWORD KORCONTROLS_API IsIndexCompletelyVisible(CellIndex cell);
 
 /* ---- Selection ---- */
 
-/* Selects a block and shows it; nothing is notified and the anchor for Shift stays.
+/* Selects a block and highlights it; nothing is scrolled or notified and the anchor for Shift
+ * stays. Text that is being typed would be committed to the new current cell: give the grid the
+ * focus first.
  *   columns  KORGRID_PAIR(left, right)
  *   rows     KORGRID_PAIR(top, bottom)
  *   result   nonzero, or 0 (and no change) for a block that is turned round or leaves the sheet */
@@ -252,7 +270,8 @@ DWORD KORCONTROLS_API GetCurrentSelectedCell(GridCellPair* cell);
 
 /* ---- Equation bar ---- */
 
-/* The equation bar's edit control, or 0 before the grid exists. It belongs to the grid. */
+/* The equation bar's edit control, or 0 before the grid exists; after its end the handle of the
+ * edit that is gone. It belongs to the grid. */
 HWND KORCONTROLS_API GetHandleToEquationControl(void);
 
 /* Which of the two had the focus last: the grid's window or the edit; 0 before either had it. */

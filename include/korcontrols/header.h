@@ -2,9 +2,10 @@
  *
  * The grid creates two of them and talks to them with the messages below; a host seldom needs them
  * itself. The class is registered when the first grid is created, under the instance that the grid
- * was created with. A strip stores labels, sizes and states, paints its items as raised buttons at
- * the grid's zoom, and reports presses and border drags to its parent. It never repaints by itself
- * after a message: whoever changes items invalidates the window when all changes are made.
+ * was created with, and stays when that grid goes. A strip stores labels, sizes and states, paints
+ * its items as raised buttons at the grid's zoom, and reports presses and border drags to its
+ * parent. It never repaints by itself after a message: whoever changes items invalidates the window
+ * when all changes are made.
  *
  * Positions and sizes are pixels along the strip, from its client origin: x for a horizontal strip,
  * y for a vertical one.
@@ -31,7 +32,8 @@ extern "C" {
 
 /* What a strip stores of an item: 8 bytes on 32-bit systems, 16 on 64-bit ones. */
 typedef struct HeaderItemDesc {
-    LPWSTR text; /* label; copied when set, and a null pointer there means an empty label */
+    LPWSTR text; /* label; copied when set, and a null pointer there means an empty label. "&"
+                    underlines the next character */
     WORD size;   /* pixels along the strip */
 } HeaderItemDesc;
 

@@ -9,7 +9,15 @@
  *   <korcontrols/listhelpers.h>  helpers for list views and tree views
  *
  * All headers are plain C (C90 and later) and C++. All text is UTF-16. All functions use the C
- * calling convention and are called from the one thread that owns the controls' windows. */
+ * calling convention and are called from the one thread that owns the controls' windows.
+ *
+ * The inline functions that stand for a message, such as KorGraph_SetTitle, answer for a window
+ * that is null or gone what SendMessageW does: 0, whatever 0 means to the message.
+ * KorGraph_AddSeries and KorGraph_SetCategories, whose messages answer 0 for success, return TRUE
+ * then.
+ *
+ * None of the window classes has a cursor: a host sets one when its window gets WM_SETCURSOR, or
+ * the pointer keeps the shape it had outside. */
 #ifndef KORCONTROLS_KORCONTROLS_H
 #define KORCONTROLS_KORCONTROLS_H
 

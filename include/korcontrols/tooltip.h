@@ -1,5 +1,7 @@
 /* The tooltip: a small framed text just above a point. The chart creates one as a child of its own
- * parent and shows the value under the pointer with it. */
+ * parent and shows the value under the pointer with it. It stays when the chart goes, until the
+ * parent goes. The class is registered when the first chart is created; a host may then create
+ * tooltips of its own, under the chart's instance. */
 #ifndef KORCONTROLS_TOOLTIP_H
 #define KORCONTROLS_TOOLTIP_H
 
