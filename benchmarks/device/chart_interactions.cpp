@@ -104,15 +104,29 @@ Step LiveUpdate(int points) {
     };
 }
 
-// In replace mode.
-Step LiveChart(int points) {
+Step LiveChart(int mode, int points) {
     return [=] {
         chart = CreateChart(KORGRAPH_LINE);
         KorGraph_ToggleOptions(chart, KORGRAPH_LIVE);
-        KorGraph_SetDataMode(chart, KORGRAPH_REPLACE);
+        KorGraph_SetDataMode(chart, mode);
         AddSeries(chart, points);
         Redraw();
-        LiveUpdate(points)();
+        if (mode == KORGRAPH_REPLACE) LiveUpdate(points)();
+    };
+}
+
+Step SetLabels(int points) {
+    return [=] {
+        const std::vector<LPCWSTR> labels(static_cast<size_t>(points), L"Label");
+        KorGraph_SetCategories(chart, points, labels.data());
+    };
+}
+
+Step LabelledChart(int points) {
+    return [=] {
+        Chart(KORGRAPH_COLUMN, points)();
+        SetLabels(points)();
+        Redraw();
     };
 }
 
@@ -133,7 +147,19 @@ std::vector<Interaction> ChartInteractions(int points) {
         {"tap on a slice, pie", ChartWithValue(KORGRAPH_PIE, points), PressTarget},
         {"adding a series", Chart(KORGRAPH_LINE, 0), [=] { AddSeries(chart, points); }},
         {"removing it", Chart(KORGRAPH_LINE, points), [] { KorGraph_Clear(chart); }},
-        {"live update", LiveChart(points), LiveUpdate(points)},
+        {"live update of all values", LiveChart(KORGRAPH_REPLACE, points), LiveUpdate(points)},
+        {"sample of a sweep", LiveChart(KORGRAPH_SWEEP, points),
+         [] {
+             KorGraph_Notify(chart, GN_LIVEUPDATE, 5);
+             Settle();
+         }},
+        {"setting a label for each point", Chart(KORGRAPH_COLUMN, points), SetLabels(points)},
+        {"redraw with labels, column", LabelledChart(points), Redraw},
+        {"room for an input panel made, line", Chart(KORGRAPH_LINE, points),
+         [] {
+             MoveWindow(chart, 0, 0, kWidth, kHeight - kInputPanelHeight, TRUE);
+             Settle();
+         }},
         {"repaint with a legend, pie", ChartWithLegend(KORGRAPH_PIE, points), RepaintAll},
         {"copy to the clipboard", Chart(KORGRAPH_LINE, points), [] { KorGraph_Copy(chart); }},
     };

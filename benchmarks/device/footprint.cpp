@@ -1,11 +1,9 @@
-// device_footprint: what the device's library takes, counted by the stand-in that interprets it.
-// One line for each figure, its fields separated by tabs; scripts/footprint.py makes tables of
-// them.
+// device_footprint: what the device's library takes, counted by the stand-in that interprets it. A
+// line for each figure, its fields separated by tabs, which scripts/footprint.py makes tables of:
 //
-//   creation     name, heap bytes and GDI objects while it lives, and what is left of both
-//   interaction  name, points (0: none), instructions, those in the arithmetic helpers, calls of
-//   the
-//                platform, and whether all runs were alike
+//   creation     name; heap bytes and GDI objects while it lives; what is left of both
+//   interaction  name; points or 0; instructions; those in the arithmetic helpers; calls of the
+//                platform; "alike" when all runs were
 //   stack        the deepest use in bytes
 //   speed        million instructions interpreted in a second of processor time
 //

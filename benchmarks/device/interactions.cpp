@@ -4,6 +4,7 @@
 
 #include <korcontrols/funkybar.h>
 #include <korcontrols/grid.h>
+#include <korcontrols/listhelpers.h>
 
 namespace footprint {
 namespace {
@@ -43,6 +44,7 @@ void PrepareGridAtRight() {
     Settle();
 }
 
+constexpr WPARAM kCornerButton = 1;
 constexpr int kColumnBorder = 60;  // in the column strip
 constexpr int kDragged = 20;
 
@@ -125,6 +127,18 @@ std::vector<Interaction> GridInteractions() {
              Release(ColumnStrip(window), kColumnBorder + kDragged, 5);
              Settle();
          }},
+        {"column selected by its header", PrepareGrid,
+         [] {
+             Press(ColumnStrip(window), 30, 5);
+             Release(ColumnStrip(window), 30, 5);
+             Settle();
+         }},
+        {"whole sheet selected", PrepareGrid, Send(WM_COMMAND, kCornerButton)},
+        {"room for an input panel made", PrepareGrid,
+         [] {
+             MoveWindow(window, 0, 0, kWidth, kHeight - kInputPanelHeight, TRUE);
+             Settle();
+         }},
         {"zoom from 100 to 200 %", PrepareGrid, zoom(8)},
         {"zoom from 100 to 50 %", PrepareGrid, zoom(2)},
         {"character typed into the equation bar", PrepareGrid,
@@ -166,11 +180,41 @@ std::vector<Interaction> BarInteractions() {
     };
 }
 
+// ---- List helpers ----
+
+constexpr int kRows = 100;
+
+void AddRows() {
+    for (int row = 0; row < kRows; ++row) {
+        const LPCWSTR texts[] = {L"Name", L"Value"};
+        KorListView_UpdateItem(window, -1, texts, 2, 0, 0, 0, 0);
+    }
+    Settle();
+}
+
+void PrepareList() {
+    window = CreateListView();
+    AddRows();
+}
+
+std::vector<Interaction> ListInteractions() {
+    return {
+        {"100 rows added to a list", [] { window = CreateListView(); }, AddRows},
+        {"100 rows removed from a list", PrepareList,
+         [] {
+             KorListView_DeleteAll(window, FALSE, FALSE);
+             Settle();
+         }},
+    };
+}
+
 }  // namespace
 
 std::vector<Interaction> PlainInteractions() {
-    std::vector<Interaction> all = GridInteractions();
-    for (const Interaction& one : BarInteractions()) all.push_back(one);
+    std::vector<Interaction> all;
+    for (const auto& some : {GridInteractions(), BarInteractions(), ListInteractions()}) {
+        all.insert(all.end(), some.begin(), some.end());
+    }
     return all;
 }
 

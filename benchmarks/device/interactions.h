@@ -13,7 +13,7 @@ struct Interaction {
     std::function<void()> act;
 };
 
-// Those of the grid, its strips and the function bar.
+// Those of the grid, its strips, the function bar and the list helpers.
 std::vector<Interaction> PlainInteractions();
 
 // Those of a chart of one series.

@@ -139,6 +139,21 @@ HWND CreateFunctionBar() {
     return bar;
 }
 
+HWND CreateListView() {
+    InitCommonControls();
+    const HWND list = CreateControl(WC_LISTVIEWW, LVS_REPORT, kHeight);
+    wchar_t title[] = L"Title";
+    LVCOLUMNW column = {};
+    column.mask = LVCF_TEXT | LVCF_WIDTH;
+    column.cx = kWidth / 2;
+    column.pszText = title;
+    for (int i = 0; i < 2; ++i) {
+        SendMessageW(list, LVM_INSERTCOLUMNW, static_cast<WPARAM>(i),
+                     reinterpret_cast<LPARAM>(&column));
+    }
+    return list;
+}
+
 std::vector<double> Noise(int count) {
     std::vector<double> values(static_cast<size_t>(count));
     unsigned seed = 1;

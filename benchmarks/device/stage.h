@@ -10,6 +10,7 @@ namespace footprint {
 
 constexpr int kWidth = 240;
 constexpr int kHeight = 320;
+constexpr int kInputPanelHeight = 80;
 
 // A top-level window with the controls of one run; it answers the grid's requests for cells with a
 // short text for each.
@@ -28,6 +29,7 @@ HWND CreateStrip();  // one without a grid, of four items
 HWND CreateChart(int type);
 HWND CreateToolTip();
 HWND CreateFunctionBar();  // with six items
+HWND CreateListView();     // with two columns
 
 // Numbers between -20 and 80 without order, the same each time.
 std::vector<double> Noise(int count);

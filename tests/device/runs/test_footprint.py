@@ -1,5 +1,5 @@
-"""The footprint's figures: the program that counts and the script that makes tables of them agree, the
-tables of the page are those of today's interactions, and the bars hold."""
+"""The footprint's figures: the program that counts and the script that makes tables of them agree,
+the tables of the page are those of today's interactions, and the bars hold."""
 
 import pathlib
 import re
@@ -75,7 +75,7 @@ def test_the_work_done_is_seen_in_the_counts(counted):
     for points in CHART_POINTS:
         drawn = instructions(counted, "redraw, line", points)
         assert instructions(counted, "pan by one tick, line", points) > drawn / 10
-        assert instructions(counted, "live update", points) > points
+        assert instructions(counted, "live update of all values", points) > points
     assert (instructions(counted, "tap on a value, line", 1000) >
             2 * instructions(counted, "removing it", 1000))
 
@@ -107,6 +107,13 @@ def test_a_bar_that_is_missed_is_named(image):
     assert len(missed) == 1 and "redraw, pie, 1,000 points: 10,000,001" in missed[0]
     large = footprint.Footprint(image + bytes(footprint.IMAGE_BAR - len(image)), "speed\t1")
     assert "not below 131,072" in large.missed_bars()[0]
+
+
+def test_what_wine_says_is_left_out(image):
+    counts = "wine: something has happened\nstack\t100\nspeed\t1\n"
+    assert footprint.Footprint(image, counts).stack == 100
+    with pytest.raises(ValueError, match="not a line of"):
+        footprint.Footprint(image, "another\tline\n")
 
 
 def test_counts_that_end_early_are_refused(image):
