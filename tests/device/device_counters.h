@@ -15,6 +15,8 @@ struct Counters {
     uint64_t importCalls;   // calls of the platform by the guest
     uint64_t callbacks;     // calls of the guest by the platform
     uint64_t exportCalls;   // calls of the guest by the program
+    uint32_t heapBytes;     // of blocks that the guest has allocated and not freed
+    uint32_t gdiObjects;    // with DCs and image lists, that it has made and not given back
     uint32_t stackLow;      // the guest's stack in this process; never used words hold kUnusedStack
     uint32_t stackSize;
 };

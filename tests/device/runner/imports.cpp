@@ -4,6 +4,7 @@
 #include "runner/counters.h"
 #include "runner/failure.h"
 #include "runner/guest_calls.h"
+#include "runner/holdings.h"
 #include "runner/host_calls.h"
 #include "runner/image.h"
 #include "runner/import_table.h"
@@ -31,6 +32,7 @@ struct Binding {
     bool takesProcedures;
     bool writes;         // from its first argument on
     int lengthArgument;  // then; or kUnknownLength
+    HoldingCall holding;
 };
 
 std::deque<Binding> bindings;              // references stay good while a call adds one
@@ -63,7 +65,8 @@ Binding Bind(const GuestImport& import) {
                     FindOwnFunction(import.name),
                     TakesProcedures(import.name),
                     false,
-                    kUnknownLength};
+                    kUnknownLength,
+                    FindHolding(import.name)};
     binding.writes = FindDestination(import.name, binding.lengthArgument);
     if (!FindPassing(import.name, library, binding.passing)) {
         Fail("%s!%s: no entry says how it is called", import.library.c_str(), import.name.c_str());
@@ -108,6 +111,16 @@ uint64_t BitsOf(double value) {
     return bits;
 }
 
+uint64_t CallBound(const Binding& binding, const uint32_t* words) {
+    const uint32_t target =
+        binding.import == kNoImport ? binding.function : ImportTarget(binding.import);
+    switch (binding.passing) {
+    case Passing::DoubleResult: return BitsOf(CallHostForDouble(target, words));
+    case Passing::Own: return binding.own(target, words);
+    default: return CallHost(target, words);
+    }
+}
+
 }  // namespace
 
 void BindImports() {
@@ -129,15 +142,10 @@ uint64_t CallImportedFunction(unsigned index, arm::Cpu& machine, bool& isWide) {
     const Words words(machine);
     if (binding.takesProcedures) AnnounceProcedures(binding.name, words.values);
     if (binding.writes) CheckDestination(machine, binding, words.values);
-    const uint32_t target =
-        binding.import == kNoImport ? binding.function : ImportTarget(binding.import);
-    switch (binding.passing) {
-    case Passing::DoubleResult:
-        isWide = true;
-        return BitsOf(CallHostForDouble(target, words.values));
-    case Passing::Own: return binding.own(target, words.values);
-    default: return CallHost(target, words.values);
-    }
+    const uint64_t result = CallBound(binding, words.values);
+    isWide = binding.passing == Passing::DoubleResult;
+    NoteHolding(binding.holding, words.values, static_cast<uint32_t>(result));
+    return result;
 }
 
 uint32_t CallDesktop(const std::string& name, std::initializer_list<uint32_t> words) {
@@ -153,7 +161,7 @@ uint32_t GuestAddressOf(uint32_t function) {
             return ImportAddress(static_cast<unsigned>(i));
         }
     }
-    bindings.push_back({"", Passing::Words, kNoImport, function, nullptr, false, false, 0});
+    bindings.push_back({"", Passing::Words, kNoImport, function, nullptr, false, false, 0, {}});
     return ImportAddress(static_cast<unsigned>(bindings.size() - 1));
 }
 
