@@ -59,13 +59,13 @@ PositionSummary Summarise(const double* values, int number, int end) {
     int i = number - 1;
     while (i < end - 1 && !IsFinite(values[i])) ++i;
     if (i == end - 1) return {-1, -1, -1, -1};
-    double least = values[i];
-    double most = values[i];
+    Comparable least = ComparableOf(values[i]);
+    Comparable most = least;
     PositionSummary found = {i, i, i, end - 2};
     for (++i; i < end - 1; ++i) {
-        const double value = values[i];
+        const Comparable value = ComparableOf(values[i]);
         if (least <= value && value <= most) continue;  // nearly always, so nothing else is asked
-        if (!IsFinite(value)) continue;
+        if (!IsFinite(values[i])) continue;
         if (value < least) {
             least = value;
             found.lowest = i;
@@ -92,7 +92,8 @@ void SeriesPoints::AppendPosition(const GraphRecord& graph, const GraphSeries& s
     const int column = xPixel(graph, number);
     int order[] = {found.first, found.lowest, found.highest, found.last};
     // All ways over both extremes have the same pixels; this is the shorter one.
-    if (series.values[found.first] > series.values[found.last]) std::swap(order[1], order[2]);
+    const Comparable first = ComparableOf(series.values[found.first]);
+    if (first > ComparableOf(series.values[found.last])) std::swap(order[1], order[2]);
     int previous = -1;
     for (const int index : order) {
         if (index != previous) Append(graph, series, column, index);
