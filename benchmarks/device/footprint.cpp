@@ -5,7 +5,8 @@
 //   interaction  name; points or 0; instructions; those in the arithmetic helpers; calls of the
 //                platform; "alike" when all runs were
 //   stack        the deepest use in bytes
-//   speed        million instructions interpreted in a second of processor time
+//   speed        million instructions interpreted in a second of processor time; all instructions
+//                of the process
 //
 //   device_footprint --quick    charts of up to 1,000 points only
 #include "interactions.h"
@@ -85,7 +86,8 @@ void MeasureSpeed() {
     });
     const double seconds = ProcessorSeconds() - start;
     CloseHost();
-    std::printf("speed\t%.0f\n", static_cast<double>(cost.instructions) / 1e6 / seconds);
+    std::printf("speed\t%.0f\t%llu\n", static_cast<double>(cost.instructions) / 1e6 / seconds,
+                static_cast<unsigned long long>(Counts().instructions));
 }
 
 }  // namespace

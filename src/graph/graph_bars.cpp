@@ -18,76 +18,77 @@ namespace {
 // So far outside the view that nothing of a pen is seen.
 constexpr LONG kBeyond = 2;
 
-// One way of laying out a chart's bars.
+// One way of laying out a chart's bars. A place is a pixel along the category axis and one along
+// the axis of the values.
 struct BarLayout {
     AlongAxis along;  // position of a point along the category axis, growing with its number
-    int lowPixel;     // the view along that axis
+    AlongAxis value;  // pixel of a value
+    int lowPixel;     // the view along the category axis
     int highPixel;
     RECT view;
     int thickness;
-    // Pixel of a value in the bar of a point, `across` pixels beside the point's own position.
-    POINT (*place)(const GraphRecord& graph, int number, double value, int across);
+    POINT (*place)(int along, int value);
     POINT growth;  // the pixel after another as values grow
 };
 
 // Rows grow downwards, point numbers upwards: turned round they grow together.
 int RowUpwards(const GraphRecord& graph, double pointNumber) { return -yPixel(graph, pointNumber); }
 
-POINT PlaceInColumn(const GraphRecord& graph, int number, double value, int across) {
-    return {xPixel(graph, number) + across, yPixel(graph, value)};
-}
+POINT PlaceInColumn(int column, int row) { return {column, row}; }
 
-POINT PlaceInBar(const GraphRecord& graph, int number, double value, int across) {
-    return {xPixel(graph, value), yPixel(graph, number) - across};
-}
+POINT PlaceInBar(int rowUpwards, int column) { return {column, -rowUpwards}; }
 
+// A bar from one pixel of the values' axis to another, beginning at a position on the categories'.
 // Sides that lie out of view are moved to just outside it: Polygon's time grows with each row that
 // it spans, seen or not.
-void DrawOneBar(const GraphRecord& graph, HDC dc, const BarLayout& layout, int number, double value,
-                int offset) {
+void DrawOneBar(HDC dc, const BarLayout& layout, int position, int from, int to) {
     const RECT& view = layout.view;
-    const auto corner = [&](double at, int across) -> POINT {
-        const POINT place = layout.place(graph, number, at, across);
+    const auto corner = [&](int along, int value) -> POINT {
+        const POINT place = layout.place(along, value);
         return {std::clamp(place.x, view.left - kBeyond, view.right + kBeyond),
                 std::clamp(place.y, view.top - kBeyond, view.bottom + kBeyond)};
     };
-    const int past = offset + layout.thickness;
-    const POINT corners[] = {corner(0, offset), corner(value, offset), corner(value, past),
-                             corner(0, past)};
+    const int past = position + layout.thickness;
+    const POINT corners[] = {corner(position, from), corner(position, to), corner(past, to),
+                             corner(past, from)};
     Polygon(dc, corners, 4);
 }
 
 // The bars of the points [number, end), which share a position and have no thickness.
 void DrawThinBarsTogether(const GraphRecord& graph, HDC dc, const GraphSeries& series,
-                          const BarLayout& layout, int number, int end, int offset) {
+                          const BarLayout& layout, int position, int number, int end) {
     const PositionSummary found = Summarise(series.values, number, end);
     if (found.first < 0) return;
     const double least = series.values[found.lowest];
     const double most = series.values[found.highest];
-    const POINT low = layout.place(graph, number, std::min(least, 0.0), offset);
-    const POINT high = layout.place(graph, number, std::max(most, 0.0), offset);
-    if (low.x == high.x && low.y == high.y) {  // a point; the platform says what that looks like
-        DrawOneBar(graph, dc, layout, number, most, offset);
+    const int lowEnd = layout.value(graph, std::min(least, 0.0));
+    const int highEnd = layout.value(graph, std::max(most, 0.0));
+    if (lowEnd == highEnd) {  // a point; the platform says what that looks like
+        DrawOneBar(dc, layout, position, lowEnd, highEnd);
         return;
     }
-    const POINT ends[] = {low, {high.x + layout.growth.x, high.y + layout.growth.y}};
+    const POINT high = layout.place(position, highEnd);
+    const POINT ends[] = {layout.place(position, lowEnd),
+                          {high.x + layout.growth.x, high.y + layout.growth.y}};
     Polyline(dc, ends, 2);  // leaves its last pixel out
 }
 
 void DrawThinBars(const GraphRecord& graph, HDC dc, const GraphSeries& series,
                   const BarLayout& layout, PointRange range, int offset) {
-    for (int number = range.first; number <= range.last;) {
-        const int end = EndOfPosition(graph, layout.along, range, number);
-        DrawThinBarsTogether(graph, dc, series, layout, number, end, offset);
-        number = end;
+    for (PositionWalk walk(graph, layout.along, range); !walk.IsAtEnd(); walk.Next()) {
+        DrawThinBarsTogether(graph, dc, series, layout, walk.pixel() + offset, walk.number(),
+                             walk.end());
     }
 }
 
 void DrawThickBars(const GraphRecord& graph, HDC dc, const GraphSeries& series,
                    const BarLayout& layout, PointRange range, int offset) {
+    const int zero = layout.value(graph, 0);
     for (int number = range.first; number <= range.last; ++number) {
         const double value = series.values[number - 1];
-        if (IsFinite(value)) DrawOneBar(graph, dc, layout, number, value, offset);
+        if (!IsFinite(value)) continue;
+        DrawOneBar(dc, layout, layout.along(graph, number) + offset, zero,
+                   layout.value(graph, value));
     }
 }
 
@@ -124,7 +125,7 @@ void DrawColumnChart(GraphRecord& graph, HDC dc) {
         const RECT view = PlotClip(graph);
         const int thickness = ZoomedThickness(graph, graph.barWidth);
         DrawBars(graph, dc,
-                 {xPixel, view.left, view.right, view, thickness, PlaceInColumn, {0, -1}});
+                 {xPixel, yPixel, view.left, view.right, view, thickness, PlaceInColumn, {0, -1}});
     });
 }
 
@@ -132,8 +133,9 @@ void DrawBarChart(GraphRecord& graph, HDC dc) {
     DrawInFrame(graph, dc, [&] {
         const RECT view = PlotClip(graph);
         const int thickness = ZoomedThickness(graph, graph.barHeight);
-        DrawBars(graph, dc,
-                 {RowUpwards, -view.bottom, -view.top, view, thickness, PlaceInBar, {1, 0}});
+        DrawBars(
+            graph, dc,
+            {RowUpwards, xPixel, -view.bottom, -view.top, view, thickness, PlaceInBar, {1, 0}});
     });
 }
 

@@ -9,55 +9,51 @@
 #include <algorithm>
 #include <cmath>
 
+#include "numbers/double_bits.h"
+
 namespace kor {
 
 namespace {
 
-constexpr double kQuarter = 90.0;
-constexpr double kThreeQuarters = 270.0;
 constexpr double kRadiansPerDegree = 0.017453292519943295;
-constexpr int kFarAway = 1 << 24;
+constexpr int kSteepExponent = 15;  // such slopes leave every disc on the first row, or nearly so
 
 int RoundHalfAway(double value) {
-    if (value >= kFarAway) return kFarAway;
-    if (value <= -kFarAway) return -kFarAway;
+    if (value >= kBeyondDisc) return kBeyondDisc;
+    if (value <= -kBeyondDisc) return -kBeyondDisc;
     return static_cast<int>(value >= 0 ? value + 0.5 : value - 0.5);
 }
 
-// Column of the last pixel on the near side of an edge where it crosses a row; the row must lie
-// within the edge's half of the disc.
-int Crossing(SliceEdge edge, int dy) { return RoundHalfAway(dy * edge.columnsPerRow); }
-
 // Left half of a row above the centre, angles 0 to 90: the first column left of the edge's pixels,
 // as a bound that is exclusive on the right.
-int LeftBoundAbove(SliceEdge edge, int dy) {
+int LeftBoundAbove(const SliceEdge& edge, int dy) {
     if (edge.degrees <= 0) return 0;
-    if (edge.degrees >= kQuarter) return -kFarAway;
-    return Crossing(edge, dy);
+    if (edge.degrees >= kQuarterTurn) return -kBeyondDisc;
+    return CrossingOf(edge, dy);
 }
 
 // Right half of a row above, angles 270 to 360.
-int RightBoundAbove(SliceEdge edge, int dy) {
-    if (edge.degrees <= kThreeQuarters) return kFarAway;
+int RightBoundAbove(const SliceEdge& edge, int dy) {
+    if (edge.degrees <= kThreeQuarterTurns) return kBeyondDisc;
     if (edge.degrees >= 360.0) return 0;
-    return std::max(Crossing(edge, dy), 0);
+    return std::max(CrossingOf(edge, dy), 0);
 }
 
 // A row below, angles 90 to 270: the first column that is not before the edge.
-int BoundBelow(SliceEdge edge, int dy) {
-    if (edge.degrees <= kQuarter) return -kFarAway;
-    if (edge.degrees >= kThreeQuarters) return kFarAway;
-    return Crossing(edge, dy);
+int BoundBelow(const SliceEdge& edge, int dy) {
+    if (edge.degrees <= kQuarterTurn) return -kBeyondDisc;
+    if (edge.degrees >= kThreeQuarterTurns) return kBeyondDisc;
+    return CrossingOf(edge, dy);
 }
 
 // The centre's own row: left of the centre at 90 degrees, the rest at 270.
-SliceRow SliceOnCentreRow(SliceEdge start, SliceEdge end, int halfWidth) {
+SliceRow SliceOnCentreRow(const SliceEdge& start, const SliceEdge& end, int halfWidth) {
     const auto holds = [&](double degrees) {
         return start.degrees <= degrees && degrees < end.degrees;
     };
     SliceRow row = {};
-    if (holds(kQuarter)) row.runs[0] = {-halfWidth, 0};
-    if (holds(kThreeQuarters)) row.runs[1] = {0, halfWidth};
+    if (holds(kQuarterTurn)) row.runs[0] = {-halfWidth, 0};
+    if (holds(kThreeQuarterTurns)) row.runs[1] = {0, halfWidth};
     return row;
 }
 
@@ -87,20 +83,24 @@ void WalkCircle(int radius, int32_t* halfWidths) {
 
 SliceEdge MakeSliceEdge(double degrees) {
     const double angle = degrees * kRadiansPerDegree;
-    return {degrees, std::tan(angle)};  // dx = -r sin a, dy = -r cos a
+    const double slope = std::tan(angle);  // dx = -r sin a, dy = -r cos a
+    const bool isSteep = BiasedExponentOf(slope) - kExponentBias >= kSteepExponent;
+    return {degrees, slope, isSteep ? kTooSteep : static_cast<int64_t>(slope * 0x1p32)};
 }
 
-SliceRow SliceOnRow(SliceEdge start, SliceEdge end, int dy, int halfWidth) {
+int CrossingOf(const SliceEdge& edge, int dy) { return RoundHalfAway(dy * edge.columnsPerRow); }
+
+SliceRow SliceOnRow(const SliceEdge& start, const SliceEdge& end, int dy, int halfWidth) {
     if (dy == 0) return SliceOnCentreRow(start, end, halfWidth);
     SliceRow row = {};
     if (dy > 0) {
         row.runs[0] = Within({BoundBelow(start, dy), BoundBelow(end, dy)}, -halfWidth, halfWidth);
         return row;
     }
-    if (start.degrees < kQuarter) {
+    if (start.degrees < kQuarterTurn) {
         row.runs[0] = Within({LeftBoundAbove(end, dy), LeftBoundAbove(start, dy)}, -halfWidth, 0);
     }
-    if (end.degrees > kThreeQuarters) {
+    if (end.degrees > kThreeQuarterTurns) {
         row.runs[1] = Within({RightBoundAbove(end, dy), RightBoundAbove(start, dy)}, 0, halfWidth);
     }
     return row;

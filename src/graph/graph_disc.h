@@ -5,6 +5,10 @@
 
 namespace kor {
 
+constexpr double kQuarterTurn = 90.0;
+constexpr double kThreeQuarterTurns = 270.0;
+constexpr int kBeyondDisc = 1 << 24;  // a column outside every disc
+
 // Columns [from, to) of a row, counted from the disc's centre; empty when to <= from.
 struct DiscRun {
     int from;
@@ -25,12 +29,19 @@ struct SliceRow {
 struct SliceEdge {
     double degrees;
     double columnsPerRow;  // dx / dy of the radius at that angle
+    int64_t step;          // the same in 2^-32 columns, cut off, or kTooSteep
 };
+
+constexpr int64_t kTooSteep = INT64_MIN;
 
 SliceEdge MakeSliceEdge(double degrees);
 
 // The row `dy` of the slice from one edge to the other within the half width. Every pixel of a disc
 // belongs to exactly one of several slices that follow one another from 0 to 360 degrees.
-SliceRow SliceOnRow(SliceEdge start, SliceEdge end, int dy, int halfWidth);
+SliceRow SliceOnRow(const SliceEdge& start, const SliceEdge& end, int dy, int halfWidth);
+
+// Column of the last pixel on the near side of an edge where it crosses the row `dy`, which must
+// lie within the edge's half of the disc: the slope times the row, rounded half away from zero.
+int CrossingOf(const SliceEdge& edge, int dy);
 
 }  // namespace kor

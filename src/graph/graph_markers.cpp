@@ -9,6 +9,7 @@
 #include "graph/graph_scale.h"
 #include "platform/gdi_scopes.h"
 #include "platform/local_text.h"
+#include "platform/runtime.h"
 
 namespace kor {
 
@@ -22,18 +23,18 @@ void DrawCircle(HDC dc, int x, int y) {
     Ellipse(dc, x - kRadius, y - kRadius, x + kRadius, y + kRadius);
 }
 
-// Of each row of the circle's square, the columns that it covers: [from, to).
-struct CircleRuns {
-    int8_t from[kSide];
-    int8_t to[kSide];
+// Of each row of the circle's square, the columns that it covers: a bit for each, the lowest for
+// the leftmost. They are neighbours.
+struct CircleRows {
+    uint32_t bits[kSide];
 };
 
 // Draws one circle on a scratch bitmap and reads which pixels it has. The result is the same for
 // every screen, so it is learnt once in the process.
-const CircleRuns* LearnCircle(HDC like) {
-    static constinit CircleRuns runs = {};
+const CircleRows* LearnCircle(HDC like) {
+    static constinit CircleRows rows = {};
     static constinit bool learnt = false;
-    if (learnt) return &runs;
+    if (learnt) return &rows;
     HDC dc = CreateCompatibleDC(like);
     HBITMAP bitmap = dc ? CreateCompatibleBitmap(like, kSide, kSide) : nullptr;
     if (bitmap) {
@@ -43,71 +44,82 @@ const CircleRuns* LearnCircle(HDC like) {
         SelectScope brush(dc, GetStockObject(BLACK_BRUSH));
         Ellipse(dc, 0, 0, kSide, kSide);
         for (int y = 0; y < kSide; ++y) {
-            int from = 0;
-            int to = kSide;
-            while (from < kSide && GetPixel(dc, from, y) != RGB(0, 0, 0)) ++from;
-            while (to > from && GetPixel(dc, to - 1, y) != RGB(0, 0, 0)) --to;
-            runs.from[y] = static_cast<int8_t>(from);
-            runs.to[y] = static_cast<int8_t>(to);
+            rows.bits[y] = 0;
+            for (int x = 0; x < kSide; ++x) {
+                if (GetPixel(dc, x, y) == RGB(0, 0, 0)) rows.bits[y] |= 1u << x;
+            }
         }
         learnt = true;
     }
     if (bitmap) DeleteObject(bitmap);
     if (dc) DeleteDC(dc);
-    return learnt ? &runs : nullptr;
+    return learnt ? &rows : nullptr;
 }
 
-// Which pixels of an area are covered by runs that begin or end anywhere in it: per row, how many
-// more runs cover a column than the one before.
+// The pixels of an area that circles cover, a bit for each.
 class Coverage {
 public:
-    Coverage(int left, int top, int width, int height)
-        : left_(left), top_(top), width_(width), height_(height),
-          steps_(AllocateLocal<int32_t>(static_cast<uint32_t>((width + 1) * height))) {}
-    ~Coverage() { FreeLocal(steps_); }
+    explicit Coverage(const RECT& area)
+        : area_(area), words_((area.right - area.left) / kWordBits + 1 + 2 * kSpareWords),
+          bits_(AllocateLocal<uint32_t>(static_cast<uint32_t>(words_ * (area.bottom - area.top)))) {
+    }
+    ~Coverage() { FreeLocal(bits_); }
     Coverage(const Coverage&) = delete;
     Coverage& operator=(const Coverage&) = delete;
 
-    bool IsMade() const { return steps_ != nullptr; }
+    bool IsMade() const { return bits_ != nullptr; }
 
-    void AddCircle(const CircleRuns& circle, int x, int y) {
-        for (int row = 0; row < kSide; ++row) {
-            Add(y - kRadius + row, x - kRadius + circle.from[row], x - kRadius + circle.to[row]);
+    void AddCircle(const CircleRows& circle, int x, int y) {
+        const int left = x - kRadius;
+        if (left + kSide <= area_.left || left >= area_.right) return;
+        const auto place = static_cast<uint32_t>(left - area_.left + kSpareWords * kWordBits);
+        const uint32_t shift = place % kWordBits;
+        const int first = std::max(y - kRadius, static_cast<int>(area_.top));
+        const int past = std::min(y - kRadius + kSide, static_cast<int>(area_.bottom));
+        for (int row = first; row < past; ++row) {
+            const uint32_t covered = circle.bits[row - (y - kRadius)];
+            uint32_t* bits = bits_ + (row - area_.top) * words_ + place / kWordBits;
+            bits[0] |= covered << shift;
+            if (shift > kWordBits - kSide) bits[1] |= covered >> (kWordBits - shift);
         }
     }
 
     // fill(x, y, width) for every run of covered pixels.
     template <typename Fill>
     void ForEachRun(Fill fill) const {
-        for (int row = 0; row < height_; ++row) {
-            const int32_t* steps = steps_ + row * (width_ + 1);
-            int depth = 0;
-            int start = 0;
-            for (int x = 0; x <= width_; ++x) {
-                const int next = depth + steps[x];
-                if (depth == 0 && next > 0) start = x;
-                if (depth > 0 && next == 0) fill(left_ + start, top_ + row, x - start);
-                depth = next;
+        for (int y = area_.top; y < area_.bottom; ++y) {
+            const uint32_t* row = bits_ + (y - area_.top) * words_ + kSpareWords;
+            for (int x = area_.left; x < area_.right;) {
+                const int start = FindColumn(row, x, true);
+                x = FindColumn(row, start, false);
+                if (start < x) fill(start, y, x - start);
             }
         }
     }
 
 private:
-    void Add(int y, int from, int to) {
-        const int row = y - top_;
-        if (row < 0 || row >= height_) return;
-        const int first = std::clamp(from - left_, 0, width_);
-        const int past = std::clamp(to - left_, 0, width_);
-        int32_t* steps = steps_ + row * (width_ + 1);
-        ++steps[first];
-        --steps[past];
+    static constexpr int kWordBits = 32;
+    static constexpr int kSpareWords = 1;  // on both sides, for circles that reach out of the area
+
+    // The first column from x on that is covered, or is not; the area's end when there is none.
+    int FindColumn(const uint32_t* row, int x, bool covered) const {
+        const uint32_t other = covered ? 0 : ~0u;
+        while (x < area_.right) {
+            const auto place = static_cast<uint32_t>(x - area_.left);
+            uint32_t rest = (row[place / kWordBits] ^ other) >> (place % kWordBits);
+            if (rest == 0) {
+                x += kWordBits - static_cast<int>(place % kWordBits);
+                continue;
+            }
+            for (; (rest & 1) == 0; rest >>= 1) ++x;
+            return std::min(x, static_cast<int>(area_.right));
+        }
+        return area_.right;
     }
 
-    int left_;
-    int top_;
-    int width_;
-    int height_;
-    int32_t* steps_;
+    RECT area_;
+    int words_;  // of each row
+    uint32_t* bits_;
 };
 
 // Rows of one image column that hold a point: each point counts once however often it comes, and
@@ -125,8 +137,9 @@ public:
 
     // Begins a column whose points lie between two rows, both included.
     void Begin(int highest, int lowest) {
-        std::fill_n(rows_, height_, uint8_t{0});
-        missing_ = std::min(lowest, top_ + height_ - 1) - std::max(highest, top_) + 1;
+        const int first = std::max(highest - top_, 0);
+        missing_ = std::min(lowest - top_, height_ - 1) - first + 1;
+        if (missing_ > 0) memset(rows_ + first, 0, static_cast<size_t>(missing_));
     }
 
     bool MayGrow() const { return missing_ > 0; }
@@ -164,18 +177,14 @@ void ForEachNewRow(const GraphRecord& graph, const double* values, int number, i
 
 bool DrawUnited(const GraphRecord& graph, HDC dc, const GraphSeries& series, PointRange range,
                 const RECT& view) {
-    const CircleRuns* circle = LearnCircle(dc);
+    const CircleRows* circle = LearnCircle(dc);
     if (!circle) return false;
-    const int height = view.bottom - view.top;
-    Coverage coverage(view.left, view.top, view.right - view.left, height);
-    RowSet seen(view.top - kRadius, height + kSide);
+    Coverage coverage(view);
+    RowSet seen(view.top - kRadius, view.bottom - view.top + kSide);
     if (!coverage.IsMade() || !seen.IsMade()) return false;
-    for (int number = range.first; number <= range.last;) {
-        const int x = xPixel(graph, number);
-        const int end = EndOfPosition(graph, xPixel, range, number);
-        ForEachNewRow(graph, series.values, number, end, seen,
-                      [&](int y) { coverage.AddCircle(*circle, x, y); });
-        number = end;
+    for (PositionWalk walk(graph, xPixel, range); !walk.IsAtEnd(); walk.Next()) {
+        ForEachNewRow(graph, series.values, walk.number(), walk.end(), seen,
+                      [&](int y) { coverage.AddCircle(*circle, walk.pixel(), y); });
     }
     coverage.ForEachRun([&](int x, int y, int width) { PatBlt(dc, x, y, width, 1, PATCOPY); });
     return true;

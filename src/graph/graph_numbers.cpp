@@ -19,6 +19,7 @@ void ShortenExponent(wchar_t* text) {
 }  // namespace
 
 int TruncateToInt(double value) {
+    if constexpr (!kHasFloatingPoint) return TruncateByBits(value, kPixelLimitBits);
     if (value >= kPixelLimit) return kPixelLimit;
     if (value <= -kPixelLimit) return -kPixelLimit;
     return value == value ? static_cast<int>(value) : 0;

@@ -5,11 +5,11 @@
 #include <algorithm>
 #include <cmath>
 
-#include "graph/graph_disc.h"
 #include "graph/graph_frame.h"
 #include "graph/graph_numbers.h"
 #include "graph/graph_palette.h"
 #include "graph/graph_series.h"
+#include "graph/graph_slice_walk.h"
 #include "platform/gdi_scopes.h"
 #include "platform/local_text.h"
 
@@ -35,22 +35,69 @@ POINT RadiusEnd(int radius, double degrees) {
     return {TruncateToInt(dx), TruncateToInt(dy)};
 }
 
-void DrawSlice(HDC dc, const PieLayout& pie, COLORREF colour, double start, double end) {
-    LocalGdiObject<HPEN> pen(CreatePen(PS_SOLID, 1, colour));
-    SelectScope selected(dc, pen.get());
-    FillPieSlice(dc, pie.centre.x, pie.centre.y, pie.radius, start, end);
+// Where one slice ends and the next one begins. The three functions of its angle cost much where
+// there is no floating-point unit, so both slices share them.
+struct Boundary {
+    SliceEdge edge;
+    POINT end;  // of its radius, from the centre
+};
+
+Boundary BoundaryAt(int radius, double degrees) {
+    return {MakeSliceEdge(degrees), RadiusEnd(radius, degrees)};
 }
 
+// Rows that hold pixels of a slice, and some more: from the centre to its arc.
+RowRange RowsOfSlice(int radius, const Boundary& start, const Boundary& end) {
+    constexpr int kSpare = 2;
+    const int startRow = start.end.y;
+    const int endRow = end.end.y;
+    const bool reachesBottom = start.edge.degrees <= 180.0 && end.edge.degrees >= 180.0;
+    const int lowest = reachesBottom ? radius : std::max({startRow, endRow, 0});
+    return {std::max(std::min({startRow, endRow, 0}) - kSpare, -radius),
+            std::min(lowest + kSpare, radius)};
+}
+
+// The disc of a pie, to be filled slice by slice with horizontal runs. Slices that meet at an angle
+// share no pixel and leave none out.
+class DiscFiller {
+public:
+    DiscFiller(HDC dc, const PieLayout& pie) : dc_(dc), pie_(pie) {
+        if (pie.radius < 1) return;
+        halfWidths_ = AllocateLocal<int32_t>(static_cast<uint32_t>(pie.radius) + 1);
+        if (halfWidths_) WalkCircle(pie.radius, halfWidths_);
+    }
+    ~DiscFiller() { FreeLocal(halfWidths_); }
+    DiscFiller(const DiscFiller&) = delete;
+    DiscFiller& operator=(const DiscFiller&) = delete;
+
+    void Fill(const Boundary& start, const Boundary& end, COLORREF colour) const {
+        LocalGdiObject<HPEN> pen(CreatePen(PS_SOLID, 1, colour));
+        SelectScope selected(dc_, pen.get());
+        if (!halfWidths_ || !(end.edge.degrees > start.edge.degrees)) return;
+        const POINT centre = pie_.centre;
+        WalkSlice(start.edge, end.edge, RowsOfSlice(pie_.radius, start, end), halfWidths_,
+                  [&](int dy, DiscRun run) {
+                      const POINT ends[] = {{centre.x + run.from, centre.y + dy},
+                                            {centre.x + run.to, centre.y + dy}};
+                      Polyline(dc_, ends, 2);
+                  });
+    }
+
+private:
+    HDC dc_;
+    const PieLayout& pie_;
+    int32_t* halfWidths_ = nullptr;
+};
+
 void DrawSlices(const GraphSeries& series, HDC dc, const PieLayout& pie) {
-    double end = 0;
-    POINT boundary = {0, -pie.radius};
+    const DiscFiller disc(dc, pie);
+    Boundary end = BoundaryAt(pie.radius, 0);
     for (int k = 0; k < series.pointCount; ++k) {
-        const double start = end;
-        end += SliceShare(series, k) * kFullTurn;
-        DrawSlice(dc, pie, SliceColour(k), start, end);
-        DrawRadius(dc, pie.centre, boundary.x, boundary.y);  // the fill may have covered it
-        boundary = RadiusEnd(pie.radius, end);
-        DrawRadius(dc, pie.centre, boundary.x, boundary.y);
+        const Boundary start = end;
+        end = BoundaryAt(pie.radius, start.edge.degrees + SliceShare(series, k) * kFullTurn);
+        disc.Fill(start, end, SliceColour(k));
+        DrawRadius(dc, pie.centre, start.end.x, start.end.y);  // the fill may have covered it
+        DrawRadius(dc, pie.centre, end.end.x, end.end.y);
     }
 }
 
@@ -136,47 +183,6 @@ void RotateVector(double& dx, double& dy, double degrees) {
     const double turnedX = dx * cosine + dy * sine;
     dy = -dx * sine + dy * cosine;
     dx = turnedX;
-}
-
-namespace {
-
-// Rows from the centre's that hold pixels of a slice, and some more: from the centre to its arc.
-struct RowRange {
-    int first;
-    int last;
-};
-
-RowRange RowsOfSlice(int radius, double startDegrees, double endDegrees) {
-    constexpr int kSpare = 2;
-    const int start = RadiusEnd(radius, startDegrees).y;
-    const int end = RadiusEnd(radius, endDegrees).y;
-    const bool reachesBottom = startDegrees <= 180.0 && endDegrees >= 180.0;
-    const int lowest = reachesBottom ? radius : std::max({start, end, 0});
-    return {std::max(std::min({start, end, 0}) - kSpare, -radius),
-            std::min(lowest + kSpare, radius)};
-}
-
-}  // namespace
-
-void FillPieSlice(HDC dc, int centreX, int centreY, int radius, double startDegrees,
-                  double endDegrees) {
-    if (radius < 1 || !(endDegrees > startDegrees)) return;
-    auto* halfWidths = AllocateLocal<int32_t>(static_cast<uint32_t>(radius) + 1);
-    if (!halfWidths) return;
-    WalkCircle(radius, halfWidths);
-    const SliceEdge start = MakeSliceEdge(startDegrees);
-    const SliceEdge end = MakeSliceEdge(endDegrees);
-    const RowRange rows = RowsOfSlice(radius, startDegrees, endDegrees);
-    for (int dy = rows.first; dy <= rows.last; ++dy) {
-        const SliceRow row = SliceOnRow(start, end, dy, halfWidths[dy < 0 ? -dy : dy]);
-        for (const DiscRun& run : row.runs) {
-            if (run.to <= run.from) continue;
-            const POINT ends[] = {{centreX + run.from, centreY + dy},
-                                  {centreX + run.to, centreY + dy}};
-            Polyline(dc, ends, 2);
-        }
-    }
-    LocalFree(halfWidths);
 }
 
 void DrawPieChart(GraphRecord& graph, HDC dc) {

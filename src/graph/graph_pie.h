@@ -28,10 +28,4 @@ void RotateVector(double& dx, double& dy, double degrees);
 
 void DrawPieChart(GraphRecord& graph, HDC dc);
 
-// Fills the pixels of one slice of a disc with horizontal runs of the pen selected in `dc`. Angles
-// are degrees from 12 o'clock, counter-clockwise. Slices that meet at an angle share no pixel and
-// leave none out.
-void FillPieSlice(HDC dc, int centreX, int centreY, int radius, double startDegrees,
-                  double endDegrees);
-
 }  // namespace kor

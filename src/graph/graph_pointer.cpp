@@ -27,25 +27,25 @@ void ShowValueAt(const GraphRecord& graph, int x, int y) {
 // Each step moves the view by one tick, while there is data beyond that edge.
 void PanLeft(GraphRecord& graph, const RECT& plot) {
     if (xPixel(graph, graph.xDataMin) >= plot.left) return;
-    graph.xCentre -= graph.xTickStep;
+    MoveXCentre(graph, -graph.xTickStep);
     RedrawGraph(graph);
 }
 
 void PanRight(GraphRecord& graph, const RECT& plot) {
     if (xPixel(graph, graph.xDataMax) <= plot.right) return;
-    graph.xCentre += graph.xTickStep;
+    MoveXCentre(graph, graph.xTickStep);
     RedrawGraph(graph);
 }
 
 void PanUp(GraphRecord& graph, const RECT& plot) {
     if (yPixel(graph, graph.yDataMax) >= plot.top) return;
-    graph.yCentre += graph.yTickStep;
+    MoveYCentre(graph, graph.yTickStep);
     RedrawGraph(graph);
 }
 
 void PanDown(GraphRecord& graph, const RECT& plot) {
     if (yPixel(graph, graph.yDataMin) <= plot.bottom) return;
-    graph.yCentre -= graph.yTickStep;
+    MoveYCentre(graph, -graph.yTickStep);
     RedrawGraph(graph);
 }
 

@@ -42,30 +42,55 @@ PointRange PointsBetween(const GraphRecord& graph, AlongAxis along, int count, i
     return {std::max(first - 1, 1), std::min(past, count)};
 }
 
-int EndOfPosition(const GraphRecord& graph, AlongAxis along, PointRange range, int number) {
-    const int position = along(graph, number);
-    // Positions are evenly spread: widen the steps until one is past, then look closer.
-    int step = 1;
-    int low = number;
-    while (low + step <= range.last && along(graph, low + step) == position) {
-        low += step;
-        step *= 2;
+PositionWalk::PositionWalk(const GraphRecord& graph, AlongAxis along, PointRange range)
+    : graph_(graph), along_(along), range_(range), number_(range.first), end_(range.first) {
+    if (IsAtEnd()) return;
+    pixel_ = along(graph, number_);
+    FindEnd(number_ + 1);
+}
+
+void PositionWalk::Next() {
+    const int length = end_ - number_;
+    number_ = end_;
+    pixel_ = endPixel_;
+    if (!IsAtEnd()) FindEnd(number_ + length);
+}
+
+// Positions are evenly spread, so each has as many points as the one before, or one more or less.
+void PositionWalk::FindEnd(int expected) {
+    low_ = number_;
+    end_ = range_.last + 1;
+    if (expected < end_) Try(expected);
+    if (low_ == expected) {
+        for (int step = 1; step < end_ - low_; step *= 2) Try(low_ + step);
+    } else if (end_ - low_ > 1) {
+        Try(end_ - 1);
     }
-    const int high = std::min(low + step, range.last + 1);
-    return FirstAtOrPast(graph, along, low + 1, high, position + 1);
+    while (end_ - low_ > 1) Try(low_ + (end_ - low_) / 2);
+}
+
+// Narrows the place of the end by a point between the two that are known.
+void PositionWalk::Try(int number) {
+    const int pixel = along_(graph_, number);
+    if (pixel == pixel_) {
+        low_ = number;
+    } else {
+        end_ = number;
+        endPixel_ = pixel;
+    }
 }
 
 PositionSummary Summarise(const double* values, int number, int end) {
     int i = number - 1;
     while (i < end - 1 && !IsFinite(values[i])) ++i;
     if (i == end - 1) return {-1, -1, -1, -1};
-    double least = values[i];
-    double most = values[i];
+    Comparable least = ComparableOf(values[i]);
+    Comparable most = least;
     PositionSummary found = {i, i, i, end - 2};
     for (++i; i < end - 1; ++i) {
-        const double value = values[i];
+        const Comparable value = ComparableOf(values[i]);
         if (least <= value && value <= most) continue;  // nearly always, so nothing else is asked
-        if (!IsFinite(value)) continue;
+        if (!IsFinite(values[i])) continue;
         if (value < least) {
             least = value;
             found.lowest = i;
@@ -85,14 +110,14 @@ void SeriesPoints::Append(const GraphRecord& graph, const GraphSeries& series, i
     points_[spare_ + count_++] = {column, yPixel(graph, series.values[index])};
 }
 
-void SeriesPoints::AppendPosition(const GraphRecord& graph, const GraphSeries& series, int number,
-                                  int end) {
+void SeriesPoints::AppendPosition(const GraphRecord& graph, const GraphSeries& series, int column,
+                                  int number, int end) {
     const PositionSummary found = Summarise(series.values, number, end);
     if (found.first < 0) return;
-    const int column = xPixel(graph, number);
     int order[] = {found.first, found.lowest, found.highest, found.last};
     // All ways over both extremes have the same pixels; this is the shorter one.
-    if (series.values[found.first] > series.values[found.last]) std::swap(order[1], order[2]);
+    const Comparable first = ComparableOf(series.values[found.first]);
+    if (first > ComparableOf(series.values[found.last])) std::swap(order[1], order[2]);
     int previous = -1;
     for (const int index : order) {
         if (index != previous) Append(graph, series, column, index);
@@ -104,7 +129,7 @@ void SeriesPoints::AppendPosition(const GraphRecord& graph, const GraphSeries& s
 // it: a line that ends there leaves it out, but one that has gone over it before has drawn it. So
 // what comes before them is summarised by itself.
 void SeriesPoints::AppendLastPosition(const GraphRecord& graph, const GraphSeries& series,
-                                      int number, int end) {
+                                      int column, int number, int end) {
     const double* values = series.values;
     const int last = end - 1;
     const int row = yPixel(graph, values[last - 1]);
@@ -114,8 +139,7 @@ void SeriesPoints::AppendLastPosition(const GraphRecord& graph, const GraphSerie
         if (yPixel(graph, values[i - 1]) != row) break;
         first = i;
     }
-    AppendPosition(graph, series, number, first);
-    const int column = xPixel(graph, number);
+    AppendPosition(graph, series, column, number, first);
     if (first != last) Append(graph, series, column, first - 1);
     Append(graph, series, column, last - 1);
 }
@@ -133,14 +157,12 @@ bool SeriesPoints::Make(const GraphRecord& graph, const GraphSeries& series, int
         LocalAlloc(LMEM_FIXED, static_cast<SIZE_T>(most + 2 * spare) * sizeof(POINT)));
     if (!points_) return false;
     spare_ = spare;
-    for (int number = range.first; number <= range.last;) {
-        const int end = EndOfPosition(graph, xPixel, range, number);
-        if (shape == PointsOf::polyline && end > range.last) {
-            AppendLastPosition(graph, series, number, end);
+    for (PositionWalk walk(graph, xPixel, range); !walk.IsAtEnd(); walk.Next()) {
+        if (shape == PointsOf::polyline && walk.end() > range.last) {
+            AppendLastPosition(graph, series, walk.pixel(), walk.number(), walk.end());
         } else {
-            AppendPosition(graph, series, number, end);
+            AppendPosition(graph, series, walk.pixel(), walk.number(), walk.end());
         }
-        number = end;
     }
     return true;
 }

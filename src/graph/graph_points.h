@@ -21,8 +21,31 @@ using AlongAxis = int (*)(const GraphRecord& graph, double pointNumber);
 PointRange PointsBetween(const GraphRecord& graph, AlongAxis along, int count, int lowPixel,
                          int highPixel);
 
-// The number after the last one that has the position of point `number`, at most range.last + 1.
-int EndOfPosition(const GraphRecord& graph, AlongAxis along, PointRange range, int number);
+// The points of a range that share a position, one position after the other.
+class PositionWalk {
+public:
+    PositionWalk(const GraphRecord& graph, AlongAxis along, PointRange range);
+
+    bool IsAtEnd() const { return number_ > range_.last; }
+    void Next();
+
+    int pixel() const { return pixel_; }
+    int number() const { return number_; }  // the first point of this position
+    int end() const { return end_; }        // the first point of the next one
+
+private:
+    void FindEnd(int expected);
+    void Try(int number);
+
+    const GraphRecord& graph_;
+    AlongAxis along_;
+    PointRange range_;
+    int pixel_ = 0;
+    int number_;
+    int end_;
+    int low_ = 0;       // while the end is looked for: a point of this position,
+    int endPixel_ = 0;  // and the position of the point at the end
+};
 
 // Points with numbers [number, end) that stand for all of them, by index into the values; -1 for
 // none.
@@ -57,9 +80,10 @@ public:
 
 private:
     void Append(const GraphRecord& graph, const GraphSeries& series, int column, int index);
-    void AppendPosition(const GraphRecord& graph, const GraphSeries& series, int number, int end);
-    void AppendLastPosition(const GraphRecord& graph, const GraphSeries& series, int number,
-                            int end);
+    void AppendPosition(const GraphRecord& graph, const GraphSeries& series, int column, int number,
+                        int end);
+    void AppendLastPosition(const GraphRecord& graph, const GraphSeries& series, int column,
+                            int number, int end);
 
     POINT* points_ = nullptr;
     int spare_ = 0;

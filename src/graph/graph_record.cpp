@@ -71,6 +71,7 @@ void ResetGraphRanges(GraphRecord& graph) {
     graph.xCentre = graph.yCentre = 0.0;
     graph.xUnitsPerPixelBase = graph.yUnitsPerPixelBase = 1.0;
     graph.xUnitsPerPixel = graph.yUnitsPerPixel = 1.0;
+    graph.xScale = graph.yScale = {};
     graph.barWidth = graph.barHeight = 1;
     graph.xAutoRange = graph.yAutoRange = 1;
 }

@@ -4,6 +4,7 @@
 // whose origin is the client area's; ends of data ranges are data values.
 #pragma once
 
+#include "numbers/pixel_scale.h"
 #include "platform/platform.h"
 #include "text/number_run.h"
 
@@ -116,6 +117,8 @@ struct GraphRecord {
     // The library's own, behind the fields above.
     HGDIOBJ blankBitmap;        // what hdcMem held at first; back before hbmMem is deleted
     NumberWidths numberWidths;  // in hfontAxis
+    PixelScale xScale;          // of the mappings above; for processors without floating point
+    PixelScale yScale;
     PrintState printing;
     bool paintMissed;  // WM_PAINT came while the record stood for a page
     bool sizeMissed;   // WM_SIZE likewise

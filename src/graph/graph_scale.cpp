@@ -62,14 +62,41 @@ AxisScale ScaleAxis(double low, double high, int extent, const GraphRecord& grap
     return scale;
 }
 
+// Pixels from the centre to a value. `scale` is of the same mapping, or knows nothing.
+inline int PixelsFromCentre(double value, double centre, double unitsPerPixel,
+                            const PixelScale& scale) {
+    if constexpr (!kHasFloatingPoint) {
+        const int pixels = QuickPixels(scale, value);
+        if (pixels != kUnknownPixels) return pixels;
+    }
+    return TruncateToInt((value - centre) / unitsPerPixel);
+}
+
+// After any change of an axis' centre or units.
+void UpdateScale(PixelScale& scale, double centre, double unitsPerPixel) {
+    if constexpr (!kHasFloatingPoint) scale = MakePixelScale(centre, unitsPerPixel);
+}
+
 }  // namespace
 
 int xPixel(const GraphRecord& graph, double x) {
-    return graph.xCentrePixel + TruncateToInt((x - graph.xCentre) / graph.xUnitsPerPixel);
+    return graph.xCentrePixel +
+           PixelsFromCentre(x, graph.xCentre, graph.xUnitsPerPixel, graph.xScale);
 }
 
 int yPixel(const GraphRecord& graph, double y) {
-    return graph.yCentrePixel - TruncateToInt((y - graph.yCentre) / graph.yUnitsPerPixel);
+    return graph.yCentrePixel -
+           PixelsFromCentre(y, graph.yCentre, graph.yUnitsPerPixel, graph.yScale);
+}
+
+void MoveXCentre(GraphRecord& graph, double by) {
+    graph.xCentre += by;
+    UpdateScale(graph.xScale, graph.xCentre, graph.xUnitsPerPixel);
+}
+
+void MoveYCentre(GraphRecord& graph, double by) {
+    graph.yCentre += by;
+    UpdateScale(graph.yScale, graph.yCentre, graph.yUnitsPerPixel);
 }
 
 void RescaleX(GraphRecord& graph) {
@@ -81,6 +108,7 @@ void RescaleX(GraphRecord& graph) {
     graph.xCentre = scale.centre;
     graph.xUnitsPerPixelBase = scale.unitsPerPixelBase;
     graph.xUnitsPerPixel = scale.unitsPerPixel;
+    UpdateScale(graph.xScale, graph.xCentre, graph.xUnitsPerPixel);
     graph.xCentrePixel = graph.marginLeft + (width >> 1);
     graph.xTickStep = scale.tickStep;
     graph.xTickHalfSpacing = ((xPixel(graph, graph.xTickStep) - xPixel(graph, 0)) >> 1) - 2;
@@ -97,6 +125,7 @@ void RescaleY(GraphRecord& graph) {
     graph.yCentre = scale.centre;
     graph.yUnitsPerPixelBase = scale.unitsPerPixelBase;
     graph.yUnitsPerPixel = scale.unitsPerPixel;
+    UpdateScale(graph.yScale, graph.yCentre, graph.yUnitsPerPixel);
     graph.yCentrePixel = graph.marginTop + (height >> 1);
     graph.yTickStep = scale.tickStep == 0 ? 1.0 : scale.tickStep;
     graph.yTickStepCopy = graph.yTickStep;

@@ -14,6 +14,10 @@ int yPixel(const GraphRecord& graph, double y);
 void RescaleX(GraphRecord& graph);
 void RescaleY(GraphRecord& graph);
 
+// Move the data value at the plot's centre, and the mapping with it.
+void MoveXCentre(GraphRecord& graph, double by);
+void MoveYCentre(GraphRecord& graph, double by);
+
 // `axis` is KORGRAPH_X or KORGRAPH_Y; another number changes nothing.
 void AutoRange(GraphRecord& graph, int axis);
 void SetRange(GraphRecord& graph, int axis, double low, double high);

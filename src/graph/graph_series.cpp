@@ -38,27 +38,28 @@ Extremes CopyFindingExtremes(double* to, const double* from, int count) {
     int i = 0;
     for (; i < count && !IsFinite(from[i]); ++i) to[i] = from[i];
     if (i == count) return {};
-    double least = from[i];
-    double most = from[i];
+    Comparable least = ComparableOf(from[i]);
+    Comparable most = least;
     int leastIndex = i;
     int mostIndex = i;
     double sum = 0;
     for (; i < count; ++i) {
         const double value = from[i];
+        const Comparable compared = ComparableOf(value);
         to[i] = value;
-        if (!(least <= value && value <= most)) {  // few are new extremes, or no numbers
+        if (!(least <= compared && compared <= most)) {  // few are new extremes, or no numbers
             if (!IsFinite(value)) continue;
-            if (value < least) {
-                least = value;
+            if (compared < least) {
+                least = compared;
                 leastIndex = i;
             } else {
-                most = value;
+                most = compared;
                 mostIndex = i;
             }
         }
         sum += std::fabs(value);
     }
-    return {least, most, leastIndex, mostIndex, sum};
+    return {to[leastIndex], to[mostIndex], leastIndex, mostIndex, sum};
 }
 
 // Fills the series' array, `from` having as many values.

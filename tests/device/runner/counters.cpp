@@ -1,6 +1,7 @@
 #include "runner/counters.h"
 
 #include "runner/image.h"
+#include "runner/profile.h"
 
 #include <windows.h>
 
@@ -55,7 +56,12 @@ void RunCounted(arm::Cpu& cpu) {
     while (guest.isCode(cpu.next)) {
         const Stretch stretch = StretchAt(cpu.next);
         const uint64_t before = cpu.executed;
-        arm::Run(cpu, stretch.begin, stretch.end - stretch.begin);
+        const uint32_t size = stretch.end - stretch.begin;
+        if (IsProfiling()) {
+            RunProfiled(cpu, stretch.begin, size, stretch.isSoftFloat);
+        } else {
+            arm::Run(cpu, stretch.begin, size);
+        }
         const uint64_t executed = cpu.executed - before;
         shared->instructions += executed;
         if (stretch.isSoftFloat) shared->softFloat += executed;

@@ -7,6 +7,7 @@
 #include "runner/image.h"
 #include "runner/imports.h"
 #include "runner/own_headers.h"
+#include "runner/profile.h"
 
 #include <windows.h>
 
@@ -46,6 +47,7 @@ bool Attach(HMODULE self) {
     const std::wstring folder = FolderBeside(self);
     LoadImageFile(folder + L"korcontrols.dll");
     PrepareCounters();
+    PrepareProfile();
     ReadSoftFloat(folder + L"arithmetic.bin");
     PrepareGuestCalls();
     BindImports();
@@ -63,6 +65,9 @@ bool Attach(HMODULE self) {
 
 extern "C" BOOL WINAPI DllMain(HINSTANCE self, DWORD reason, void*) {
     if (reason == DLL_PROCESS_ATTACH) return device::Attach(self);
-    if (reason == DLL_PROCESS_DETACH) device::CallEntryPoint(self, reason);
+    if (reason == DLL_PROCESS_DETACH) {
+        device::CallEntryPoint(self, reason);
+        device::WriteProfile();
+    }
     return TRUE;
 }

@@ -1,0 +1,51 @@
+// A chart's mapping of values to pixels without floating point:
+//
+//     pixels = the whole part of (value - centre) / unitsPerPixel
+//
+// Each of the two operations rounds to a double, and a value close to a pixel's edge may end on
+// either side of it by that. So whole numbers answer only where the value is far enough from an
+// edge, and leave the rest, a few of ten thousand, to the doubles.
+#pragma once
+
+#include <cstdint>
+
+#include "numbers/double_bits.h"
+
+namespace kor {
+
+constexpr int kPixelFraction = 16;  // bits of a position below the pixel
+
+// Positions are pixels from the value 0, in units of 1 / 2^kPixelFraction. As zeros it knows none.
+struct PixelScale {
+    uint32_t reciprocal;  // leading bits of 1 / unitsPerPixel
+    int32_t shift;        // less the value's exponent: how far down the product is a position
+    int32_t centre;       // position of the centre, rounded down
+};
+
+// Knows none when the axis is so far from 0 or so steep that positions have no room.
+PixelScale MakePixelScale(double centre, double unitsPerPixel);
+
+constexpr int kUnknownPixels = INT32_MIN;
+
+// The pixels of a value, or kUnknownPixels.
+//
+// A position is at most 2.5 units above what the product says, since both factors are cut off to 32
+// bits and the shift is at least 2; the centre's is off by 1; the roundings of the doubles by less
+// than 2^-20. The margin is twice all that.
+inline int QuickPixels(const PixelScale& scale, double value) {
+    constexpr uint32_t kMargin = 8;
+    constexpr uint32_t kPixel = 1u << kPixelFraction;
+    const int shift = scale.shift - BiasedExponentOf(value);
+    if (shift < 2) return kUnknownPixels;
+    const uint64_t product = static_cast<uint64_t>(LeadingBitsOf(value)) * scale.reciprocal;
+    const uint32_t leading = static_cast<uint32_t>(product >> 32);
+    const int32_t away = shift < 32 ? static_cast<int32_t>(leading >> shift) : 0;
+    const int32_t position = (IsNegativeByBits(value) ? -away : away) - scale.centre;
+    const uint32_t magnitude =
+        position < 0 ? 0u - static_cast<uint32_t>(position) : static_cast<uint32_t>(position);
+    if ((magnitude + kMargin) % kPixel < 2 * kMargin) return kUnknownPixels;
+    const auto pixels = static_cast<int32_t>(magnitude >> kPixelFraction);
+    return position < 0 ? -pixels : pixels;
+}
+
+}  // namespace kor
