@@ -57,7 +57,7 @@ foreach(test IN LISTS tests)
   else()
     add_test(device.${test} ${EMULATOR} ${TESTED} --gtest_filter=${test})
     set_tests_properties(device.${test} PROPERTIES
-      LABELS device TIMEOUT 300 FIXTURES_REQUIRED device_image
+      LABELS device TIMEOUT 900 FIXTURES_REQUIRED device_image
       SKIP_REGULAR_EXPRESSION "\\[  SKIPPED \\]" FAIL_REGULAR_EXPRESSION "Running 0 tests")
   endif()
 endforeach()

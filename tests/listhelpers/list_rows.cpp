@@ -225,13 +225,18 @@ TEST_F(ListPointer, MayBeLeftOfAndAboveTheScreensOrigin) {
 }
 
 TEST_F(ListPointer, IsTheOneOfTheLastMessage) {
+    // The row goes to the pointer: on a desktop that is not shown the pointer cannot be moved.
     const POINT point = pointIn(2);
-    SetCursorPos(static_cast<int>(point.x), static_cast<int>(point.y));
+    POINT pointer{};
+    GetCursorPos(&pointer);
+    RECT place{};
+    GetWindowRect(host, &place);
+    SetWindowPos(host, nullptr, place.left + pointer.x - point.x, place.top + pointer.y - point.y,
+                 0, 0, SWP_NOSIZE | SWP_NOZORDER | SWP_NOACTIVATE);
     PostMessageW(host, WM_APP, 0, 0);
     MSG message{};
     ASSERT_TRUE(GetMessageW(&message, host, WM_APP, WM_APP));
-    const DWORD position = GetMessagePos();
-    EXPECT_EQ(static_cast<short>(LOWORD(position)), point.x);
+    EXPECT_EQ(static_cast<short>(LOWORD(GetMessagePos())), pointer.x);
     EXPECT_EQ(KorListView_GetIndexFromCurrentPosition(list), 2);
 }
 
