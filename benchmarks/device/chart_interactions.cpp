@@ -6,6 +6,9 @@
 #include <korcontrols/graph.h>
 #include <korcontrols/tooltip.h>
 
+#include <cstdio>
+#include <cstdlib>
+
 namespace footprint {
 namespace {
 
@@ -50,17 +53,20 @@ bool ShowsAValue(const Cost&) { return ToolTipIsShown(); }
 // Beside the plot nothing but an arrow makes the chart draw.
 bool Pans(const Cost& cost) { return !ToolTipIsShown() && cost.platformCalls > 20; }
 
-// Looks from `first` on for a place where a press does what is wanted.
+// Looks from `first` on, some columns wide, for a place where a press does what is wanted.
 void FindTarget(POINT first, LONG stepX, LONG stepY, bool (*isFound)(const Cost&)) {
-    for (LONG x = first.x; x >= 0 && x < kWidth; x += stepX) {
+    constexpr int kColumns = 10;
+    for (int column = 0; column < kColumns; ++column) {
         for (LONG y = first.y; y < kHeight; y += stepY) {
-            target = {x, y};
+            target = {first.x + column * stepX, y};
             const bool found = isFound(CostOf(PressTarget));
-            Release(chart, x, y);
+            Release(chart, target.x, target.y);
             Settle();
             if (found) return;
         }
     }
+    std::printf("device_footprint: no place to press was found\n");
+    std::exit(1);
 }
 
 // From the middle to the right.

@@ -70,7 +70,7 @@ public:
     DiscFiller(const DiscFiller&) = delete;
     DiscFiller& operator=(const DiscFiller&) = delete;
 
-    void Fill(const Boundary& start, const Boundary& end, COLORREF colour) const {
+    void FillPieSlice(const Boundary& start, const Boundary& end, COLORREF colour) const {
         LocalGdiObject<HPEN> pen(CreatePen(PS_SOLID, 1, colour));
         SelectScope selected(dc_, pen.get());
         if (!halfWidths_ || !(end.edge.degrees > start.edge.degrees)) return;
@@ -95,7 +95,7 @@ void DrawSlices(const GraphSeries& series, HDC dc, const PieLayout& pie) {
     for (int k = 0; k < series.pointCount; ++k) {
         const Boundary start = end;
         end = BoundaryAt(pie.radius, start.edge.degrees + SliceShare(series, k) * kFullTurn);
-        disc.Fill(start, end, SliceColour(k));
+        disc.FillPieSlice(start, end, SliceColour(k));
         DrawRadius(dc, pie.centre, start.end.x, start.end.y);  // the fill may have covered it
         DrawRadius(dc, pie.centre, end.end.x, end.end.y);
     }
