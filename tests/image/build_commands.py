@@ -22,9 +22,9 @@ def compile_command(build, source, output):
 
 
 def link_command(build, output):
-    """How the library is linked, into another file."""
+    """How the library is linked, into another file and without a map."""
     commands = run(["ninja", "-t", "commands", "bin/korcontrols.dll"], build, check=True).stdout
     link = commands.strip().splitlines()[-1].removeprefix(": && ").split(" && ")[0]
     arguments = shlex.split(link)
     arguments[arguments.index("-o") + 1] = str(output)
-    return arguments
+    return [argument for argument in arguments if not argument.startswith("-Map=")]
