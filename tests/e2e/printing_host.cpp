@@ -91,9 +91,14 @@ LRESULT CALLBACK WatchWindows(int code, WPARAM window, LPARAM data) {
     return CallNextHookEx(nullptr, code, window, data);
 }
 
+// At once, and without the streams that the other thread may be using.
 DWORD WINAPI LosePatience(void*) {
     Sleep(kPatience);
-    ExitProcess(2);
+    constexpr char kWords[] = "printing_host: not done after a minute\n";
+    DWORD written = 0;
+    WriteFile(GetStdHandle(STD_OUTPUT_HANDLE), kWords, sizeof kWords - 1, &written, nullptr);
+    TerminateProcess(GetCurrentProcess(), 2);
+    return 2;
 }
 
 // ---- The chart ----------------------------------------------------------------------------------

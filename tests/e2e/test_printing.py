@@ -4,6 +4,8 @@ The printer writes PostScript; Ghostscript makes it a picture at the printer's o
 that a pixel of the printable area is a pixel of the chart.
 """
 
+import contextlib
+import fcntl
 import math
 import re
 import subprocess
@@ -27,28 +29,37 @@ GRID = (0, 150, 150)
 WHEAT, RYE = (1, 2, 3, 4), (4, 4, 2, 2)  # as printing_host.cpp has them
 
 
+@contextlib.contextmanager
+def one_at_a_time():
+    """A Wine prefix has one default printer, and several machines' tests may run in it at once."""
+    with open(ROOT / "build" / "printing.lock", "w", encoding="utf-8") as lock:
+        fcntl.flock(lock, fcntl.LOCK_EX)
+        yield
+
+
 def run_host(program, folder):
     """What printing_host said, and the folder with its files."""
-    ran = subprocess.run(
-        [WINE_RUN, program]
-        + [windows_path(ROOT / "tests" / "e2e" / "printer.ppd"), windows_path(folder)],
-        capture_output=True,
-        text=True,
-        timeout=120,
-        check=False,
-    )
+    with one_at_a_time():
+        ran = subprocess.run(
+            [WINE_RUN, program]
+            + [windows_path(ROOT / "tests" / "e2e" / "printer.ppd"), windows_path(folder)],
+            capture_output=True,
+            text=True,
+            timeout=120,
+            check=False,
+        )
     assert ran.returncode == 0, ran.stdout + ran.stderr
     # Whatever Wine has to say comes the same way.
     own = re.compile(r"available |(full|plain)[0-4] dialog |cancelled dialog ")
     return SimpleNamespace(folder=folder, lines=list(filter(own.match, ran.stdout.splitlines())))
 
 
-@pytest.fixture(scope="module")
+@pytest.fixture(scope="session")
 def prints(programs, tmp_path_factory):
     return run_host(programs / "printing_host.exe", tmp_path_factory.mktemp("prints"))
 
 
-@pytest.fixture(scope="module")
+@pytest.fixture(scope="session")
 def paper(prints):
     """paper("plain", LINE) is the printable area of that page."""
     return lambda kind, chart_type: printable_area(prints.folder / f"{kind}{chart_type}.ps")
