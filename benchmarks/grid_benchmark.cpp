@@ -4,6 +4,7 @@
 
 #include <cstdio>
 
+#include "grid_cells.h"
 #include "interleaved.h"
 
 namespace {
@@ -15,24 +16,9 @@ HWND host;
 HWND grid;
 HFONT font;
 
-void FormatCell(int column, int row, wchar_t* text) {
-    wsprintfW(text, L"%d.%02d", (row * 37 + column * 11) % 1000, row % 100);
-}
-
-void PaintCells(const GridVisibleRange& range) {
-    for (WORD row = range.firstRow; row < range.endRow; ++row) {
-        for (WORD column = range.firstColumn; column < range.endColumn; ++column) {
-            wchar_t text[16];
-            FormatCell(column, row, text);
-            SetCellValue(KORGRID_CELL(column, row), text, font, RGB(0, 0, 0), RGB(255, 255, 255), 0,
-                         0, 0, 0, 0);
-        }
-    }
-}
-
 LRESULT CALLBACK HostProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
     if (message == WM_NOTIFY && wParam == GRIDN_PAINTCELLS) {
-        PaintCells(*reinterpret_cast<const GridVisibleRange*>(lParam));
+        PaintCells(*reinterpret_cast<const GridVisibleRange*>(lParam), font);
         return 0;
     }
     return DefWindowProcW(hwnd, message, wParam, lParam);

@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <cstdint>
 
+#include "support/bitmap_canvas.h"
+
 namespace bench {
 
 namespace {
@@ -50,26 +52,11 @@ HWND CreateFloorWindow(HDC image) {
 
 // What a window shows, 32 bits a pixel.
 std::vector<uint32_t> PixelsOf(HWND window) {
-    BITMAPINFO info = {};
-    info.bmiHeader.biSize = sizeof info.bmiHeader;
-    info.bmiHeader.biWidth = kChartWidth;
-    info.bmiHeader.biHeight = -kChartHeight;
-    info.bmiHeader.biPlanes = 1;
-    info.bmiHeader.biBitCount = 32;
+    const kortest::BitmapCanvas canvas(kChartWidth, kChartHeight);
     HDC source = GetDC(window);
-    HDC dc = CreateCompatibleDC(nullptr);
-    void* bits = nullptr;
-    HBITMAP bitmap = CreateDIBSection(dc, &info, DIB_RGB_COLORS, &bits, nullptr, 0);
-    HGDIOBJ blank = SelectObject(dc, bitmap);
-    BitBlt(dc, 0, 0, kChartWidth, kChartHeight, source, 0, 0, SRCCOPY);
+    BitBlt(canvas.dc(), 0, 0, kChartWidth, kChartHeight, source, 0, 0, SRCCOPY);
     ReleaseDC(window, source);
-    GdiFlush();
-    const auto* pixels = static_cast<const uint32_t*>(bits);
-    const std::vector<uint32_t> copy(pixels, pixels + kChartWidth * kChartHeight);
-    SelectObject(dc, blank);
-    DeleteObject(bitmap);
-    DeleteDC(dc);
-    return copy;
+    return canvas.pixels();
 }
 
 }  // namespace

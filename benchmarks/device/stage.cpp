@@ -1,5 +1,7 @@
 #include "stage.h"
 
+#include "grid_cells.h"
+
 #include <korcontrols/funkybar.h>
 #include <korcontrols/graph.h>
 #include <korcontrols/grid.h>
@@ -17,20 +19,9 @@ HFONT font;
 
 HINSTANCE Instance() { return GetModuleHandleW(nullptr); }
 
-void PaintCells(const GridVisibleRange& range) {
-    for (WORD row = range.firstRow; row < range.endRow; ++row) {
-        for (WORD column = range.firstColumn; column < range.endColumn; ++column) {
-            wchar_t text[16];
-            wsprintfW(text, L"%d.%02d", (row * 37 + column * 11) % 1000, row % 100);
-            SetCellValue(KORGRID_CELL(column, row), text, font, RGB(0, 0, 0), RGB(255, 255, 255), 0,
-                         0, 0, 0, 0);
-        }
-    }
-}
-
 LRESULT CALLBACK HostProc(HWND window, UINT message, WPARAM wParam, LPARAM lParam) {
     if (message == WM_NOTIFY && wParam == GRIDN_PAINTCELLS) {
-        PaintCells(*reinterpret_cast<const GridVisibleRange*>(lParam));
+        PaintCells(*reinterpret_cast<const GridVisibleRange*>(lParam), font);
         return 0;
     }
     return DefWindowProcW(window, message, wParam, lParam);
