@@ -20,8 +20,9 @@ function(korcontrols_arithmetic name)
     ${src}/header/header_hit_test.cpp
     ${src}/numbers/pixel_scale.cpp
     ${src}/platform/desktop/number_text.cpp
-    ${src}/zoom/zoom.cpp)
+    ${src}/zoom/zoom.cpp
+    ${KORCONTROLS_ROOT}/tests/native/no_drawing.cpp)
   target_include_directories(${name} PUBLIC
     ${KORCONTROLS_ROOT}/tests/native/include ${KORCONTROLS_ROOT}/include ${src})
-  target_compile_options(${name} PUBLIC -ffunction-sections -fdata-sections ${ARGN})
+  target_compile_options(${name} PUBLIC ${ARGN})
 endfunction()
