@@ -13,7 +13,7 @@ struct Chart {
     Chart() : record(*kor::CreateGraphRecord()) {
         record.hwnd = GetDesktopWindow();  // scaling waits for a window
     }
-    ~Chart() { kor::DestroyGraphRecord(&record); }
+    ~Chart() { kor::FreeRecord(&record); }
     Chart(const Chart&) = delete;
     Chart& operator=(const Chart&) = delete;
 

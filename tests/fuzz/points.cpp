@@ -5,15 +5,14 @@
 #include "graph/graph_numbers.h"
 #include "graph/graph_points.h"
 
-#include <set>
 #include <utility>
 
 namespace korfuzz {
 namespace {
 
-using Pixels = std::set<std::pair<int, int>>;
+using Pixels = std::vector<std::pair<int, int>>;
 
-constexpr int kMostRaster = 3000;
+constexpr int kMostRaster = 1000;
 
 bool IsNear(POINT point) {
     return std::abs(point.x) < kMostRaster && std::abs(point.y) < kMostRaster;
@@ -27,7 +26,7 @@ void DrawLine(Pixels& pixels, POINT from, POINT to, int left, int right) {
     const int stepY = from.y < to.y ? 1 : -1;
     int error = dx - dy;
     while (from.x != to.x || from.y != to.y) {
-        if (from.x >= left && from.x <= right) pixels.insert({from.x, from.y});
+        if (from.x >= left && from.x <= right) pixels.emplace_back(from.x, from.y);
         const int twice = 2 * error;
         if (twice > -dy) {
             error -= dy;
@@ -43,6 +42,8 @@ void DrawLine(Pixels& pixels, POINT from, POINT to, int left, int right) {
 Pixels Drawn(const POINT* points, size_t count, int left, int right) {
     Pixels pixels;
     for (size_t i = 1; i < count; ++i) DrawLine(pixels, points[i - 1], points[i], left, right);
+    std::sort(pixels.begin(), pixels.end());
+    pixels.erase(std::unique(pixels.begin(), pixels.end()), pixels.end());
     return pixels;
 }
 
@@ -87,7 +88,7 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
     const int spare = input.ConsumeIntegralInRange(0, 2);
     const int left = input.ConsumeIntegralInRange(-50, 400);
     const int right = input.ConsumeIntegralInRange(-50, 400);
-    chart.add(AnyValues(input, 3000));
+    chart.add(AnyValues(input, 1500));
 
     const kor::GraphSeries& series = *chart.record.series[0];
     CheckPositions(chart.record, {1, series.pointCount});
