@@ -57,9 +57,13 @@ void CheckVisibleRange(const GridVisibleRange& range) {
 }
 
 // A press can reach one column or row behind the sheet, or any that a host has scrolled to.
-void CheckSelection(const GridVisibleRange& range) {
+void CheckSelection(Stage& stage, const GridVisibleRange& range) {
     GridSelection selection = {1, 0, 1, 0};
     GetSelectedRanged(&selection);
+    const bool isInSheet = IsOrdered(selection) && selection.right < KORGRID_COLUMNS &&
+                           selection.bottom < KORGRID_ROWS;
+    if (isInSheet) stage.selectionIsAnything = false;
+    if (stage.selectionIsAnything) return;
     const int furthest[] = {std::max<int>(KORGRID_COLUMNS, range.endColumn),
                             std::max<int>(KORGRID_ROWS, range.endRow)};
     static int columnBound = KORGRID_COLUMNS;
@@ -93,7 +97,7 @@ void CheckGrid(Stage& stage) {
     GridVisibleRange range = {};
     GetVisibleRange(&range);
     CheckVisibleRange(range);
-    CheckSelection(range);
+    CheckSelection(stage, range);
     HWND grid = stage.currentGrid();
     if (!grid || !stage.isLive(grid)) return;
     CheckGridStrip(grid, 2, GetNumberOfVisibleColumns(), "columns");

@@ -8,15 +8,10 @@ namespace kortest {
 
 class RandomSource {
 public:
-    explicit RandomSource(uint64_t seed) : state_(seed * 0x9E3779B97F4A7C15u + 1) {}
+    // Mixed, or the numbers of one seed would be those of the one before, one place further on.
+    explicit RandomSource(uint64_t seed) : state_(Mixed(seed + 1)) {}
 
-    uint32_t next() {
-        state_ += 0x9E3779B97F4A7C15u;
-        uint64_t mixed = state_;
-        mixed = (mixed ^ (mixed >> 30)) * 0xBF58476D1CE4E5B9u;
-        mixed = (mixed ^ (mixed >> 27)) * 0x94D049BB133111EBu;
-        return static_cast<uint32_t>(mixed >> 32);
-    }
+    uint32_t next() { return static_cast<uint32_t>(Mixed(state_ += kStep) >> 32); }
     int below(int end) { return static_cast<int>(next() % static_cast<uint32_t>(end)); }
     bool oneIn(int n) { return below(n) == 0; }
     int from(int first, int last) { return first + below(last - first + 1); }
@@ -25,6 +20,14 @@ public:
     }
 
 private:
+    static constexpr uint64_t kStep = 0x9E3779B97F4A7C15u;
+
+    static uint64_t Mixed(uint64_t value) {
+        value = (value ^ (value >> 30)) * 0xBF58476D1CE4E5B9u;
+        value = (value ^ (value >> 27)) * 0x94D049BB133111EBu;
+        return value ^ (value >> 31);
+    }
+
     uint64_t state_;
 };
 

@@ -173,12 +173,26 @@ LRESULT Stage::onControl(Kind kind, HWND window, UINT message, WPARAM wParam, LP
         if (currentGrid_ && isLive(currentGrid_)) hadTwoGrids = true;
         currentGrid_ = window;
     }
-    spring(Event::kBefore, message, 0);
+    if (message == HCN_ITEMCLICK && kind == kGrid) noteHeaderClick(window, wParam, lParam);
+    // The system's own views are not to be destroyed inside their messages.
+    const bool isSystems = kind == kList || kind == kTree;
+    if (!isSystems) spring(Event::kBefore, message, 0);
+    // A control cannot be created in a window that is gone.
+    if (message == WM_CREATE && !isLive(window)) return -1;
     const LRESULT result = CallWindowProcW(original_[kind], window, message, wParam, lParam);
     if (message == WM_CREATE && kind == kGrid && lParam) wrapChildren(window);
-    spring(Event::kAfter, message, 0);
+    if (!isSystems) spring(Event::kAfter, message, 0);
     if (message == WM_NCDESTROY) live_.erase(window);
     return result;
+}
+
+// A strip tells items that it has. A host may tell any, and what is selected then lies outside the
+// sheet, or has its ends turned round where 16 bits are too few.
+void Stage::noteHeaderClick(HWND grid, WPARAM sender, LPARAM items) {
+    const bool isRow = reinterpret_cast<HWND>(sender) == GetDlgItem(grid, 3);
+    const DWORD count = isRow ? GetNumberOfVisibleRows() : GetNumberOfVisibleColumns();
+    const auto words = static_cast<DWORD>(items);
+    if (LOWORD(words) >= count || HIWORD(words) >= count) selectionIsAnything = true;
 }
 
 LRESULT CALLBACK Stage::childProc(HWND window, UINT message, WPARAM wParam, LPARAM lParam) {
@@ -199,7 +213,10 @@ LRESULT Stage::onHost(HWND window, UINT message, WPARAM wParam, LPARAM lParam) {
         message == GRIDN_EQUATIONEMPTY) {
         CheckNotification(*this, message, wParam, lParam);
     }
-    spring(Event::kHost, message, message == WM_NOTIFY ? static_cast<UINT>(wParam) : 0);
+    const bool isOfList = message == WM_NOTIFY && (wParam == 100 + kList || wParam == 100 + kTree);
+    if (!isOfList) {
+        spring(Event::kHost, message, message == WM_NOTIFY ? static_cast<UINT>(wParam) : 0);
+    }
     if (message == WM_NCDESTROY) live_.erase(window);
     return DefWindowProcW(window, message, wParam, lParam);
 }

@@ -10,6 +10,10 @@ DWORD OddStyle(int number) {
                                             WS_CLIPCHILDREN | WS_CLIPSIBLINGS | HCS_VERTICAL));
 }
 
+// The system's own views wait for the pointer in a loop when they are pressed.
+template <Kind kind>
+constexpr bool kIsSystems = kind == kList || kind == kTree;
+
 void SetShift(bool isDown) {
     BYTE keys[256];
     if (!GetKeyboardState(keys)) return;
@@ -153,6 +157,7 @@ void WindowWords<kind>::reparent(Stage& stage, const Arguments& a) {
 
 template <Kind kind>
 void WindowWords<kind>::press(Stage& stage, const Arguments& a) {
+    if (kIsSystems<kind>) return;
     const WPARAM keys = MK_LBUTTON | (a[3] & 1 ? MK_SHIFT : 0);
     const UINT message = (a[3] & 0x70) == 0x70 ? WM_LBUTTONDBLCLK : WM_LBUTTONDOWN;
     stage.send(stage.ensure(kind, a[0]), message, keys, PairOf(a[1], a[2]));
@@ -174,7 +179,14 @@ void WindowWords<kind>::wild(Stage& stage, const Arguments& a) {
     HWND window = stage.ensure(kind, a[0]);
     const UINT message = MessageOf(a[1]);
     const bool hasPointer = message == WM_CREATE || message == WM_GETDLGCODE;
-    stage.send(window, message, WideWord(a[2]), hasPointer ? 0 : static_cast<LPARAM>(a[3]));
+    const bool isPress = message >= WM_LBUTTONDOWN && message <= WM_RBUTTONDBLCLK;
+    // The system's own views cannot be created without a description.
+    if (kIsSystems<kind> && (message == WM_CREATE || isPress)) return;
+    // A number that is nearly a DC or a region is followed by the system itself.
+    const bool hasDrawing =
+        message == WM_PAINT || message == WM_ERASEBKGND || message == WM_NCPAINT;
+    stage.send(window, message, hasDrawing ? 0 : WideWord(a[2]),
+               hasPointer ? 0 : static_cast<LPARAM>(a[3]));
 }
 
 template struct WindowWords<kStrip>;
