@@ -64,8 +64,8 @@ void CheckSelection(Stage& stage, const GridVisibleRange& range) {
                            selection.bottom < KORGRID_ROWS;
     if (isInSheet) stage.selectionIsAnything = false;
     if (stage.selectionIsAnything) return;
-    const int furthest[] = {std::max<int>(KORGRID_COLUMNS, range.endColumn),
-                            std::max<int>(KORGRID_ROWS, range.endRow)};
+    const int furthest[] = {std::max(KORGRID_COLUMNS, range.endColumn + 1),
+                            std::max(KORGRID_ROWS, range.endRow + 1)};
     static int columnBound = KORGRID_COLUMNS;
     static int rowBound = KORGRID_ROWS;
     columnBound = std::max(columnBound, furthest[0]);

@@ -173,7 +173,7 @@ LRESULT Stage::onControl(Kind kind, HWND window, UINT message, WPARAM wParam, LP
         if (currentGrid_ && isLive(currentGrid_)) hadTwoGrids = true;
         currentGrid_ = window;
     }
-    if (message == HCN_ITEMCLICK && kind == kGrid) noteHeaderClick(window, wParam, lParam);
+    if (kind == kGrid) noteSelecting(window, message, wParam, lParam);
     // The system's own views are not to be destroyed inside their messages.
     const bool isSystems = kind == kList || kind == kTree;
     if (!isSystems) spring(Event::kBefore, message, 0);
@@ -186,13 +186,18 @@ LRESULT Stage::onControl(Kind kind, HWND window, UINT message, WPARAM wParam, LP
     return result;
 }
 
-// A strip tells items that it has. A host may tell any, and what is selected then lies outside the
-// sheet, or has its ends turned round where 16 bits are too few.
-void Stage::noteHeaderClick(HWND grid, WPARAM sender, LPARAM items) {
-    const bool isRow = reinterpret_cast<HWND>(sender) == GetDlgItem(grid, 3);
+// Two ways lead to a selection outside the sheet, or with its ends turned round, as the headers say:
+// a header click on items that the strip has not, and keys that extend a block whose anchor lies
+// elsewhere, since each arrow has rules of its own.
+void Stage::noteSelecting(HWND grid, UINT message, WPARAM wParam, LPARAM lParam) {
+    if (message == WM_LBUTTONDOWN) isAnchored_ = true;
+    if (message == WM_LBUTTONUP && !(wParam & MK_SHIFT)) isAnchored_ = false;
+    if (message == WM_KEYDOWN && isAnchored_) selectionIsAnything = true;
+    if (message != HCN_ITEMCLICK) return;
+    const bool isRow = reinterpret_cast<HWND>(wParam) == GetDlgItem(grid, 3);
     const DWORD count = isRow ? GetNumberOfVisibleRows() : GetNumberOfVisibleColumns();
-    const auto words = static_cast<DWORD>(items);
-    if (LOWORD(words) >= count || HIWORD(words) >= count) selectionIsAnything = true;
+    const auto items = static_cast<DWORD>(lParam);
+    if (LOWORD(items) >= count || HIWORD(items) >= count) selectionIsAnything = true;
 }
 
 LRESULT CALLBACK Stage::childProc(HWND window, UINT message, WPARAM wParam, LPARAM lParam) {

@@ -48,7 +48,7 @@ public:
     bool hadTwoGrids = false;  // at the same time: the first one's objects are lost then
     int gridsCreated = 0;
     int textsLeft = 0;  // texts of single items that were deleted from a function bar
-    bool selectionIsAnything = false;  // by a header click on an item that no strip has
+    bool selectionIsAnything = false;  // see noteSelecting
     int paintingManner = 0;  // how a host answers GRIDN_PAINTCELLS
 
     // A window that was sent WM_DESTROY by hand, and lives without a record.
@@ -88,7 +88,7 @@ private:
     void wrapChildren(HWND grid);
     LRESULT onControl(Kind kind, HWND window, UINT message, WPARAM wParam, LPARAM lParam);
     LRESULT onHost(HWND window, UINT message, WPARAM wParam, LPARAM lParam);
-    void noteHeaderClick(HWND grid, WPARAM sender, LPARAM items);
+    void noteSelecting(HWND grid, UINT message, WPARAM wParam, LPARAM lParam);
     void spring(Event::Place place, UINT message, UINT code);
     HWND host(int number);
 
@@ -102,6 +102,7 @@ private:
     Kind awaitedKind_ = kStrip;
     HWND currentGrid_ = nullptr;
     std::vector<Trap> traps_;
+    bool isAnchored_ = false;  // a press in the grid has not been let go
     int depth_ = 0;
     int innerLeft_ = 0;  // operations that traps may still do in this step
 };
