@@ -38,7 +38,8 @@ typedef struct HeaderItemDesc {
 } HeaderItemDesc;
 
 /* HCM_INSERTITEM: inserts an item; later items move up by one.
- *   wParam  index; below 0 (or above the strip's allocated places) appends
+ *   wParam  index; below 0 (or above the strip's allocated places) appends. Do not pass one above
+ *           the item count: the item would lie behind a gap of empty ones, out of the count
  *   lParam  const HeaderItemDesc*; label and size are copied
  *   result  index of the new item, or -1 for a null pointer, no memory, or a strip without a
  *           record. When only the label could not be copied the item stays, with an empty label. */

@@ -16,6 +16,12 @@
  * KorGraph_AddSeries and KorGraph_SetCategories, whose messages answer 0 for success, return TRUE
  * then.
  *
+ * The library registers its six window classes under the instance that the host gives, and never
+ * unregisters one. A host that unloads the library first destroys all windows of these classes, the
+ * tooltips in the charts' parents among them, and then unregisters the classes with that instance:
+ * KORGRID_CLASS, KORHEADER_CLASS, KORGRAPH_CLASS, KORLEGEND_CLASS, KORTOOLTIP_CLASS and
+ * KORFUNKYBAR_CLASS. A class that stays leads into memory where the library was.
+ *
  * None of the window classes has a cursor: a host sets one when its window gets WM_SETCURSOR, or
  * the pointer keeps the shape it had outside. */
 #ifndef KORCONTROLS_KORCONTROLS_H

@@ -42,6 +42,7 @@ void ShowLegend(GraphRecord& graph, const RECT& place) {
     POINT bottom = {0, SnappedHeight(graph.hwndLegend)};
     MapWindowPoints(graph.hwndLegend, graph.hwnd, &bottom, 1);
     MoveWindow(graph.hwndLegend, place.left, place.top, width, bottom.y - place.top, TRUE);
+    if (graph.life.retired) return;  // a legend that was taken out of the chart may outlive it
     AttachLegend(graph.hwndLegend, &graph);
     ShowWindow(graph.hwndLegend, SW_SHOW);
 }

@@ -1,6 +1,7 @@
 // The markers of a line. The platform draws one circle; where there are many, its pixels are learnt
 // once, united over all points, and filled as horizontal runs: the same pixels for far fewer calls.
 #include <algorithm>
+#include <iterator>
 
 #include "graph/graph_frame.h"
 #include "graph/graph_lines.h"
@@ -29,30 +30,49 @@ struct CircleRows {
     uint32_t bits[kSide];
 };
 
-// Draws one circle on a scratch bitmap and reads which pixels it has. The result is the same for
-// every screen, so it is learnt once in the process.
+bool ReadCircleRow(HDC dc, int y, uint32_t& bits) {
+    bits = 0;
+    for (int x = 0; x < kSide; ++x) {
+        const COLORREF pixel = GetPixel(dc, x, y);
+        if (pixel == CLR_INVALID) return false;
+        if (pixel == RGB(0, 0, 0)) bits |= 1u << x;
+    }
+    return true;
+}
+
+// Whether the bits that are set are neighbours, or none is.
+constexpr bool IsOneRun(uint32_t bits) { return (bits & (bits + (bits & (0u - bits)))) == 0; }
+static_assert(IsOneRun(0) && IsOneRun(0x3C) && IsOneRun(0xFF) && !IsOneRun(0x42));
+
+// Whether that is a filled circle: what a call that failed leaves is a blank bitmap, a full one or
+// an outline.
+bool IsCircle(const CircleRows& rows) {
+    if (rows.bits[0] == 0 || (rows.bits[0] & 1) != 0) return false;
+    return std::all_of(std::begin(rows.bits), std::end(rows.bits), IsOneRun);
+}
+
+// Draws one circle on a scratch bitmap and reads which pixels it has.
+bool ReadCircle(HDC like, CircleRows& rows) {
+    MemoryDC dc(like);
+    LocalGdiObject<HBITMAP> bitmap(dc.get() ? CreateCompatibleBitmap(like, kSide, kSide) : nullptr);
+    if (!bitmap.get()) return false;
+    SelectScope selected(dc.get(), bitmap.get());
+    PatBlt(dc.get(), 0, 0, kSide, kSide, WHITENESS);
+    SelectScope pen(dc.get(), GetStockObject(BLACK_PEN));
+    SelectScope brush(dc.get(), GetStockObject(BLACK_BRUSH));
+    Ellipse(dc.get(), 0, 0, kSide, kSide);
+    for (int y = 0; y < kSide; ++y) {
+        if (!ReadCircleRow(dc.get(), y, rows.bits[y])) return false;
+    }
+    return IsCircle(rows);
+}
+
+// The result is the same for every screen, so it is learnt once in the process: by the first chart
+// for which nothing fails.
 const CircleRows* LearnCircle(HDC like) {
     static constinit CircleRows rows = {};
     static constinit bool learnt = false;
-    if (learnt) return &rows;
-    HDC dc = CreateCompatibleDC(like);
-    HBITMAP bitmap = dc ? CreateCompatibleBitmap(like, kSide, kSide) : nullptr;
-    if (bitmap) {
-        SelectScope selected(dc, bitmap);
-        PatBlt(dc, 0, 0, kSide, kSide, WHITENESS);
-        SelectScope pen(dc, GetStockObject(BLACK_PEN));
-        SelectScope brush(dc, GetStockObject(BLACK_BRUSH));
-        Ellipse(dc, 0, 0, kSide, kSide);
-        for (int y = 0; y < kSide; ++y) {
-            rows.bits[y] = 0;
-            for (int x = 0; x < kSide; ++x) {
-                if (GetPixel(dc, x, y) == RGB(0, 0, 0)) rows.bits[y] |= 1u << x;
-            }
-        }
-        learnt = true;
-    }
-    if (bitmap) DeleteObject(bitmap);
-    if (dc) DeleteDC(dc);
+    if (!learnt) learnt = ReadCircle(like, rows);
     return learnt ? &rows : nullptr;
 }
 

@@ -6,7 +6,6 @@ namespace kor {
 
 namespace {
 
-constexpr int kSliceColours = 15;
 constexpr int kSeriesColours = 19;
 constexpr int kFirstColour = 2;
 

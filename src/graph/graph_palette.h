@@ -13,6 +13,9 @@ void ChoosePalette(HDC dc);
 // are black, up to 20.
 COLORREF PaletteEntry(int index);
 
+// So many colours a pie's slices have, one after another and then again.
+constexpr int kSliceColours = 15;
+
 // Colour of a pie's slice k, and of the series added as number `count` (1 for the first).
 COLORREF SliceColour(int slice);
 COLORREF ColourOfSeriesNumber(int count);

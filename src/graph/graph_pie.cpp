@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <iterator>
 
 #include "graph/graph_frame.h"
 #include "graph/graph_numbers.h"
@@ -42,6 +43,8 @@ struct Boundary {
     POINT end;  // of its radius, from the centre
 };
 
+bool IsSamePoint(POINT a, POINT b) { return a.x == b.x && a.y == b.y; }
+
 Boundary BoundaryAt(int radius, double degrees) {
     return {MakeSliceEdge(degrees), RadiusEnd(radius, degrees)};
 }
@@ -57,6 +60,28 @@ RowRange RowsOfSlice(int radius, const Boundary& start, const Boundary& end) {
             std::min(lowest + kSpare, radius)};
 }
 
+// A pen for each colour of the slices, made when it is first asked for.
+class SlicePens {
+public:
+    SlicePens() = default;
+    ~SlicePens() {
+        for (HPEN pen : pens_) {
+            if (pen) DeleteObject(pen);
+        }
+    }
+    SlicePens(const SlicePens&) = delete;
+    SlicePens& operator=(const SlicePens&) = delete;
+
+    HPEN Of(int slice) {
+        HPEN& pen = pens_[slice % kSliceColours];
+        if (!pen) pen = CreatePen(PS_SOLID, 1, SliceColour(slice));
+        return pen;
+    }
+
+private:
+    HPEN pens_[kSliceColours] = {};
+};
+
 // The disc of a pie, to be filled slice by slice with horizontal runs. Slices that meet at an angle
 // share no pixel and leave none out.
 class DiscFiller {
@@ -70,9 +95,8 @@ public:
     DiscFiller(const DiscFiller&) = delete;
     DiscFiller& operator=(const DiscFiller&) = delete;
 
-    void FillPieSlice(const Boundary& start, const Boundary& end, COLORREF colour) const {
-        LocalGdiObject<HPEN> pen(CreatePen(PS_SOLID, 1, colour));
-        SelectScope selected(dc_, pen.get());
+    void FillPieSlice(const Boundary& start, const Boundary& end, HPEN pen) const {
+        SelectScope selected(dc_, pen);
         if (!halfWidths_ || !(end.edge.degrees > start.edge.degrees)) return;
         const POINT centre = pie_.centre;
         WalkSlice(start.edge, end.edge, RowsOfSlice(pie_.radius, start, end), halfWidths_,
@@ -89,15 +113,22 @@ private:
     int32_t* halfWidths_ = nullptr;
 };
 
+// The radius where a slice begins is drawn when the slice is filled, as the fill may have covered
+// it. While slices are so thin that the next one begins at the same pixel, the last of them does
+// that for all: the number of lines depends on the radius, not on the slices.
 void DrawSlices(const GraphSeries& series, HDC dc, const PieLayout& pie) {
+    SlicePens pens;
     const DiscFiller disc(dc, pie);
     Boundary end = BoundaryAt(pie.radius, 0);
     for (int k = 0; k < series.pointCount; ++k) {
         const Boundary start = end;
         end = BoundaryAt(pie.radius, start.edge.degrees + SliceShare(series, k) * kFullTurn);
-        disc.FillPieSlice(start, end, SliceColour(k));
-        DrawRadius(dc, pie.centre, start.end.x, start.end.y);  // the fill may have covered it
-        DrawRadius(dc, pie.centre, end.end.x, end.end.y);
+        disc.FillPieSlice(start, end, pens.Of(k));
+        const bool isLast = k == series.pointCount - 1;
+        if (isLast || !IsSamePoint(start.end, end.end)) {
+            DrawRadius(dc, pie.centre, start.end.x, start.end.y);
+        }
+        if (isLast) DrawRadius(dc, pie.centre, end.end.x, end.end.y);
     }
 }
 
@@ -120,19 +151,55 @@ LabelPlace PlaceLabel(const GraphRecord& graph, POINT centre, POINT at) {
     return {{at.x, at.y, at.x + width, at.y + height}, DT_LEFT};
 }
 
+// Where labels of thin slices fall on one another. A text that is drawn again on the very same
+// place changes nothing more: at once where pixels have its colour or are left alone, and where
+// they are blended with it after as many times as a channel has values, since each time that
+// changes a pixel darkens it. So what is drawn depends on the places around the pie, not on the
+// slices.
+class RepeatedLabels {
+public:
+    explicit RepeatedLabels(const NumberWidths& widths)
+        : limit_(widths.stencil ? 1 : kChannelValues) {}
+
+    // Whether to draw a percentage at a place. Places come in the order of their angles.
+    bool IsNeeded(POINT at, int percentage) {
+        if (percentage < 0 || percentage > kWhole) return true;
+        if (!isStarted_ || !IsSamePoint(at, at_)) {
+            std::fill(std::begin(drawn_), std::end(drawn_), uint8_t{0});
+            isStarted_ = true;
+            at_ = at;
+        }
+        if (drawn_[percentage] == limit_) return false;
+        ++drawn_[percentage];
+        return true;
+    }
+
+private:
+    static constexpr int kWhole = 100;
+    static constexpr int kChannelValues = 255;
+
+    int limit_;
+    bool isStarted_ = false;
+    POINT at_ = {};
+    uint8_t drawn_[kWhole + 1] = {};  // of each percentage at this place
+};
+
 void DrawPercentages(const GraphRecord& graph, const GraphSeries& series, HDC dc, int radius) {
     SelectScope font(dc, graph.hfontAxis);
     const POINT centre = SurfaceCentre(graph);
+    RepeatedLabels repeated(graph.numberWidths);
     double end = 0;
     for (int k = 0; k < series.pointCount; ++k) {
         const double start = end;
         const double share = SliceShare(series, k);
         end += share * kFullTurn;
+        const int percentage = TruncateToInt(share * 100.0 + 0.5);
         const POINT offset = RadiusEnd(radius + kLabelGap, (start + end) * 0.5);
+        if (!repeated.IsNeeded(offset, percentage)) continue;
         const LabelPlace place =
             PlaceLabel(graph, centre, {centre.x + offset.x, centre.y + offset.y});
         wchar_t text[kDecimalCapacity + 1];
-        _itow(TruncateToInt(share * 100.0 + 0.5), text, 10);
+        _itow(percentage, text, 10);
         wcscat(text, L"%");
         DrawNumberText(dc, graph.numberWidths, text, place.box, place.alignment);
     }

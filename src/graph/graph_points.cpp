@@ -4,6 +4,7 @@
 
 #include "graph/graph_numbers.h"
 #include "graph/graph_scale.h"
+#include "platform/assert.h"
 #include "platform/local_text.h"
 
 namespace kor {
@@ -107,22 +108,28 @@ SeriesPoints::~SeriesPoints() { FreeLocal(points_); }
 
 void SeriesPoints::Append(const GraphRecord& graph, const GraphSeries& series, int column,
                           int index) {
+    KOR_ASSERT(count_ < capacity_);
     points_[spare_ + count_++] = {column, yPixel(graph, series.values[index])};
 }
 
+// The first and the last point, and between them each extreme that lies beyond both. Those are all
+// different points, even where values tie: so at most four, and never more than there are.
 void SeriesPoints::AppendPosition(const GraphRecord& graph, const GraphSeries& series, int column,
                                   int number, int end) {
     const PositionSummary found = Summarise(series.values, number, end);
     if (found.first < 0) return;
-    int order[] = {found.first, found.lowest, found.highest, found.last};
-    // All ways over both extremes have the same pixels; this is the shorter one.
-    const Comparable first = ComparableOf(series.values[found.first]);
-    if (first > ComparableOf(series.values[found.last])) std::swap(order[1], order[2]);
-    int previous = -1;
-    for (const int index : order) {
-        if (index != previous) Append(graph, series, column, index);
-        previous = index;
-    }
+    const auto valueOf = [&](int index) { return ComparableOf(series.values[index]); };
+    const Comparable first = valueOf(found.first);
+    const Comparable last = valueOf(found.last);
+    const bool reachesLower = valueOf(found.lowest) < std::min(first, last);
+    const bool reachesHigher = valueOf(found.highest) > std::max(first, last);
+    // Either way over both extremes has the same pixels; this is the shorter one.
+    const bool highestFirst = first > last;
+    Append(graph, series, column, found.first);
+    if (reachesHigher && highestFirst) Append(graph, series, column, found.highest);
+    if (reachesLower) Append(graph, series, column, found.lowest);
+    if (reachesHigher && !highestFirst) Append(graph, series, column, found.highest);
+    if (found.last != found.first) Append(graph, series, column, found.last);
 }
 
 // Point end - 1 is there. The polyline's last pixel is that of its last points, as many as share
@@ -146,15 +153,16 @@ void SeriesPoints::AppendLastPosition(const GraphRecord& graph, const GraphSerie
 
 bool SeriesPoints::Make(const GraphRecord& graph, const GraphSeries& series, int left, int right,
                         PointsOf shape, int spare) {
-    constexpr int kPointsPerPosition = 4;
-    constexpr int kPointsAtTheEnd = 2;
+    constexpr int kPointsPerPosition = 4;  // see AppendPosition
+    constexpr int kPointsAtTheEnd = 2;     // those that AppendLastPosition appends itself
     const PointRange range =
         WithNumbersAtEnds(series, PointsBetween(graph, xPixel, series.pointCount, left, right));
     const int all = std::max(range.last - range.first + 1, 0);
-    const int positions = std::max(right - left, 0) + 4;  // those in view, and one on each side
-    const int most = std::min(all, positions * kPointsPerPosition + kPointsAtTheEnd);
+    // Positions with values: those from `left` to `right`, and one on either side.
+    const int positions = std::max(right - left, 0) + 1 + 2;
+    capacity_ = std::min(all, positions * kPointsPerPosition + kPointsAtTheEnd);
     points_ = static_cast<POINT*>(
-        LocalAlloc(LMEM_FIXED, static_cast<SIZE_T>(most + 2 * spare) * sizeof(POINT)));
+        LocalAlloc(LMEM_FIXED, static_cast<SIZE_T>(capacity_ + 2 * spare) * sizeof(POINT)));
     if (!points_) return false;
     spare_ = spare;
     for (PositionWalk walk(graph, xPixel, range); !walk.IsAtEnd(); walk.Next()) {

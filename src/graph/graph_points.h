@@ -86,6 +86,7 @@ private:
                             int number, int end);
 
     POINT* points_ = nullptr;
+    int capacity_ = 0;  // without the spare places
     int spare_ = 0;
     int count_ = 0;
 };

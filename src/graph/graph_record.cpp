@@ -5,7 +5,6 @@
 #include "graph/graph_palette.h"
 #include "graph/graph_series.h"
 #include "platform/local_text.h"
-#include "platform/records.h"
 
 namespace kor {
 
@@ -44,7 +43,7 @@ GraphRecord* CreateGraphRecord() {
     return graph;
 }
 
-void DestroyGraphRecord(GraphRecord* graph) {
+void FreeRecord(GraphRecord* graph) {
     if (graph->hbmMem) {
         SelectObject(graph->hdcMem, graph->blankBitmap);
         DeleteObject(graph->hbmMem);

@@ -6,6 +6,7 @@
 
 #include "numbers/pixel_scale.h"
 #include "platform/platform.h"
+#include "platform/records.h"
 #include "text/number_run.h"
 
 namespace kor {
@@ -34,9 +35,8 @@ struct Triangle {
 // A print under way. It runs inside one message, but its dialog lets others through.
 enum class PrintState : int32_t {
     none,
-    underWay,   // the record is the screen's; a second print is refused
-    onPage,     // the record stands for the page; only WM_DESTROY may touch it
-    windowGone  // the print frees the record at its end
+    underWay,  // the record is the screen's; a second print is refused
+    onPage     // the record stands for the page; only WM_DESTROY may touch it
 };
 
 struct GraphRecord {
@@ -122,6 +122,7 @@ struct GraphRecord {
     PrintState printing;
     bool paintMissed;  // WM_PAINT came while the record stood for a page
     bool sizeMissed;   // WM_SIZE likewise
+    RecordLife life;
 };
 
 constexpr uint32_t kPanLeft = 1;
@@ -135,7 +136,7 @@ static_assert(sizeof(void*) != 4 || offsetof(GraphRecord, xDataMax) % 8 == 0);
 GraphRecord* CreateGraphRecord();
 
 // Frees the record and all it holds, but no window.
-void DestroyGraphRecord(GraphRecord* graph);
+void FreeRecord(GraphRecord* graph);
 
 // Ranges and mapping as at the start, automatic again; the zoom stays.
 void ResetGraphRanges(GraphRecord& graph);

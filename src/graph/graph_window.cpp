@@ -22,7 +22,6 @@
 #include "graph/printing.h"
 #include "graph/printing_calls.h"
 #include "platform/gdi_scopes.h"
-#include "platform/records.h"
 #include "platform/windows_helpers.h"
 
 namespace kor {
@@ -54,6 +53,7 @@ bool CreateImageDC(GraphRecord& graph) {
 LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
     GraphRecord* graph = CreateGraphRecord();
     if (!graph) return 1;
+    const RecordUse use(graph);
     SetUserData(hwnd, graph);
     if (!creation || !creation->hInstance || !creation->hwndParent) return 1;
     LoadPrintModules();
@@ -71,14 +71,10 @@ LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
 }
 
 // The legend goes with the chart's window, the tooltip with the parent's.
-LRESULT OnDestroy(HWND hwnd, GraphRecord* graph) {
-    DetachLegend(graph->hwndLegend);
+LRESULT OnDestroy(HWND hwnd, GraphRecord& graph) {
+    DetachLegend(graph.hwndLegend);
     SetUserData(hwnd, nullptr);
-    if (graph->printing == PrintState::none) {
-        DestroyGraphRecord(graph);
-    } else {
-        graph->printing = PrintState::windowGone;
-    }
+    RetireRecord(graph);
     return 0;
 }
 
@@ -143,7 +139,7 @@ bool OnNotify(GraphRecord& graph, WPARAM code, LPARAM argument) {
         if (graph.hwnd) RunGraphProperties(graph.hwnd);
         return true;
     case GN_REDRAW: RedrawGraph(graph); return true;
-    case GN_PRINT: PrintGraph(graph); return true;  // the record may be gone now
+    case GN_PRINT: PrintGraph(graph); return true;
     case GN_LIVEUPDATE: OnLiveUpdate(graph, argument); return true;
     case GN_SETVALUE:
         if (argument) SetSeriesValue(graph, *reinterpret_cast<const GraphValue*>(argument));
@@ -176,13 +172,14 @@ LRESULT CALLBACK GraphProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam
         return OnCreate(hwnd, reinterpret_cast<CREATESTRUCTW*>(lParam));
     }
     if (!graph) return DefWindowProcW(hwnd, message, wParam, lParam);
+    const RecordUse use(graph);
     if (graph->printing == PrintState::onPage && message != WM_DESTROY) {
         return AnswerOnPage(*graph, hwnd, message, wParam, lParam);
     }
 
     const auto number = static_cast<int32_t>(lParam);
     switch (message) {
-    case WM_DESTROY: return OnDestroy(hwnd, graph);
+    case WM_DESTROY: return OnDestroy(hwnd, *graph);
     case WM_SIZE: return OnSize(*graph, hwnd, wParam, lParam);
     case WM_PAINT:
         if (graph->hwnd) PaintFromImage(*graph);

@@ -41,6 +41,7 @@ void BecomeScreen(GraphRecord& graph, const GraphRecord& screen) {
     graph.hfontLabel = page.hfontLabel;
     graph.hfontAxis = page.hfontAxis;
     graph.printing = page.printing;
+    graph.life = page.life;
     graph.paintMissed = page.paintMissed;
     graph.sizeMissed = page.sizeMissed;
     ClipToSurface(graph, graph.hdcMem);
@@ -48,8 +49,8 @@ void BecomeScreen(GraphRecord& graph, const GraphRecord& screen) {
 
 // Default processing has validated the window and left the image in its old size.
 void CatchUp(GraphRecord& graph) {
-    if (graph.printing != PrintState::onPage) return;
     graph.printing = PrintState::underWay;
+    if (graph.life.retired) return;
     const RECT client = ClientRectOf(graph.hwnd);
     const bool fits = client.right == graph.rcPlot.right && client.bottom == graph.rcPlot.bottom;
     if (graph.sizeMissed && !fits && graph.hdcMem) {
@@ -64,7 +65,7 @@ void PrintOn(GraphRecord& graph, HDC printer) {
     if (graph.hwnd) EnableWindow(graph.hwnd, FALSE);
     BeginPrintJob(printer);
     const GraphRecord screen = graph;
-    if (graph.printing == PrintState::underWay) graph.printing = PrintState::onPage;
+    graph.printing = PrintState::onPage;
     BecomePage(graph, printer);
     DrawGraph(graph);
     EndPrintJob(printer);
@@ -79,16 +80,12 @@ void PrintGraph(GraphRecord& graph) {
     if (!CanPrint() || graph.printing != PrintState::none) return;
     graph.printing = PrintState::underWay;
     HDC printer = AskForPrinter(graph.hwnd);
-    if (printer && graph.printing == PrintState::underWay) {
+    if (printer && !graph.life.retired) {
         PrintOn(graph, printer);
     } else if (printer) {
         DeleteDC(printer);  // chosen for a chart that is gone
     }
-    if (graph.printing == PrintState::windowGone) {
-        DestroyGraphRecord(&graph);
-    } else {
-        graph.printing = PrintState::none;
-    }
+    graph.printing = PrintState::none;
 }
 
 }  // namespace kor

@@ -6,7 +6,7 @@
 namespace kor {
 
 // Asks for a printer, draws the chart on one page of it, and leaves the record as it was and the
-// window disabled. Frees the record when its window goes meanwhile.
+// window disabled. The window may go meanwhile.
 void PrintGraph(GraphRecord& graph);
 
 }  // namespace kor

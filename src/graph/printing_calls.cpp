@@ -22,8 +22,8 @@ PageProcedure FindPageProcedure(const wchar_t* name) {
 }  // namespace
 
 void LoadPrintModules() {
-    if (!dialogModule) dialogModule = LoadLibraryW(kPrintDialogModule);
-    if (!jobModule) jobModule = LoadLibraryW(kPrintJobModule);
+    if (!dialogModule) dialogModule = LoadPrintModule(kPrintDialogModule);
+    if (!jobModule) jobModule = LoadPrintModule(kPrintJobModule);
 }
 
 bool CanPrint() { return dialogModule && jobModule; }

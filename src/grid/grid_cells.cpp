@@ -55,13 +55,20 @@ struct CellText {
     bool keepSpan;  // centred and not too wide: over the span all the same
 };
 
+void DrawRun(TextRun& run, const RECT& area, UINT format) {
+    const RECT client = ClientRectOf(grid.hwndGrid);
+    if (zoomLevel >= kZoomHuge) run.LimitTo(client);
+    run.Draw(area, format);
+}
+
 void DrawCellText(HDC dc, const RECT& box, RECT area, const CellText& cell) {
     const int width = area.right - area.left;
     TextRun run(dc, cell.text);
     if (cell.fitCheck && width < run.Width()) {
         wchar_t hashes[kHashLimit + 1];
         FillWithHashes(dc, width, hashes);
-        TextRun(dc, hashes).Draw(area, kDefaultFormat);
+        TextRun row(dc, hashes);
+        DrawRun(row, area, kDefaultFormat);
         return;
     }
     const bool mayShrink = !cell.fitCheck && !cell.keepSpan && (cell.format & DT_CENTER);
@@ -69,7 +76,7 @@ void DrawCellText(HDC dc, const RECT& box, RECT area, const CellText& cell) {
         area.left = box.left + kTextMargin;
         area.right = box.right - kTextMargin;
     }
-    run.Draw(area, cell.format);
+    DrawRun(run, area, cell.format);
 }
 
 }  // namespace

@@ -37,38 +37,46 @@ void FormatColumnName(int column, wchar_t (&name)[kColumnNameCapacity]) {
     *letter = L'\0';
 }
 
+// Each message to a strip may change the grid: what an item says is looked up when it is its turn.
 LRESULT UpdateColumnHeader(int width) {
-    const GridAxis axis = ColumnAxis();
-    const int count = CountVisible(axis, grid.firstVisibleColumn, kColumnLimit, width, zoomLevel);
+    const int count =
+        CountVisible(ColumnAxis(), grid.firstVisibleColumn, kColumnLimit, width, zoomLevel);
     SetItemCount(grid.hwndColumnHeader, count, PixelsFromUnits(kDefaultColumnWidth, zoomLevel));
     grid.visibleColumnCount = static_cast<uint8_t>(count);
     grid.maxVisibleColumnCount = std::max(grid.maxVisibleColumnCount, grid.visibleColumnCount);
-    for (int i = 0; i < count; ++i) {
-        wchar_t name[kColumnNameCapacity];
-        FormatColumnName(grid.firstVisibleColumn + i, name);
-        const HeaderItemDesc item = {
-            name, static_cast<WORD>(SizeOf(axis, grid.firstVisibleColumn + i, zoomLevel))};
-        KorHeader_SetItem(grid.hwndColumnHeader, i, &item);
-    }
-    Repaint(grid.hwndColumnHeader);
+    FillColumnHeader();
     return 1;
 }
 
 LRESULT UpdateRowHeader(int height) {
-    const GridAxis axis = RowAxis();
-    const int count = CountVisible(axis, grid.firstVisibleRow, kRowLimit, height, zoomLevel);
+    const int count = CountVisible(RowAxis(), grid.firstVisibleRow, kRowLimit, height, zoomLevel);
     SetItemCount(grid.hwndRowHeader, count, PixelsFromUnits(kDefaultRowHeight, zoomLevel));
     grid.visibleRowCount = static_cast<uint8_t>(count);
     grid.maxVisibleRowCount = std::max(grid.maxVisibleRowCount, grid.visibleRowCount);
-    for (int i = 0; i < count; ++i) {
+    FillRowHeader();
+    return 1;
+}
+
+void FillColumnHeader() {
+    for (int i = 0; i < grid.visibleColumnCount; ++i) {
+        const int column = grid.firstVisibleColumn + i;
+        wchar_t name[kColumnNameCapacity];
+        FormatColumnName(column, name);
+        const HeaderItemDesc item = {name, static_cast<WORD>(ColumnWidth(column))};
+        KorHeader_SetItem(grid.hwndColumnHeader, i, &item);
+    }
+    Repaint(grid.hwndColumnHeader);
+}
+
+void FillRowHeader() {
+    for (int i = 0; i < grid.visibleRowCount; ++i) {
+        const int row = grid.firstVisibleRow + i;
         wchar_t number[kDecimalCapacity];
-        FormatDecimal(grid.firstVisibleRow + i + 1, number);
-        const HeaderItemDesc item = {
-            number, static_cast<WORD>(SizeOf(axis, grid.firstVisibleRow + i, zoomLevel))};
+        FormatDecimal(row + 1, number);
+        const HeaderItemDesc item = {number, static_cast<WORD>(RowHeight(row))};
         KorHeader_SetItem(grid.hwndRowHeader, i, &item);
     }
     Repaint(grid.hwndRowHeader);
-    return 1;
 }
 
 LRESULT UpdateColumnHeaderOverCells() {

@@ -17,6 +17,10 @@ void FormatColumnName(int column, wchar_t (&name)[kColumnNameCapacity]);
 LRESULT UpdateColumnHeader(int width);
 LRESULT UpdateRowHeader(int height);
 
+// Labels and sizes the items that a strip has, and repaints it.
+void FillColumnHeader();
+void FillRowHeader();
+
 // With the extent of the cell area, client size less cellsLeft or cellsTop.
 LRESULT UpdateColumnHeaderOverCells();
 LRESULT UpdateRowHeaderOverCells();

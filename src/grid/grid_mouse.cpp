@@ -1,11 +1,13 @@
 // A press sets the anchor and starts a timer; moves span the block from the anchor to the pointer;
-// the release stops the timer and clears the anchor. The anchor alone says that a drag is under
-// way: after a release with Shift held, moves without a button go on extending.
+// the release stops the timer and clears the anchor. The anchor alone says that moves extend the
+// block: after a release with Shift held, moves without a button go on extending. A host may take
+// the capture away at any time, with a message box for example; that ends a drag as well.
 #include "grid/grid_mouse.h"
 
 #include <algorithm>
 
 #include "grid/grid_drawing.h"
+#include "grid/grid_keyboard.h"
 #include "grid/grid_notify.h"
 #include "grid/grid_scrolling.h"
 #include "grid/grid_selection.h"
@@ -25,6 +27,19 @@ void FocusGridByMouse() {
     grid.focusByMouse = false;
 }
 
+void SetAnchor(GridCellPair cell) {
+    grid.anchorColumn = cell.column;
+    grid.anchorRow = cell.row;
+}
+
+void EndDrag(bool keepAnchor) {
+    grid.isDragging = false;
+    if (!keepAnchor) ClearAnchor();
+    KillTimer(grid.hwndGrid, kAutoScrollTimerId);
+    grid.lastMouseX = 0;
+    grid.lastMouseY = 0;
+}
+
 GridSelection BlockFromAnchor(GridCellPair hit) {
     return BlockBetween(grid.anchorColumn, grid.anchorRow, hit.column, hit.row);
 }
@@ -35,18 +50,21 @@ LRESULT OnGridButtonDown(WPARAM keys, int x, int y) {
     const RECT client = ClientRectOf(grid.hwndGrid);
     if (x > client.right && y > client.bottom) return 0;
     FocusGridByMouse();
+    grid.isDragging = true;
     SetCapture(grid.hwndGrid);
     const GridCellPair hit = CellFromPoint(x, y);
     grid.lastMouseX = x;
     grid.lastMouseY = y;
-    SetTimer(grid.hwndGrid, kAutoScrollTimerId, kAutoScrollInterval, nullptr);
+    // Whoever had the capture may have taken it back at once: then there is no drag.
+    if (grid.isDragging) {
+        SetTimer(grid.hwndGrid, kAutoScrollTimerId, kAutoScrollInterval, nullptr);
+    }
     InvertSelection(Invalidate::yes);
     if ((keys & MK_SHIFT) && IsAnchored()) {
         grid.selection = BlockFromAnchor(hit);
     } else {
         grid.selection = {hit.column, hit.column, hit.row, hit.row};
-        grid.anchorColumn = hit.column;
-        grid.anchorRow = hit.row;
+        if (grid.isDragging) SetAnchor(hit);
     }
     NotifyCellClicked(hit);  // before the new block is highlighted
     InvertSelection(Invalidate::yes);
@@ -65,13 +83,14 @@ LRESULT OnGridPointerMove(int x, int y) {
 }
 
 LRESULT OnGridButtonUp(WPARAM keys) {
-    if (!(keys & MK_SHIFT)) ClearAnchor();
-    KillTimer(grid.hwndGrid, kAutoScrollTimerId);
+    EndDrag((keys & MK_SHIFT) != 0);
     ReleaseCapture();
-    grid.lastMouseX = 0;
-    grid.lastMouseY = 0;
     NotifySelectionDone();
     return 0;
+}
+
+void LoseGridDrag() {
+    if (grid.isDragging) EndDrag(IsShiftDown());
 }
 
 void OnAutoScroll() {

@@ -12,6 +12,10 @@ LRESULT OnGridButtonDown(WPARAM keys, int x, int y);
 LRESULT OnGridPointerMove(int x, int y);
 LRESULT OnGridButtonUp(WPARAM keys);
 
+// The capture has gone to another window, or is to be given up: the drag ends as a release ends it,
+// but the parent is not notified.
+void LoseGridDrag();
+
 // One step of the timer that runs while the button is down.
 void OnAutoScroll();
 

@@ -70,6 +70,21 @@ LRESULT OnHeaderResizing(HWND header, int position) {
     return 0;
 }
 
+void OnHeaderResizeLost(HWND header) {
+    const bool isColumn = header == grid.hwndColumnHeader;
+    if (!isColumn && header != grid.hwndRowHeader) return;
+    {
+        WindowDC window(grid.hwndGrid);
+        (isColumn ? InvertColumnLine : InvertRowLine)(window.get(), ClientRectOf(grid.hwndGrid));
+    }
+    grid.resizeLinePos = kNoResizeLine;
+    if (isColumn) {
+        FillColumnHeader();
+    } else {
+        FillRowHeader();
+    }
+}
+
 LRESULT OnHeaderResized(HWND header, int item, int units) {
     const auto size = static_cast<uint16_t>(units);
     if (header == grid.hwndColumnHeader) {

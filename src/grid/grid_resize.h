@@ -12,4 +12,8 @@ LRESULT OnHeaderResizing(HWND header, int position);
 // the first visible column or row.
 LRESULT OnHeaderResized(HWND header, int item, int units);
 
+// A border of this strip was being dragged and will not be let go: the line goes, and the strip has
+// its old sizes again.
+void OnHeaderResizeLost(HWND header);
+
 }  // namespace kor

@@ -62,6 +62,7 @@ struct GridState {
     uint32_t functionButtonMessageId = 0;
     bool editCaretMode = false;  // the user clicked into the edit: arrows move its caret
     bool focusByMouse = false;   // a press in the grid is taking the focus just now
+    bool isDragging = false;     // from a press to its release, while the grid has the capture
     int32_t lastMouseX = 0;
     int32_t lastMouseY = 0;
     int32_t resizeLinePos = kNoResizeLine;  // client x or y of the inverted line

@@ -102,6 +102,7 @@ LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
         creation->hInstance);  // fails when it already is, and need not succeed then
     grid.hwndParent = creation->hwndParent;
     grid.hwndGrid = hwnd;
+    WhenHeaderResizeIsLost(OnHeaderResizeLost);
     CreateChildren(creation->hInstance);
     grid.gridLinePen = CreatePen(PS_SOLID, 1, kGridLineColour);
     CreateImageDC();
@@ -109,6 +110,7 @@ LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
 }
 
 LRESULT OnDestroy() {
+    LoseGridDrag();
     if (grid.memoryBitmap) {
         SelectObject(grid.memoryDC, grid.blankBitmap);
         DeleteObject(grid.memoryBitmap);
@@ -170,6 +172,10 @@ LRESULT CALLBACK GridProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam)
     case WM_MOUSEMOVE: return OnGridPointerMove(lowWord, SignedHighWord(lParam));
     case WM_LBUTTONDOWN: return OnGridButtonDown(wParam, lowWord, SignedHighWord(lParam));
     case WM_LBUTTONUP: return OnGridButtonUp(wParam);
+    case WM_CAPTURECHANGED:
+        if (reinterpret_cast<HWND>(lParam) != hwnd) LoseGridDrag();
+        break;
+    case WM_CANCELMODE: LoseGridDrag(); break;
     case HCN_ITEMCLICK: return OnHeaderClick(sender, lowWord, highWord);
     case HCN_ITEMRESIZING: return OnHeaderResizing(sender, highWord);
     case HCN_ITEMRESIZED: return OnHeaderResized(sender, lowWord, highWord);

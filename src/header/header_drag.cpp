@@ -1,6 +1,7 @@
 // One press or border drag is tracked at a time, in `headerDrag`. The strip under the button has
 // the capture, so moves and the release come to it; should another strip receive them all the same,
-// an item that it has not is ignored.
+// an item that it has not is ignored. A drag ends with the release, with the capture, which another
+// window may take, or with the strip.
 #include "header/header_drag.h"
 
 #include <korcontrols/header.h>
@@ -18,6 +19,7 @@ namespace {
 constexpr int kSizeBoundMargin = 10;
 
 void PostToParent(const HeaderRecord& header, UINT notification, int lowWord, int highWord) {
+    if (header.life.retired) return;  // nobody could ask the sender anything
     PostMessageW(header.parent, notification, reinterpret_cast<WPARAM>(header.window),
                  WordPair(lowWord, highWord));
 }
@@ -62,9 +64,21 @@ void PressMovesTo(const HeaderRecord& header, int position) {
     PostToParent(header, HCN_ITEMCLICK, headerDrag.pressAnchor, item);
 }
 
+// Before the capture is taken: whoever loses it may do anything.
+void BeginDrag(const HeaderRecord& header) {
+    headerDrag.strip = &header;
+    SetCapture(header.window);
+}
+
+void ForgetDrag() {
+    headerDrag.strip = nullptr;
+    headerDrag.resizeItem = -1;
+    headerDrag.pressAnchor = -1;
+}
+
 void EndResize(const HeaderRecord& header) {
     const int resized = headerDrag.resizeItem;
-    headerDrag.resizeItem = -1;
+    ForgetDrag();
     ReleaseCapture();
     if (!HasItem(header, resized)) return;
     const auto item = static_cast<uint32_t>(resized);
@@ -105,10 +119,10 @@ LRESULT OnHeaderButtonDown(HeaderRecord& header, int position) {
         // nothing to drag then, and the release leaves the capture alone.
         headerDrag.resizeItem = hit.borderItem;
         headerDrag.dragPosition = position;
-        SetCapture(header.window);
+        BeginDrag(header);
     } else if (hit.item >= 0 && header.parent) {
         headerDrag.pressAnchor = hit.item;
-        SetCapture(header.window);
+        BeginDrag(header);
         PostToParent(header, HCN_ITEMCLICK, hit.item, hit.item);
     }
     return 0;
@@ -127,10 +141,21 @@ LRESULT OnHeaderButtonUp(HeaderRecord& header) {
     if (headerDrag.resizeItem != -1) {
         EndResize(header);
     } else if (headerDrag.pressAnchor != -1) {
-        headerDrag.pressAnchor = -1;
+        ForgetDrag();
         ReleaseCapture();
     }
     return 0;
+}
+
+void LoseHeaderDrag(const HeaderRecord& header) {
+    if (headerDrag.strip != &header) return;
+    const bool wasResizing = headerDrag.resizeItem != -1;
+    ForgetDrag();
+    if (wasResizing && headerDrag.resizeLost) headerDrag.resizeLost(header.window);
+}
+
+void EndHeaderDrag(const HeaderRecord& header) {
+    if (headerDrag.strip == &header) ForgetDrag();
 }
 
 }  // namespace kor

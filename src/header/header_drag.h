@@ -11,6 +11,13 @@ LRESULT OnHeaderButtonDown(HeaderRecord& header, int position);
 LRESULT OnHeaderPointerMove(HeaderRecord& header, int position);
 LRESULT OnHeaderButtonUp(HeaderRecord& header);
 
+// The strip has lost the capture: what was pressed or dragged in it is over, and the parent is not
+// notified. A dragged item keeps its size.
+void LoseHeaderDrag(const HeaderRecord& header);
+
+// The strip goes: so does a drag in it.
+void EndHeaderDrag(const HeaderRecord& header);
+
 // Client size of the strip changed: how far its items may be dragged follows.
 void UpdateSizeBounds(const HeaderRecord& header, int clientWidth, int clientHeight);
 

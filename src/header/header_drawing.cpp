@@ -67,10 +67,13 @@ void DrawVerticalItem(HDC dc, const RECT& client, int top, int bottom, uint32_t 
     }
 }
 
-void DrawLabel(HDC dc, const wchar_t* text, const RECT& box, UINT format, uint32_t states) {
+void DrawLabel(HDC dc, const wchar_t* text, const RECT& box, UINT format, uint32_t states,
+               const RECT& client) {
     SetBkMode(dc, TRANSPARENT);
     SetTextColor(dc, (states & HIS_SELECTED) ? kSelectedTextColour : kTextColour);
-    TextRun(dc, text).Draw(box, format);
+    TextRun label(dc, text);
+    if (zoomLevel >= kZoomHuge) label.LimitTo(client);
+    label.Draw(box, format);
 }
 
 void DrawItem(const HeaderRecord& header, uint32_t index, const RECT& client, int start, int end,
@@ -83,14 +86,14 @@ void DrawItem(const HeaderRecord& header, uint32_t index, const RECT& client, in
         if (!hasText) return;
         SelectScope zoomed(header.dc, font);
         DrawLabel(header.dc, text, {client.left, start, client.right - kTextMargin, end},
-                  DT_RIGHT | DT_VCENTER, states);
+                  DT_RIGHT | DT_VCENTER, states, client);
     } else {
         DrawHorizontalItem(header.dc, client, start, end, states);
         if (!hasText) return;
         SelectScope zoomed(header.dc, font);
         DrawLabel(header.dc, text,
                   {start + kTextMargin, client.top, end - kTextMargin, client.bottom},
-                  DT_CENTER | DT_VCENTER, states);
+                  DT_CENTER | DT_VCENTER, states, client);
     }
 }
 

@@ -28,18 +28,9 @@ void DeletePaintObjects() {
     headerPaint = {};
 }
 
-// Frees the arrays, the DC and the record itself. Labels may lie in any place, also past the count.
-void FreeRecord(HeaderRecord* record) {
-    if (record->texts) {
-        for (uint32_t i = 0; i <= record->capacity; ++i) {
-            if (record->texts[i]) LocalFree(record->texts[i]);
-        }
-        LocalFree(record->texts);
-    }
-    if (record->sizes) LocalFree(record->sizes);
-    if (record->states) LocalFree(record->states);
-    if (record->dc) ReleaseDC(record->window, record->dc);
-    LocalFree(record);
+void ReleaseRecordDC(HeaderRecord& record) {
+    if (record.dc) ReleaseDC(record.window, record.dc);
+    record.dc = nullptr;
 }
 
 void Append(HeaderRecord* record) {
@@ -75,6 +66,7 @@ HeaderRecord* CreateHeaderRecord(const CREATESTRUCTW& creation, HWND window) {
     record->sizes = AllocateLocal<uint16_t>(kHeaderInitialCapacity + 1);
     record->states = AllocateLocal<uint8_t>(kHeaderInitialCapacity + 1);
     if (!record->texts || !record->sizes || !record->states) {
+        ReleaseRecordDC(*record);
         FreeRecord(record);
         return nullptr;
     }
@@ -82,18 +74,34 @@ HeaderRecord* CreateHeaderRecord(const CREATESTRUCTW& creation, HWND window) {
     return record;
 }
 
-void DestroyHeaderRecord(HeaderRecord* record) {
-    Unlink(record);
-    FreeRecord(record);
+// The DC goes at once: the system hands it to another window next.
+void RetireHeaderRecord(HeaderRecord& record) {
+    Unlink(&record);
+    ReleaseRecordDC(record);
     if (!firstRecord) DeletePaintObjects();
+    RetireRecord(record);
+}
+
+// Labels may lie in any place, also past the count.
+void FreeRecord(HeaderRecord* record) {
+    if (record->texts) {
+        for (uint32_t i = 0; i <= record->capacity; ++i) {
+            if (record->texts[i]) LocalFree(record->texts[i]);
+        }
+        LocalFree(record->texts);
+    }
+    if (record->sizes) LocalFree(record->sizes);
+    if (record->states) LocalFree(record->states);
+    LocalFree(record);
 }
 
 bool IsVertical(const HeaderRecord& record) { return (record.style & HCS_VERTICAL) != 0; }
 
+// Wraps round where many items are as large as can be.
 int ItemStart(const HeaderRecord& record, uint32_t index) {
-    int start = 0;
+    uint32_t start = 0;
     for (uint32_t i = 0; i < index; ++i) start += record.sizes[i];
-    return start;
+    return static_cast<int>(start);
 }
 
 }  // namespace kor

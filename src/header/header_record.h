@@ -3,10 +3,11 @@
 #pragma once
 
 #include "platform/platform.h"
+#include "platform/records.h"
 
 namespace kor {
 
-// Owned by the module list from WM_CREATE to WM_DESTROY. The three item arrays always have one
+// In the module's list from WM_CREATE to WM_DESTROY. The three item arrays always have one
 // place more than `capacity` says: an index equal to the count is a valid one, even when the strip
 // is full.
 struct HeaderRecord {
@@ -20,22 +21,25 @@ struct HeaderRecord {
     uint8_t* states;  // HIS_ bits
     uint32_t style;   // the window style at creation
     HeaderRecord* next;
+    RecordLife life;
 };
 
-static_assert(sizeof(void*) != 4 || sizeof(HeaderRecord) == 40);
 static_assert(sizeof(void*) != 4 || offsetof(HeaderRecord, sizes) == 24);
+static_assert(sizeof(void*) != 4 || offsetof(HeaderRecord, next) == 36);
 
 constexpr uint32_t kHeaderInitialCapacity = 10;
 constexpr uint32_t kHeaderCapacityStep = 25;
 
 // A drag and its bounds, in pixels along the strip; indexes are -1 for none.
 struct HeaderDrag {
+    const HeaderRecord* strip = nullptr;  // where the button went down; null without a drag
     int maximumRowSize = 600;
     int maximumColumnSize = 600;
-    int resizeItem = -1;       // whose border is dragged
-    int pressAnchor = -1;      // where the button went down
-    int lastHoveredItem = -1;  // last one reported; outlives the drag
-    int dragPosition = 0;      // last pointer position while resizing
+    int resizeItem = -1;                       // whose border is dragged
+    int pressAnchor = -1;                      // where the button went down
+    int lastHoveredItem = -1;                  // last one reported; outlives the drag
+    int dragPosition = 0;                      // last pointer position while resizing
+    void (*resizeLost)(HWND strip) = nullptr;  // see WhenHeaderResizeIsLost
 };
 
 extern HeaderDrag headerDrag;
@@ -56,8 +60,11 @@ HeaderRecord* FindHeaderRecord(HWND window);
 // Makes the record of a new window and appends it to the list; null when there is no memory.
 HeaderRecord* CreateHeaderRecord(const CREATESTRUCTW& creation, HWND window);
 
-// Takes the record out of the list and frees all it holds.
-void DestroyHeaderRecord(HeaderRecord* record);
+// WM_DESTROY: takes the record out of the list and gives its DC back.
+void RetireHeaderRecord(HeaderRecord& record);
+
+// Frees the record and all it holds.
+void FreeRecord(HeaderRecord* record);
 
 bool IsVertical(const HeaderRecord& record);
 

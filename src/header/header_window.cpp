@@ -23,7 +23,8 @@ LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
 }
 
 LRESULT OnDestroy(HeaderRecord& header) {
-    DestroyHeaderRecord(&header);
+    EndHeaderDrag(header);
+    RetireHeaderRecord(header);
     return 0;
 }
 
@@ -68,6 +69,7 @@ LRESULT CALLBACK HeaderProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lPara
     if (message == WM_CREATE) return OnCreate(hwnd, reinterpret_cast<CREATESTRUCTW*>(lParam));
     HeaderRecord* header = FindHeaderRecord(hwnd);
     if (!header) return AnswerWithoutRecord(hwnd, message, wParam, lParam);
+    const RecordUse use(header);
 
     const auto index = static_cast<int>(wParam);
     const auto* item = reinterpret_cast<const HeaderItemDesc*>(lParam);
@@ -78,6 +80,10 @@ LRESULT CALLBACK HeaderProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lPara
     case WM_LBUTTONDOWN: return OnHeaderButtonDown(*header, AlongStrip(*header, lParam));
     case WM_MOUSEMOVE: return OnHeaderPointerMove(*header, AlongStrip(*header, lParam));
     case WM_LBUTTONUP: return OnHeaderButtonUp(*header);
+    case WM_CAPTURECHANGED:
+        if (reinterpret_cast<HWND>(lParam) != hwnd) LoseHeaderDrag(*header);
+        break;
+    case WM_CANCELMODE: LoseHeaderDrag(*header); break;
     case HCM_INSERTITEM: return InsertItem(*header, index, item);
     case HCM_DELETEITEM: return DeleteItem(*header, index);
     case HCM_SETITEM: return SetItem(*header, index, item);
@@ -85,8 +91,9 @@ LRESULT CALLBACK HeaderProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lPara
     case HCM_GETITEMCOUNT: return static_cast<LRESULT>(header->count);
     case HCM_GETITEM: return GetItem(*header, index, reinterpret_cast<HeaderItemDesc*>(lParam));
     case HCM_GETITEMSIZE: return GetItemSize(*header, index);
-    default: return DefWindowProcW(hwnd, message, wParam, lParam);
+    default: break;
     }
+    return DefWindowProcW(hwnd, message, wParam, lParam);
 }
 
 }  // namespace
@@ -100,5 +107,7 @@ bool RegisterHeaderClass(HINSTANCE instance) {
     windowClass.lpszClassName = className;
     return RegisterClassW(&windowClass) != 0;
 }
+
+void WhenHeaderResizeIsLost(void (*handler)(HWND strip)) { headerDrag.resizeLost = handler; }
 
 }  // namespace kor

@@ -12,7 +12,4 @@ HANDLE BlockForClipboard(void* localBlock, uint32_t size);
 // Frees a block that the clipboard did not take.
 void FreeClipboardBlock(HANDLE block);
 
-// Lets drawing into a DIB section come to its end, so that its bits may be read.
-void FinishDrawing();
-
 }  // namespace kor

@@ -26,4 +26,8 @@ COLORREF SystemColour(int flaggedIndex);
 // The stock brush of a flagged index. It is never deleted.
 HBRUSH SystemStockBrush(int flaggedIndex);
 
+// Lets drawing into a DIB section come to its end, so that its bits may be read. On Windows CE
+// drawing is done when a call returns.
+void FinishDrawing();
+
 }  // namespace kor

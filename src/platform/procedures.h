@@ -5,6 +5,11 @@
 
 namespace kor {
 
+// Loads a module that the library looks up functions in; null when it is not there. On Windows CE
+// it is one of the system's. On a desktop it lies beside the program or beside the library; nowhere
+// else is looked, as a search would run a file of that name in the current folder.
+HMODULE LoadPrintModule(const wchar_t* name);
+
 // The exported function of a plain Latin name, or null when the module lacks it. The desktop looks
 // names up in narrow characters, Windows CE in wide ones.
 FARPROC FindProcedure(HMODULE module, const wchar_t* name);

@@ -1,7 +1,9 @@
 #include "text/number_run.h"
 
-#include "platform/gdi_scopes.h"
+#include <algorithm>
+
 #include "platform/runtime.h"
+#include "text/scratch_bitmap.h"
 #include "text/text_run.h"
 
 namespace kor {
@@ -41,50 +43,42 @@ Advances AdvancesOf(const NumberWidths& widths, const wchar_t* text) {
     return found;
 }
 
-// The pixels of one text, drawn twice on a bitmap, the second time below the first.
+// One text, drawn black on white twice, the second time below the first and told how wide its
+// characters are.
 class TwoRows {
 public:
-    explicit TwoRows(SIZE row) : row_(row), dc_(CreateCompatibleDC(nullptr)), bitmap_(nullptr) {
-        BITMAPINFO info = {};
-        info.bmiHeader.biSize = sizeof info.bmiHeader;
-        info.bmiHeader.biWidth = row.cx;
-        info.bmiHeader.biHeight = -2 * row.cy;
-        info.bmiHeader.biPlanes = 1;
-        info.bmiHeader.biBitCount = 32;
-        if (dc_) bitmap_ = CreateDIBSection(dc_, &info, DIB_RGB_COLORS, &pixels_, nullptr, 0);
+    TwoRows(SIZE row, HFONT font, const wchar_t* text, int length, const INT* advances)
+        : row_(row), bitmap_({row.cx, 2 * row.cy}) {
+        if (!bitmap_.IsMade()) return;
+        SelectScope selected(bitmap_.dc(), font);
+        DrawRow(0, text, length, nullptr);
+        DrawRow(row.cy, text, length, advances);
     }
-    ~TwoRows() {
-        if (bitmap_) DeleteObject(bitmap_);
-        if (dc_) DeleteDC(dc_);
-    }
-    TwoRows(const TwoRows&) = delete;
-    TwoRows& operator=(const TwoRows&) = delete;
 
-    // Whether a text looks the same when it is told how wide its characters are.
-    bool AreEqual(HFONT font, const wchar_t* text, int length, const INT* advances) {
-        if (!bitmap_) return false;
-        {
-            SelectScope image(dc_, bitmap_);
-            SelectScope selected(dc_, font);
-            PatBlt(dc_, 0, 0, row_.cx, 2 * row_.cy, WHITENESS);
-            DrawRow(0, text, length, nullptr);
-            DrawRow(row_.cy, text, length, advances);
-        }
-        const auto rowBytes = static_cast<size_t>(row_.cx * row_.cy) * sizeof(uint32_t);
-        const auto* first = static_cast<const unsigned char*>(pixels_);
-        return memcmp(first, first + rowBytes, rowBytes) == 0;
+    bool IsMade() const { return bitmap_.IsMade(); }
+
+    bool AreEqual() const {
+        const uint32_t* first = bitmap_.Pixels();
+        const size_t rowPixels = bitmap_.PixelCount() / 2;
+        return memcmp(first, first + rowPixels, rowPixels * sizeof(uint32_t)) == 0;
+    }
+
+    bool AreBlackAndWhite() const {
+        const uint32_t* pixels = bitmap_.Pixels();
+        return std::all_of(pixels, pixels + bitmap_.PixelCount(), [](uint32_t pixel) {
+            return ColourOfPixel(pixel) == 0 || ColourOfPixel(pixel) == kWhitePixel;
+        });
     }
 
 private:
     void DrawRow(int top, const wchar_t* text, int length, const INT* advances) {
         const RECT row = {0, top, row_.cx, top + row_.cy};
-        ExtTextOutW(dc_, 0, top, ETO_CLIPPED, &row, text, static_cast<UINT>(length), advances);
+        ExtTextOutW(bitmap_.dc(), 0, top, ETO_CLIPPED, &row, text, static_cast<UINT>(length),
+                    advances);
     }
 
     SIZE row_;
-    HDC dc_;
-    HBITMAP bitmap_;
-    void* pixels_ = nullptr;
+    ScratchBitmap bitmap_;
 };
 
 }  // namespace
@@ -101,9 +95,11 @@ NumberWidths MeasureNumberCharacters(HDC dc, HFONT font) {
     for (int i = 0; i < kNumberCharacterCount; ++i) {
         found.widths[i] = i == 0 ? ends[0] : ends[i] - ends[i - 1];
     }
-    found.known =
-        GetDeviceCaps(dc, TECHNOLOGY) == DT_RASDISPLAY &&
-        TwoRows(size).AreEqual(font, kNumberCharacters, kNumberCharacterCount, found.widths);
+    if (GetDeviceCaps(dc, TECHNOLOGY) != DT_RASDISPLAY) return found;
+    const TwoRows rows(size, font, kNumberCharacters, kNumberCharacterCount, found.widths);
+    if (!rows.IsMade()) return found;
+    found.known = rows.AreEqual();
+    found.stencil = rows.AreBlackAndWhite();
     return found;
 }
 

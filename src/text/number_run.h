@@ -18,7 +18,8 @@ constexpr int kNumberCharacterCount = static_cast<int>(std::size(kNumberCharacte
 // Widths of those characters in one font on one device, in pixels. As plain zeros it knows none,
 // and numbers are drawn as any other text.
 struct NumberWidths {
-    int32_t known;  // 0 or 1
+    int32_t known;    // 0 or 1
+    int32_t stencil;  // 1: a pixel of a text has the text's colour or is left alone
     INT widths[kNumberCharacterCount];
 };
 

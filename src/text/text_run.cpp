@@ -1,5 +1,7 @@
 #include "text/text_run.h"
 
+#include "text/huge_text.h"
+
 namespace kor {
 
 namespace {
@@ -61,6 +63,10 @@ void TextRun::DrawPlain(const RECT& area, UINT format) noexcept {
         left = (area.left + area.right - Width()) / 2;
     } else if (format & DT_RIGHT) {
         left = area.right - Width();
+    }
+    if (surface_ && !MayShowInk(dc_, text_, plainLength_, {left, area.top}, *surface_)) {
+        DrawTextBackground(dc_, {left, area.top}, Width(), area);
+        return;
     }
     ExtTextOutW(dc_, left, area.top, ETO_CLIPPED, &area, text_, static_cast<UINT>(plainLength_),
                 nullptr);

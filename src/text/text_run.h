@@ -20,6 +20,10 @@ public:
     // As DrawTextW draws with these flags, clipped to the area.
     void Draw(const RECT& area, UINT format) noexcept;
 
+    // All that is to be seen: a huge text is drawn only where it may reach into this rectangle. It
+    // outlives the run.
+    void LimitTo(const RECT& surface) noexcept { surface_ = &surface; }
+
 private:
     void DrawPlain(const RECT& area, UINT format) noexcept;
 
@@ -27,6 +31,7 @@ private:
     const wchar_t* text_;
     int plainLength_;  // characters; negative when only DrawTextW will do
     int width_ = -1;   // not yet measured
+    const RECT* surface_ = nullptr;
 };
 
 }  // namespace kor

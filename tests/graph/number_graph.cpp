@@ -18,7 +18,7 @@ NumberGraph::NumberGraph() : graph(*kor::CreateGraphRecord()) {
     showY(0, 10);
 }
 
-NumberGraph::~NumberGraph() { kor::DestroyGraphRecord(&graph); }
+NumberGraph::~NumberGraph() { kor::FreeRecord(&graph); }
 
 kor::GraphSeries& NumberGraph::add(const std::vector<double>& values, const wchar_t* name) {
     graph.xAutoRange = 0;

@@ -80,7 +80,9 @@ void PrintingTest::standInForThePrinter() {
 }
 
 ULONG_PTR PrintingTest::load(ULONG_PTR* arguments) {
-    const std::string name = Narrow(reinterpret_cast<const wchar_t*>(arguments[0]));
+    // On a desktop with the folder in which it is looked for; see printing_search.cpp.
+    const std::string path = Narrow(reinterpret_cast<const wchar_t*>(arguments[0]));
+    const std::string name = path.substr(path.find_last_of('\\') + 1);
     transcript.push_back("load " + name);
     if (missingModules.count(name)) return 0;
     if (name == "commdlg.dll") return kDialogModule;

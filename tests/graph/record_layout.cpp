@@ -95,7 +95,7 @@ TEST(GraphRecordLayout, IsTheOneOf32Bits) {
 }
 
 struct RecordDeleter {
-    void operator()(GraphRecord* graph) const { kor::DestroyGraphRecord(graph); }
+    void operator()(GraphRecord* graph) const { kor::FreeRecord(graph); }
 };
 
 class GraphRecordAtFirst : public ::testing::Test {

@@ -6,6 +6,7 @@ set(grid_use_sources
   equation_lifetime.cpp
   equation_reentry.cpp
   equation_typing.cpp
+  grid_destroyed_inside.cpp
   keyboard_extend.cpp
   keyboard_moves.cpp
   keyboard_others.cpp
@@ -13,6 +14,7 @@ set(grid_use_sources
   keyboard_random.cpp
   mouse_auto_scroll.cpp
   mouse_drag.cpp
+  mouse_lost_capture.cpp
   mouse_press.cpp
   mouse_random.cpp
   scrolling_bars.cpp

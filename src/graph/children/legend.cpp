@@ -31,7 +31,10 @@ struct LegendRecord {
     const GraphRecord* graph;  // not owned; null before attachment and after the chart has gone
     int32_t firstEntry;
     int32_t entryCount;  // at the last paint
+    RecordLife life;
 };
+
+void FreeRecord(LegendRecord* legend) { DeleteRecord(legend); }
 
 int LineHeight(HDC dc) {
     RECT measured = {};
@@ -45,15 +48,15 @@ void DrawSwatch(HDC dc, int top, COLORREF colour) {
     Rectangle(dc, kSwatchLeft, top, kSwatchLeft + kSwatchSide, top + kSwatchSide);
 }
 
-// Entries without a name take no line.
-void DrawEntries(const LegendRecord& legend, HDC dc, int clientWidth, int lineHeight) {
+// Entries without a name take no line. Those below the client area are not to be seen.
+void DrawEntries(const LegendRecord& legend, HDC dc, SIZE client, int lineHeight) {
     int top = kTextTop;
-    for (int i = legend.firstEntry; i < legend.entryCount; ++i) {
+    for (int i = legend.firstEntry; i < legend.entryCount && top < client.cy; ++i) {
         wchar_t number[kDecimalCapacity];
         const wchar_t* name = EntryName(*legend.graph, i, number);
         if (!name) continue;
         DrawSwatch(dc, top, EntryColour(*legend.graph, i));
-        RECT text = {kTextLeft, top, clientWidth - kTextRightGap, top + lineHeight};
+        RECT text = {kTextLeft, top, client.cx - kTextRightGap, top + lineHeight};
         DrawTextW(dc, name, -1, &text, 0);
         top = text.bottom + kLineGap;
     }
@@ -71,7 +74,7 @@ bool TakeEntryCount(LegendRecord& legend) {
 // A pie's range is one longer than that of the other types, and so is the refresh a stronger one.
 void SetUpScrollBar(const LegendRecord& legend, int clientHeight, int pitch) {
     const bool pie = IsPieChart(*legend.graph);
-    if (pitch * legend.entryCount > clientHeight) {
+    if (static_cast<int64_t>(pitch) * legend.entryCount > clientHeight) {
         SCROLLINFO info = {};
         info.cbSize = sizeof info;
         info.fMask = SIF_RANGE | SIF_PAGE | SIF_POS | SIF_DISABLENOSCROLL;
@@ -102,11 +105,12 @@ LRESULT OnPaint(LegendRecord& legend, WPARAM wParam, LPARAM lParam) {
         if (legend.graph) {
             lineHeight = LineHeight(paint.dc());
             changed = TakeEntryCount(legend);
-            DrawEntries(legend, paint.dc(), ClientRectOf(legend.window).right, lineHeight);
+            const RECT client = ClientRectOf(legend.window);
+            DrawEntries(legend, paint.dc(), {client.right, client.bottom}, lineHeight);
         }
     }
     const LRESULT result = DefWindowProcW(legend.window, WM_PAINT, wParam, lParam);
-    if (changed) {
+    if (changed && legend.graph) {  // the chart may have gone meanwhile
         SetUpScrollBar(legend, ClientRectOf(legend.window).bottom, lineHeight + kLineGap);
     }
     return result;
@@ -136,6 +140,7 @@ LRESULT OnScroll(LegendRecord& legend, int request) {
 LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
     auto* legend = NewRecord<LegendRecord>();
     if (!legend) return 1;
+    const RecordUse use(legend);
     legend->entryCount = kNeverPainted;
     SetUserData(hwnd, legend);
     if (!creation || !creation->hInstance || !creation->hwndParent) return 1;
@@ -145,9 +150,10 @@ LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
     return 0;
 }
 
-void OnDestroy(HWND hwnd, LegendRecord* legend) {
+void OnDestroy(HWND hwnd, LegendRecord& legend) {
     SetUserData(hwnd, nullptr);
-    DeleteRecord(legend);
+    legend.graph = nullptr;
+    RetireRecord(legend);
 }
 
 LRESULT CALLBACK LegendProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
@@ -156,8 +162,9 @@ LRESULT CALLBACK LegendProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lPara
         return OnCreate(hwnd, reinterpret_cast<CREATESTRUCTW*>(lParam));
     }
     if (!legend) return DefWindowProcW(hwnd, message, wParam, lParam);
+    const RecordUse use(legend);
     switch (message) {
-    case WM_DESTROY: OnDestroy(hwnd, legend); break;
+    case WM_DESTROY: OnDestroy(hwnd, *legend); break;
     case WM_PAINT:
         if (legend->window) return OnPaint(*legend, wParam, lParam);
         break;

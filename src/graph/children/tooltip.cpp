@@ -22,7 +22,13 @@ struct ToolTipRecord {
     wchar_t* text;  // local heap
     uint32_t capacity;
     RECT frame;  // client coordinates
+    RecordLife life;
 };
+
+void FreeRecord(ToolTipRecord* tip) {
+    FreeLocal(tip->text);
+    DeleteRecord(tip);
+}
 
 // A text of the full capacity is kept whole, a longer one loses one character more than it must.
 void TakeText(ToolTipRecord& tip, const wchar_t* text) {
@@ -83,6 +89,7 @@ void OnPaint(const ToolTipRecord& tip, HDC given) {
 LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
     auto* tip = NewRecord<ToolTipRecord>();
     if (!tip) return 1;
+    const RecordUse use(tip);
     SetUserData(hwnd, tip);
     if (!creation || !creation->hInstance || !creation->hwndParent) return 1;
     tip->instance = creation->hInstance;
@@ -93,10 +100,9 @@ LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
     return 0;
 }
 
-void OnDestroy(HWND hwnd, ToolTipRecord* tip) {
+void OnDestroy(HWND hwnd, ToolTipRecord& tip) {
     SetUserData(hwnd, nullptr);
-    FreeLocal(tip->text);
-    DeleteRecord(tip);
+    RetireRecord(tip);
 }
 
 LRESULT CALLBACK ToolTipProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
@@ -105,6 +111,7 @@ LRESULT CALLBACK ToolTipProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lPar
         return OnCreate(hwnd, reinterpret_cast<CREATESTRUCTW*>(lParam));
     }
     if (!tip) return DefWindowProcW(hwnd, message, wParam, lParam);
+    const RecordUse use(tip);
     switch (message) {
     case TIPM_SHOW: return OnShow(*tip, reinterpret_cast<const ToolTipRequest*>(lParam));
     case TIPM_HIDE:
@@ -112,7 +119,7 @@ LRESULT CALLBACK ToolTipProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lPar
     case WM_PAINT:
         if (tip->text) OnPaint(*tip, reinterpret_cast<HDC>(wParam));
         break;
-    case WM_DESTROY: OnDestroy(hwnd, tip); break;
+    case WM_DESTROY: OnDestroy(hwnd, *tip); break;
     default: break;
     }
     return DefWindowProcW(hwnd, message, wParam, lParam);

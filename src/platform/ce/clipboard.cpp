@@ -1,5 +1,4 @@
-// The clipboard of Windows CE takes blocks of the local heap, and drawing is done when a call
-// returns.
+// The clipboard of Windows CE takes blocks of the local heap.
 #include "platform/clipboard.h"
 
 namespace kor {
@@ -7,7 +6,5 @@ namespace kor {
 HANDLE BlockForClipboard(void* localBlock, uint32_t) { return localBlock; }
 
 void FreeClipboardBlock(HANDLE block) { LocalFree(block); }
-
-void FinishDrawing() {}
 
 }  // namespace kor

@@ -9,6 +9,8 @@ extern "C" FARPROC GetProcAddressW(HMODULE module, const wchar_t* name);
 
 }  // namespace
 
+HMODULE LoadPrintModule(const wchar_t* name) { return LoadLibraryW(name); }
+
 FARPROC FindProcedure(HMODULE module, const wchar_t* name) { return GetProcAddressW(module, name); }
 
 }  // namespace kor

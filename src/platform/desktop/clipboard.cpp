@@ -31,6 +31,4 @@ HANDLE BlockForClipboard(void* localBlock, uint32_t size) {
 
 void FreeClipboardBlock(HANDLE block) { GlobalFree(block); }
 
-void FinishDrawing() { GdiFlush(); }
-
 }  // namespace kor

@@ -1,4 +1,5 @@
-// System colours on the desktop, whose calls do not know the flag.
+// System colours on the desktop, whose calls do not know the flag; drawing is collected and may be
+// put off.
 #include "platform/platform.h"
 
 namespace kor {
@@ -8,5 +9,7 @@ COLORREF SystemColour(int flaggedIndex) { return GetSysColor(flaggedIndex & ~kSy
 HBRUSH SystemStockBrush(int flaggedIndex) {
     return GetSysColorBrush(flaggedIndex & ~kSystemColourFlag);
 }
+
+void FinishDrawing() { GdiFlush(); }
 
 }  // namespace kor

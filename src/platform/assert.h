@@ -1,0 +1,10 @@
+// What the code relies on, checked where that is asked for.
+#pragma once
+
+// KOR_ASSERT(condition) ends the process at the line whose condition does not hold. It is compiled
+// only with KORCONTROLS_ASSERTIONS; elsewhere the condition is not evaluated.
+#ifdef KORCONTROLS_ASSERTIONS
+#define KOR_ASSERT(condition) ((condition) ? static_cast<void>(0) : __builtin_trap())
+#else
+#define KOR_ASSERT(condition) static_cast<void>(sizeof((condition) ? 1 : 0))
+#endif

@@ -1,0 +1,57 @@
+// A bitmap on which a text is tried out, and whose pixels can be read.
+#pragma once
+
+#include <cstdint>
+
+#include "platform/gdi_scopes.h"
+
+namespace kor {
+
+// 32 bits to a pixel, the first row at the top. White once it is made.
+class ScratchBitmap {
+public:
+    explicit ScratchBitmap(SIZE size) noexcept : size_(size), dc_(nullptr) {
+        BITMAPINFO info = {};
+        info.bmiHeader.biSize = sizeof info.bmiHeader;
+        info.bmiHeader.biWidth = size.cx;
+        info.bmiHeader.biHeight = -size.cy;
+        info.bmiHeader.biPlanes = 1;
+        info.bmiHeader.biBitCount = 32;
+        if (!dc_.get()) return;
+        bitmap_ = CreateDIBSection(dc_.get(), &info, DIB_RGB_COLORS, &bits_, nullptr, 0);
+        if (bitmap_) blank_ = SelectObject(dc_.get(), bitmap_);
+        isWhite_ = blank_ && PatBlt(dc_.get(), 0, 0, size.cx, size.cy, WHITENESS);
+    }
+    ~ScratchBitmap() {
+        if (blank_) SelectObject(dc_.get(), blank_);
+        if (bitmap_) DeleteObject(bitmap_);
+    }
+    ScratchBitmap(const ScratchBitmap&) = delete;
+    ScratchBitmap& operator=(const ScratchBitmap&) = delete;
+
+    bool IsMade() const noexcept { return isWhite_; }
+    HDC dc() const noexcept { return dc_.get(); }
+
+    // What has been drawn so far; of a bitmap that is made.
+    const uint32_t* Pixels() const noexcept {
+        FinishDrawing();
+        return static_cast<const uint32_t*>(bits_);
+    }
+    size_t PixelCount() const noexcept {
+        return static_cast<size_t>(size_.cx) * static_cast<size_t>(size_.cy);
+    }
+
+private:
+    SIZE size_;
+    MemoryDC dc_;
+    HBITMAP bitmap_ = nullptr;
+    HGDIOBJ blank_ = nullptr;
+    void* bits_ = nullptr;
+    bool isWhite_ = false;
+};
+
+// The colour of a pixel, without what lies above it.
+constexpr uint32_t ColourOfPixel(uint32_t pixel) { return pixel & 0xFFFFFF; }
+constexpr uint32_t kWhitePixel = 0xFFFFFF;
+
+}  // namespace kor
