@@ -109,7 +109,8 @@ void CompareChart(HWND window) {
 void CompareCharts(Stage& stage) {
     for (int place = 0; place < kPlaces; ++place) {
         HWND window = stage.window(kChart, place);
-        if (window && stage.isLive(window) && !stage.isWithoutRecord(window)) CompareChart(window);
+        if (!window || !stage.isLive(window) || stage.isWithoutRecord(window)) continue;
+        stage.runAlone([&] { CompareChart(window); });
     }
 }
 

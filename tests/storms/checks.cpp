@@ -56,26 +56,19 @@ void CheckVisibleRange(const GridVisibleRange& range) {
     }
 }
 
-// A press can reach one column or row behind the sheet, or any that a host has scrolled to.
-void CheckSelection(Stage& stage, const GridVisibleRange& range) {
+// A press can reach one column or row behind the sheet; other ways out are known to the stage.
+void CheckSelection(Stage& stage) {
     GridSelection selection = {1, 0, 1, 0};
     GetSelectedRanged(&selection);
     const bool isInSheet = IsOrdered(selection) && selection.right < KORGRID_COLUMNS &&
                            selection.bottom < KORGRID_ROWS;
     if (isInSheet) stage.selectionIsAnything = false;
-    if (stage.selectionIsAnything) return;
-    const int furthest[] = {std::max(KORGRID_COLUMNS, range.endColumn + 1),
-                            std::max(KORGRID_ROWS, range.endRow + 1)};
-    static int columnBound = KORGRID_COLUMNS;
-    static int rowBound = KORGRID_ROWS;
-    columnBound = std::max(columnBound, furthest[0]);
-    rowBound = std::max(rowBound, furthest[1]);
-    if (!IsOrdered(selection) || selection.right > columnBound || selection.bottom > rowBound) {
+    const bool isNearSheet = IsOrdered(selection) && selection.right <= KORGRID_COLUMNS &&
+                             selection.bottom <= KORGRID_ROWS;
+    if (!isNearSheet && !stage.selectionIsAnything) {
         FailStorm("grid: selection %u-%u, %u-%u", selection.left, selection.right, selection.top,
                   selection.bottom);
     }
-    if (selection.right < KORGRID_COLUMNS) columnBound = furthest[0];
-    if (selection.bottom < KORGRID_ROWS) rowBound = furthest[1];
     GridCellPair current = {0xFFFF, 0xFFFF};
     if (GetCurrentSelectedCell(&current) &&
         (current.column != selection.left || current.row != selection.top)) {
@@ -83,25 +76,29 @@ void CheckSelection(Stage& stage, const GridVisibleRange& range) {
     }
 }
 
-void CheckGridStrip(HWND grid, int id, DWORD visible, const char* what) {
+bool IsInStep(HWND grid, int id, DWORD visible) {
     HWND strip = GetDlgItem(grid, id);
-    if (!strip) return;
-    const int count = KorHeader_GetItemCount(strip);
-    if (count >= 0 && static_cast<DWORD>(count) != visible) {
-        FailStorm("grid: %d %s in the strip, %lu visible", count, what, visible);
-    }
+    const int count = strip ? KorHeader_GetItemCount(strip) : -1;
     if (count >= 0) CheckStrip(strip);
+    return count < 0 || static_cast<DWORD>(count) == visible;
+}
+
+// A new grid tells what the one before showed, until it has been laid out.
+void CheckGridStrips(Stage& stage, HWND grid) {
+    const bool areColumns = IsInStep(grid, 2, GetNumberOfVisibleColumns());
+    const bool areRows = IsInStep(grid, 3, GetNumberOfVisibleRows());
+    if (stage.stripsInStep && !areColumns) FailStorm("grid: the column strip is out of step");
+    if (stage.stripsInStep && !areRows) FailStorm("grid: the row strip is out of step");
+    stage.stripsInStep = areColumns && areRows;
 }
 
 void CheckGrid(Stage& stage) {
     GridVisibleRange range = {};
     GetVisibleRange(&range);
     CheckVisibleRange(range);
-    CheckSelection(stage, range);
+    CheckSelection(stage);
     HWND grid = stage.currentGrid();
-    if (!grid || !stage.isLive(grid)) return;
-    CheckGridStrip(grid, 2, GetNumberOfVisibleColumns(), "columns");
-    CheckGridStrip(grid, 3, GetNumberOfVisibleRows(), "rows");
+    if (grid && stage.isLive(grid)) CheckGridStrips(stage, grid);
 }
 
 // ---- Charts ----------------------------------------------------------------------------------------

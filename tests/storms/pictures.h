@@ -10,4 +10,7 @@ void CompareCharts(Stage& stage);
 
 int ChartsCompared();
 
+// Grids and strips.
+int OtherPicturesCompared();
+
 }  // namespace kortest

@@ -172,27 +172,44 @@ LRESULT Stage::onControl(Kind kind, HWND window, UINT message, WPARAM wParam, LP
         ++gridsCreated;
         if (currentGrid_ && isLive(currentGrid_)) hadTwoGrids = true;
         currentGrid_ = window;
+        stripsInStep = false;
     }
     if (kind == kGrid) noteSelecting(window, message, wParam, lParam);
     // The system's own views are not to be destroyed inside their messages.
     const bool isSystems = kind == kList || kind == kTree;
-    if (!isSystems) spring(Event::kBefore, message, 0);
+    if (!isSystems && spring(Event::kBefore, message, 0)) noteDisturbed(kind, message);
     // A control cannot be created in a window that is gone.
     if (message == WM_CREATE && !isLive(window)) return -1;
     const LRESULT result = CallWindowProcW(original_[kind], window, message, wParam, lParam);
+    if (kind == kGrid) noteSelecting(window, message, wParam, lParam);  // what came inside is over
     if (message == WM_CREATE && kind == kGrid && lParam) wrapChildren(window);
-    if (!isSystems) spring(Event::kAfter, message, 0);
+    if (!isSystems && spring(Event::kAfter, message, 0)) noteDisturbed(kind, message);
     if (message == WM_NCDESTROY) live_.erase(window);
     return result;
 }
 
-// Two ways lead to a selection outside the sheet, or with its ends turned round, as the headers say:
-// a header click on items that the strip has not, and keys that extend a block whose anchor lies
-// elsewhere, since each arrow has rules of its own.
+// Who changes the grid while it fills a strip, item by item, gets the strip that was begun before.
+void Stage::noteDisturbed(Kind kind, UINT message) {
+    if (kind == kStrip && message >= HCM_INSERTITEM && message <= HCM_GETITEMSIZE) {
+        stripsInStep = false;
+    }
+}
+
+// What leads to a selection outside the sheet, or with its ends turned round, as the headers say: a
+// header click on items that the strip has not; keys that extend a block whose anchor lies
+// elsewhere, since each arrow has rules of its own; the pointer over a view beyond the sheet.
 void Stage::noteSelecting(HWND grid, UINT message, WPARAM wParam, LPARAM lParam) {
-    if (message == WM_LBUTTONDOWN) isAnchored_ = true;
+    const bool isPress = message == WM_LBUTTONDOWN;
+    if (isPress) isAnchored_ = true;
     if (message == WM_LBUTTONUP && !(wParam & MK_SHIFT)) isAnchored_ = false;
     if (message == WM_KEYDOWN && isAnchored_) selectionIsAnything = true;
+    if (isPress || message == WM_MOUSEMOVE || message == HCN_ITEMCLICK) {
+        GridVisibleRange range = {};
+        GetVisibleRange(&range);
+        if (range.firstColumn >= KORGRID_COLUMNS || range.firstRow >= KORGRID_ROWS) {
+            selectionIsAnything = true;
+        }
+    }
     if (message != HCN_ITEMCLICK) return;
     const bool isRow = reinterpret_cast<HWND>(wParam) == GetDlgItem(grid, 3);
     const DWORD count = isRow ? GetNumberOfVisibleRows() : GetNumberOfVisibleColumns();
@@ -234,18 +251,19 @@ void Stage::setTrap(const Operation& operation) {
         {EventOf(operation.arguments[0]), operation.arguments[1] & 3, operation.inside});
 }
 
-void Stage::spring(Event::Place place, UINT message, UINT code) {
-    if (traps_.empty() || depth_ == 0 || depth_ > kMostDepth || innerLeft_ <= 0) return;
+bool Stage::spring(Event::Place place, UINT message, UINT code) {
+    if (traps_.empty() || depth_ == 0 || depth_ > kMostDepth || innerLeft_ <= 0) return false;
     const auto sprung = std::find_if(traps_.begin(), traps_.end(), [&](const Trap& trap) {
         return trap.event.place == place && trap.event.message == message &&
                (!trap.event.code || trap.event.code == code);
     });
-    if (sprung == traps_.end() || sprung->countdown-- > 0) return;
+    if (sprung == traps_.end() || sprung->countdown-- > 0) return false;
     const Sequence inside = std::move(sprung->inside);
     traps_.erase(sprung);
     for (const Operation& operation : inside) {
         if (innerLeft_-- > 0) run(operation);
     }
+    return true;
 }
 
 void Stage::run(const Operation& operation) {

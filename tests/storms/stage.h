@@ -45,6 +45,7 @@ public:
 
     // The grid whose messages the process-wide state follows: the one created last.
     HWND currentGrid() const { return currentGrid_; }
+    bool stripsInStep = false;  // the current grid has been laid out, and nothing came in between
     bool hadTwoGrids = false;  // at the same time: the first one's objects are lost then
     int gridsCreated = 0;
     int textsLeft = 0;  // texts of single items that were deleted from a function bar
@@ -58,6 +59,15 @@ public:
     // ---- Running -------------------------------------------------------------------------------
     void run(const Operation& operation);
     void setTrap(const Operation& operation);
+
+    // Does something with all traps out of the way.
+    template <typename Action>
+    void runAlone(Action action) {
+        const int before = innerLeft_;
+        innerLeft_ = 0;
+        action();
+        innerLeft_ = before;
+    }
 
     // Takes posted messages out of the queue, but no timers, paints or mouse messages: nothing that
     // depends on the clock or the pointer.
@@ -89,7 +99,8 @@ private:
     LRESULT onControl(Kind kind, HWND window, UINT message, WPARAM wParam, LPARAM lParam);
     LRESULT onHost(HWND window, UINT message, WPARAM wParam, LPARAM lParam);
     void noteSelecting(HWND grid, UINT message, WPARAM wParam, LPARAM lParam);
-    void spring(Event::Place place, UINT message, UINT code);
+    void noteDisturbed(Kind kind, UINT message);
+    bool spring(Event::Place place, UINT message, UINT code);
     HWND host(int number);
 
     HWND hosts_[2]{};

@@ -3,6 +3,7 @@
 #include "storms/checks.h"
 #include "storms/failure.h"
 #include "storms/library.h"
+#include "storms/pictures.h"
 #include "storms/stage.h"
 #include "storms/stand_ins.h"
 #include "storms/words.h"
@@ -99,9 +100,10 @@ bool RunStorm(const StormPlan& plan) {
     RunSteps(stage, sequence, warm, sequence.size());
     stage.clear();
     CompareBalance(stage, before);
-    std::printf("%s: seed %llu, %s heap, %u steps\n", plan.control.c_str(),
+    std::printf("%s: seed %llu, %s heap, %u steps, %d pictures compared\n", plan.control.c_str(),
                 static_cast<unsigned long long>(plan.seed), NameOf(plan.heap),
-                static_cast<unsigned>(sequence.size()));
+                static_cast<unsigned>(sequence.size()),
+                ChartsCompared() + OtherPicturesCompared());
     std::fflush(stdout);
     return true;
 }

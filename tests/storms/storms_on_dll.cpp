@@ -13,4 +13,6 @@ void CheckRecords(Stage&) {}
 
 void ComparePictures(Stage& stage) { CompareCharts(stage); }
 
+int OtherPicturesCompared() { return 0; }
+
 }  // namespace kortest
