@@ -126,7 +126,10 @@ void Desk::keyWith(std::vector<int> held, WPARAM pressed) {
 }
 
 void Desk::type(const std::wstring& text) {
-    for (const wchar_t character : text) post(GetFocus(), WM_CHAR, character, 1);
+    if (text.empty()) return;
+    post(GetFocus(), WM_CHAR, text.front(), 1);  // which may lead to the equation bar
+    for (const wchar_t character : text.substr(1)) PostMessageW(GetFocus(), WM_CHAR, character, 1);
+    handleMessages();
 }
 
 void Desk::command(UINT id) { post(workbook_.window, WM_COMMAND, id, 0); }

@@ -2,6 +2,7 @@
 
 #include <psapi.h>
 
+#include <algorithm>
 #include <array>
 
 namespace longrun {
@@ -32,7 +33,8 @@ std::size_t PrivateBytes() {
     PROCESS_MEMORY_COUNTERS_EX counters = {};
     GetProcessMemoryInfo(GetCurrentProcess(), reinterpret_cast<PROCESS_MEMORY_COUNTERS*>(&counters),
                          sizeof counters);
-    return counters.PrivateUsage;
+    // Wine fills in only the older member, which means the same.
+    return std::max(counters.PrivateUsage, counters.PagefileUsage);
 }
 
 // ---- GDI objects ----
