@@ -27,6 +27,15 @@ void AppendUtf8(std::string& bytes, wchar_t character) {
     byte(0x80 | (code & 0x3F));
 }
 
+wchar_t TakeCharacter(const std::string& bytes, std::size_t& at) {
+    const auto next = [&] { return static_cast<unsigned char>(bytes[at++]); };
+    const unsigned first = next();
+    if (first < 0x80) return static_cast<wchar_t>(first);
+    unsigned code = first < 0xE0 ? first & 0x1F : first & 0x0F;
+    for (int more = first < 0xE0 ? 1 : 2; more > 0; --more) code = code << 6 | (next() & 0x3F);
+    return static_cast<wchar_t>(code);
+}
+
 std::string Field(const std::wstring& text) {
     const bool quoted = text.find_first_of(L"\",\r\n") != std::wstring::npos;
     std::string bytes;
@@ -114,13 +123,6 @@ void SheetModel::redo() {
     ++now_;
 }
 
-void SheetModel::forgetSteps() {
-    done_.clear();
-    undone_.clear();
-    now_ = 0;
-    saved_ = 0;
-}
-
 Rows SheetModel::copy(const Area& area) const {
     const int lastRow = std::min(area.last.row, std::max(usedRows() - 1, area.first.row));
     const int lastColumn =
@@ -145,6 +147,28 @@ std::string SheetModel::csv() const {
         bytes += "\r\n";
     }
     return bytes;
+}
+
+SheetModel SheetModel::read(const std::wstring& path, const std::string& csv) {
+    SheetModel sheet;
+    sheet.path = path;
+    Place place = {0, 0};
+    bool isQuoted = false;
+    for (std::size_t at = 0; at < csv.size();) {
+        const wchar_t character = TakeCharacter(csv, at);
+        const bool isDoubled = isQuoted && character == L'"' && at < csv.size() && csv[at] == '"';
+        if (character == L'"' && !isDoubled) {
+            isQuoted = !isQuoted;
+        } else if (isQuoted || (character != L',' && character != L'\r' && character != L'\n')) {
+            sheet.texts_[place] += character;
+            at += isDoubled;
+        } else if (character == L',') {
+            ++place.column;
+        } else if (character == L'\n') {
+            place = {place.row + 1, 0};
+        }
+    }
+    return sheet;
 }
 
 }  // namespace longrun

@@ -42,7 +42,6 @@ public:
     void clear(const Area& area);
     void undo();
     void redo();
-    void forgetSteps();  // as a file that is opened
     bool canUndo() const { return !done_.empty(); }
     bool canRedo() const { return !undone_.empty(); }
 
@@ -54,6 +53,8 @@ public:
 
     // UTF-8, a rectangle of all that is occupied.
     std::string csv() const;
+    // Of such a file.
+    static SheetModel read(const std::wstring& path, const std::string& csv);
 
 private:
     struct Change {

@@ -126,19 +126,25 @@ User::User(Desk& desk, std::uint32_t seed, std::wstring folder)
     : desk_(desk), random_(seed), folder_(std::move(folder)) {}
 
 void User::act() {
+    const Action& action = anyAction();
+    ++counts_[action.name];
+    desk_.focusGrid();
+    (this->*action.run)();
+    check();
+    if (!problem_.empty()) problem_ = std::string(action.name) + ": " + problem_;
+}
+
+// At first each of them once: what is made on first use is there when the first sample is taken.
+const User::Action& User::anyAction() {
+    if (counts_.size() < actions().size()) return actions()[counts_.size()];
     int total = 0;
     for (const Action& each : actions()) total += each.weight;
     int chosen = below(total);
     for (const Action& each : actions()) {
         chosen -= each.weight;
-        if (chosen >= 0) continue;
-        ++counts_[each.name];
-        desk_.focusGrid();
-        (this->*each.run)();
-        check();
-        if (!problem_.empty()) problem_ = std::string(each.name) + ": " + problem_;
-        return;
+        if (chosen < 0) return each;
     }
+    return actions().back();
 }
 
 // ---- What must be ----
@@ -164,21 +170,17 @@ void User::check() {
     if (desk_.hasEnded()) complain("the program has ended");
 }
 
-void User::compareFile() {
-    if (ReadAll(sheet().path) != sheet().csv())
-        complain("the file " + Narrow(sheet().path) + " is not what the sheet must hold");
-}
-
 void User::expectSaved() {
     sheet().markSaved();
-    files_[sheet().path] = sheet();
-    compareFile();
+    files_[sheet().path] = sheet().csv();
+    if (ReadAll(sheet().path) != files_[sheet().path])
+        complain("the file " + Narrow(sheet().path) + " is not what the sheet must hold");
 }
 
 // ---- Chance ----
 
 Place User::anyPlace() {
-    if (oneIn(20)) return {below(400), below(30)};
+    if (oneIn(20)) return {below(200), below(20)};
     return {below(kUsualRows), below(kUsualColumns)};
 }
 
@@ -509,13 +511,12 @@ void User::openFile(const std::wstring& path) {
         sheets_.emplace_back();
         current_ = sheets_.size() - 1;
     }
-    sheet() = files_[path];
-    sheet().forgetSteps();
+    sheet() = SheetModel::read(path, files_[path]);
 }
 
 void User::reopen() {
     if (sheets_.size() == kMostSheets) return;
-    for (const auto& [path, model] : files_) {
+    for (const auto& [path, bytes] : files_) {
         if (!isOpen(path)) return openFile(path);
     }
 }

@@ -37,6 +37,8 @@ private:
     struct Action;
     static const std::vector<Action>& actions();
 
+    const Action& anyAction();
+
     // ---- Chance
     int below(int limit) { return static_cast<int>(random_() % static_cast<unsigned>(limit)); }
     bool oneIn(int times) { return below(times) == 0; }
@@ -101,7 +103,6 @@ private:
     void reopen();
     bool isOpen(const std::wstring& path) const;
     std::wstring freePath();
-    void compareFile();
     void check();
     void complain(const std::string& what);
 
@@ -110,9 +111,9 @@ private:
     std::wstring folder_;
     std::vector<SheetModel> sheets_{1};
     std::size_t current_ = 0;
-    std::optional<Rows> clipboard_;             // nothing: no text
-    std::map<std::wstring, SheetModel> files_;  // as they were saved last
-    std::vector<std::wstring> closed_;          // by tidyUp()
+    std::optional<Rows> clipboard_;              // nothing: no text
+    std::map<std::wstring, std::string> files_;  // as they were saved last
+    std::vector<std::wstring> closed_;           // by tidyUp()
     int pages_ = 0;
     std::string problem_;
     std::map<std::string, int> counts_;
