@@ -194,6 +194,12 @@ std::string GuardHeap::report() const {
     return text.str();
 }
 
+bool GuardHeap::startOver() {
+    if (!state->blocks.startOver()) return false;
+    state->blocksBefore = 0;
+    return true;
+}
+
 int GuardHeap::live() const {
     return static_cast<int>(state->blocks.liveBlocksAfter(state->blocksBefore).size());
 }
