@@ -151,12 +151,19 @@ void FaultLedger::noteDeletion(ULONG_PTR object) {
     }
 }
 
+ULONG_PTR FaultLedger::ownIn(const Context& context) const {
+    if (context.isSpoilt) return 0;
+    for (const Selected& place : context.selected)
+        if (entries_.count({Resource::kObject, place.current})) return place.current;
+    return 0;
+}
+
 void FaultLedger::leaveContext(ULONG_PTR dc, const char* how) {
     const auto found = contexts_.find(dc);
     if (found == contexts_.end()) return;
-    if (!found->second.selected.empty() && !found->second.isSpoilt) {
+    if (const ULONG_PTR object = ownIn(found->second)) {
         misuses_.push_back(std::string(how) + " of DC " + HexText(dc) + " with object " +
-                           HexText(found->second.selected[0].current) + " in it");
+                           HexText(object) + " in it");
     }
     contexts_.erase(found);
 }
@@ -175,9 +182,8 @@ std::vector<std::string> FaultLedger::leftovers() const {
 std::vector<std::string> FaultLedger::selections() const {
     std::vector<std::string> lines = misuses_;
     for (const auto& [dc, context] : contexts_) {
-        if (context.selected.empty() || context.isSpoilt) continue;
-        lines.push_back("left in DC " + HexText(dc) + ": object " +
-                        HexText(context.selected[0].current));
+        if (const ULONG_PTR object = ownIn(context))
+            lines.push_back("left in DC " + HexText(dc) + ": object " + HexText(object));
     }
     return lines;
 }

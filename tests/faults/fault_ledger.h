@@ -62,6 +62,8 @@ private:
     void forgetAll(Resource resource);
     void noteSelection(const WatchedCall& call);
     void noteDeletion(ULONG_PTR object);
+    ULONG_PTR
+    ownIn(const Context& context) const;  // an object of the library's; stock ones may stay
     void leaveContext(ULONG_PTR dc, const char* how);
 
     std::map<Key, Entry> entries_;

@@ -6,6 +6,7 @@
 
 #include <cstdio>
 #include <cstdlib>
+#include <string>
 
 namespace kortest {
 namespace {
@@ -42,22 +43,43 @@ const Scenario kScenarios[] = {
     {"helpers", "Trees", LiveTrees},
 };
 
+// One line for each scenario, in a folder beside the program.
+void WriteNumber(const Scenario& scenario, const char* kind, int points) {
+    std::printf("%s, %s: %d points %s\n", scenario.control, scenario.name, points, kind);
+    char path[MAX_PATH] = {};
+    GetModuleFileNameA(nullptr, path, MAX_PATH);
+    std::string folder = path;
+    folder = folder.substr(0, folder.find_last_of('\\')) + "\\fault_points";
+    CreateDirectoryA(folder.c_str(), nullptr);
+    const std::string file = folder + "\\" + scenario.name + " " + kind + ".txt";
+    if (std::FILE* stream = std::fopen(file.c_str(), "w")) {
+        std::fprintf(stream, "%s, %s: %d points %s\n", scenario.control, scenario.name, points,
+                     kind);
+        std::fclose(stream);
+    }
+}
+
 class FaultPoints : public ::testing::TestWithParam<Scenario> {};
 
 TEST_P(FaultPoints, AreSurvivedOneByOne) {
-    const DWORD begin = GetTickCount();
     FaultRun run(GetParam());
     ASSERT_NO_FATAL_FAILURE(run.prepare());
     const int points = run.failEachOnce();
     EXPECT_GT(points, 0);
-    std::printf("%s, %s: %d points, %lu ms\n", GetParam().control, GetParam().name, points,
-                GetTickCount() - begin);
-    if (std::getenv("KORCONTROLS_FAULT_TRACE"))
-        for (const auto& [name, calls] : run.calls())
-            std::printf("  %s %d\n", name.c_str(), static_cast<int>(calls.size()));
+    WriteNumber(GetParam(), "failing once", points);
 }
 
-INSTANTIATE_TEST_SUITE_P(Once, FaultPoints, ::testing::ValuesIn(kScenarios),
+// From its first call on; all of them where ./soak asks for it.
+TEST_P(FaultPoints, AreSurvivedWhenAllFailFromThereOn) {
+    const bool isSoak = std::getenv("KORCONTROLS_SOAK") != nullptr;
+    FaultRun run(GetParam());
+    ASSERT_NO_FATAL_FAILURE(run.prepare());
+    const int points = run.failEachForEver(isSoak ? 1000000 : 1);
+    EXPECT_GT(points, 0);
+    WriteNumber(GetParam(), "failing for ever", points);
+}
+
+INSTANTIATE_TEST_SUITE_P(Lives, FaultPoints, ::testing::ValuesIn(kScenarios),
                          [](const auto& tested) { return std::string(tested.param.name); });
 
 }  // namespace

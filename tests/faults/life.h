@@ -10,6 +10,7 @@
 #include <functional>
 #include <initializer_list>
 #include <memory>
+#include <ostream>
 #include <string>
 #include <vector>
 
@@ -99,5 +100,8 @@ struct Scenario {
     const char* name;
     void (*live)(Life& life);
 };
+
+// For GoogleTest's messages.
+inline void PrintTo(const Scenario& scenario, std::ostream* stream) { *stream << scenario.name; }
 
 }  // namespace kortest
