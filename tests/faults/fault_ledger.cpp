@@ -39,7 +39,7 @@ void FaultLedger::clear() {
     entries_.clear();
     contexts_.clear();
     misuses_.clear();
-    blockNotResized_ = 0;
+    blocksNotResized_.clear();
 }
 
 void FaultLedger::add(Resource resource, ULONG_PTR handle, const std::string& maker) {
@@ -103,7 +103,7 @@ void FaultLedger::forgetAll(Resource resource) {
 void FaultLedger::take(const ImportFact& fact, const WatchedCall& call) {
     // What could not be resized, and what the clipboard did not take, is kept.
     if (fact.step == Step::kTakesIfItCan && !call.result) {
-        if (fact.takes == Resource::kLocalBlock) blockNotResized_ = call.arguments[0];
+        if (fact.takes == Resource::kLocalBlock) blocksNotResized_.insert(call.arguments[0]);
         return;
     }
     if (call.failed) return;

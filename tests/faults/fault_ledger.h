@@ -5,6 +5,7 @@
 #include "support/import_spy.h"
 
 #include <map>
+#include <set>
 #include <string>
 #include <utility>
 #include <vector>
@@ -38,8 +39,8 @@ public:
     // given back, or is left, with an object of the library's in it.
     std::vector<std::string> selections() const;
 
-    // The block that LocalReAlloc was refused last.
-    ULONG_PTR blockNotResized() const { return blockNotResized_; }
+    // The blocks that LocalReAlloc was refused.
+    const std::set<ULONG_PTR>& blocksNotResized() const { return blocksNotResized_; }
 
 private:
     struct Entry {
@@ -69,7 +70,7 @@ private:
     std::map<Key, Entry> entries_;
     std::map<ULONG_PTR, Context> contexts_;
     std::vector<std::string> misuses_;
-    ULONG_PTR blockNotResized_ = 0;
+    std::set<ULONG_PTR> blocksNotResized_;
     int made_ = 0;
 };
 

@@ -63,6 +63,13 @@ void UseStrip(Life& life, HWND strip, bool isVertical) {
     }
     InvalidateRect(strip, nullptr, TRUE);
     Paint(strip);
+    // The item that was reported last is one for the process: from here on it is this strip's.
+    press(10);
+    move(40);
+    move(10);
+    ReleaseAt(strip, 4, 4);
+    life.host->pump();
+    life.host->clear();
     press(10);
     move(40);
     ReleaseAt(strip, 4, 4);
@@ -70,6 +77,8 @@ void UseStrip(Life& life, HWND strip, bool isVertical) {
     move(36);
     ReleaseAt(strip, 4, 4);
     life.host->pump();
+    for (const std::string& line : life.host->transcript()) life.note(line);
+    life.host->clear();
     NoteItems(life, strip);
     SetWindowPos(strip, nullptr, 0, 0, isVertical ? 30 : 90, isVertical ? 90 : 16, SWP_NOMOVE);
     life.look(strip, isVertical ? "column of items" : "row of items");
