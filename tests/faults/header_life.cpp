@@ -8,7 +8,8 @@ namespace kortest {
 
 namespace {
 
-constexpr int kItems = 12;  // more than a fresh strip has room for
+// The horizontal strip has more than a fresh one has room for.
+constexpr int kItems[] = {12, 3};
 
 const std::initializer_list<const char*> kMemory = {"LocalAlloc", "LocalReAlloc"};
 
@@ -42,7 +43,7 @@ void UseStrip(Life& life, HWND strip, bool isVertical) {
     // Without a record every answer is the failure result.
     const bool hasRecord = KorHeader_GetItemCount(strip) >= 0;
     life.require(hasRecord || life.fault.happened > 0, "a strip without a record");
-    for (int i = 0; i < kItems; ++i) {
+    for (int i = 0; i < kItems[isVertical]; ++i) {
         const auto insert = [&] { return Insert(strip, -1, L"item"); };
         if (hasRecord) {
             life.statedNot("HCM_INSERTITEM", -1, kMemory, insert);
