@@ -107,20 +107,27 @@ HWND Stage::host(int number) {
     if (!place || !isLive(place)) {
         place = CreateWindowExW(0, kHostClass, L"", WS_POPUP | WS_VISIBLE, 0, 0, 240, 180, nullptr,
                                 nullptr, Instance(), nullptr);
-        live_[place] = {kKinds, false};
+        live_[place] = {kKinds, false, false};
     }
     return place;
 }
 
+// Null for a window that has been told of its end: what is created in it then may never be.
 HWND Stage::parent(int number) {
+    HWND window = anyParent(number);
+    const auto found = live_.find(window);
+    return found == live_.end() || found->second.isDying ? nullptr : window;
+}
+
+HWND Stage::anyParent(int number) {
     if (number == 7) return nullptr;
     if (number == 6) return windows_[kGrid][0];
     if (number >= 4) return host(number);
     HWND& place = panes_[number & 3];
     if (!place || !isLive(place)) {
         place = CreateWindowExW(0, kHostClass, L"", WS_CHILD | WS_VISIBLE, 0, 0, 160, 120,
-                                host(number >> 1), nullptr, Instance(), nullptr);
-        if (place) live_[place] = {kKinds, false};
+                                parent(4 + (number >> 1)), nullptr, Instance(), nullptr);
+        if (place) live_[place] = {kKinds, false, false};
     }
     return place;
 }
@@ -162,12 +169,13 @@ LRESULT CALLBACK Stage::controlProc(HWND window, UINT message, WPARAM wParam, LP
 
 LRESULT Stage::onControl(Kind kind, HWND window, UINT message, WPARAM wParam, LPARAM lParam) {
     if (message == WM_NCCREATE) {
-        live_[window] = {kind, false};
+        live_[window] = {kind, false, false};
         if (awaited_ && awaitedKind_ == kind) {
             *awaited_ = window;
             awaited_ = nullptr;
         }
     }
+    if (message == WM_DESTROY) live_[window].isDying = true;
     if (message == WM_CREATE && kind == kGrid && lParam) {
         ++gridsCreated;
         if (currentGrid_ && isLive(currentGrid_)) hadTwoGrids = true;
@@ -235,6 +243,7 @@ LRESULT Stage::onHost(HWND window, UINT message, WPARAM wParam, LPARAM lParam) {
         message == GRIDN_EQUATIONEMPTY) {
         CheckNotification(*this, message, wParam, lParam);
     }
+    if (message == WM_DESTROY) live_[window].isDying = true;
     const bool isOfList = message == WM_NOTIFY && (wParam == 100 + kList || wParam == 100 + kTree);
     if (!isOfList) {
         spring(Event::kHost, message, message == WM_NOTIFY ? static_cast<UINT>(wParam) : 0);

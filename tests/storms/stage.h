@@ -80,6 +80,7 @@ private:
     struct Live {
         Kind kind;
         bool isWithoutRecord;
+        bool isDying;
     };
     struct Trap {
         Event event;
@@ -102,6 +103,7 @@ private:
     void noteDisturbed(Kind kind, UINT message);
     bool spring(Event::Place place, UINT message, UINT code);
     HWND host(int number);
+    HWND anyParent(int number);
 
     HWND hosts_[2]{};
     HWND panes_[4]{};
