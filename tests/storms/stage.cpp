@@ -145,6 +145,8 @@ HWND Stage::create(Kind kind, int place, int parentNumber, int width, int height
 }
 
 HWND Stage::ensure(Kind kind, int place) {
+    // A second grid takes everything over from the first: few are made, see create.
+    if (kind == kGrid && !isLive(windows_[kGrid][place & 3])) place = 0;
     HWND window = windows_[kind][place & 3];
     if (window && isLive(window)) return window;
     return create(kind, place, place & 1, 60 + 30 * (place & 3), 70, UsualStyle(kind));
@@ -208,16 +210,16 @@ void Stage::noteDisturbed(Kind kind, UINT message) {
 // elsewhere, since each arrow has rules of its own; the pointer over a view beyond the sheet.
 void Stage::noteSelecting(HWND grid, UINT message, WPARAM wParam, LPARAM lParam) {
     const bool isPress = message == WM_LBUTTONDOWN;
+    const bool isPointer = isPress || message == WM_MOUSEMOVE;
     if (isPress) isAnchored_ = true;
     if (message == WM_LBUTTONUP && !(wParam & MK_SHIFT)) isAnchored_ = false;
     if (message == WM_KEYDOWN && isAnchored_) selectionIsAnything = true;
-    if (isPress || message == WM_MOUSEMOVE || message == HCN_ITEMCLICK) {
-        GridVisibleRange range = {};
-        GetVisibleRange(&range);
-        if (range.firstColumn >= KORGRID_COLUMNS || range.firstRow >= KORGRID_ROWS) {
-            selectionIsAnything = true;
-        }
-    }
+    GridVisibleRange range = {};
+    GetVisibleRange(&range);
+    const bool isOutside = range.firstColumn >= KORGRID_COLUMNS || range.firstRow >= KORGRID_ROWS;
+    if (isPress && isOutside) isAnchorOutside_ = true;
+    if (isPointer && (isOutside || isAnchorOutside_)) selectionIsAnything = true;
+    if (!isAnchored_) isAnchorOutside_ = false;
     if (message != HCN_ITEMCLICK) return;
     const bool isRow = reinterpret_cast<HWND>(wParam) == GetDlgItem(grid, 3);
     const DWORD count = isRow ? GetNumberOfVisibleRows() : GetNumberOfVisibleColumns();

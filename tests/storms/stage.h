@@ -116,6 +116,7 @@ private:
     HWND currentGrid_ = nullptr;
     std::vector<Trap> traps_;
     bool isAnchored_ = false;  // a press in the grid has not been let go
+    bool isAnchorOutside_ = false;  // pressed while the view lay beyond the sheet
     int depth_ = 0;
     int innerLeft_ = 0;  // operations that traps may still do in this step
 };
