@@ -105,7 +105,7 @@ void CheckGrid(Stage& stage) {
     CheckVisibleRange(range);
     CheckSelection(stage);
     HWND grid = stage.currentGrid();
-    if (grid && stage.isLive(grid)) CheckGridStrips(stage, grid);
+    if (grid && stage.isLive(grid) && !stage.hasMixedGrids) CheckGridStrips(stage, grid);
 }
 
 // ---- Charts ----------------------------------------------------------------------------------------

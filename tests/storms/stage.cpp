@@ -180,6 +180,7 @@ LRESULT Stage::onControl(Kind kind, HWND window, UINT message, WPARAM wParam, LP
     if (message == WM_DESTROY) live_[window].isDying = true;
     if (message == WM_CREATE && kind == kGrid && lParam) {
         ++gridsCreated;
+        hasMixedGrids = gridsInCreation_++ > 0;
         if (currentGrid_ && isLive(currentGrid_)) hadTwoGrids = true;
         currentGrid_ = window;
         stripsInStep = false;
@@ -189,10 +190,16 @@ LRESULT Stage::onControl(Kind kind, HWND window, UINT message, WPARAM wParam, LP
     const bool isSystems = kind == kList || kind == kTree;
     if (!isSystems && spring(Event::kBefore, message, 0)) noteDisturbed(kind, message);
     // A control cannot be created in a window that is gone.
-    if (message == WM_CREATE && !isLive(window)) return -1;
+    if (message == WM_CREATE && !isLive(window)) {
+        if (kind == kGrid && lParam) --gridsInCreation_;
+        return -1;
+    }
     const LRESULT result = CallWindowProcW(original_[kind], window, message, wParam, lParam);
     if (kind == kGrid) noteSelecting(window, message, wParam, lParam);  // what came inside is over
-    if (message == WM_CREATE && kind == kGrid && lParam) wrapChildren(window);
+    if (message == WM_CREATE && kind == kGrid && lParam) {
+        --gridsInCreation_;
+        wrapChildren(window);
+    }
     if (!isSystems && spring(Event::kAfter, message, 0)) noteDisturbed(kind, message);
     if (message == WM_NCDESTROY) live_.erase(window);
     return result;
@@ -210,7 +217,7 @@ void Stage::noteDisturbed(Kind kind, UINT message) {
 // elsewhere, since each arrow has rules of its own; the pointer over a view beyond the sheet.
 void Stage::noteSelecting(HWND grid, UINT message, WPARAM wParam, LPARAM lParam) {
     const bool isPress = message == WM_LBUTTONDOWN;
-    const bool isPointer = isPress || message == WM_MOUSEMOVE;
+    const bool isPointer = isPress || message == WM_MOUSEMOVE || message == HCN_ITEMCLICK;
     if (isPress) isAnchored_ = true;
     if (message == WM_LBUTTONUP && !(wParam & MK_SHIFT)) isAnchored_ = false;
     if (message == WM_KEYDOWN && isAnchored_) selectionIsAnything = true;

@@ -134,7 +134,7 @@ bool IsPlainGrid(const Stage& stage, const RECT& client) {
            client.right <= kLargestSide && client.bottom <= kLargestSide &&
            kor::zoomLevel <= kLargestZoom && grid.firstVisibleColumn >= 0 &&
            grid.firstVisibleColumn < KORGRID_COLUMNS && grid.firstVisibleRow < KORGRID_ROWS &&
-           stage.stripsInStep;
+           stage.stripsInStep && !stage.hasMixedGrids;
 }
 
 // A new size makes a new image, and so takes everything away that came before.
