@@ -31,6 +31,7 @@ struct Block {
     Family family;
     bool isLive;
     int number;
+    size_t step;  // of the storm, that made it
 };
 
 BYTE* arena = nullptr;
@@ -67,8 +68,8 @@ Block* Find(const void* address) {
 
 [[noreturn]] void FailHeap(const char* kind, const Block* block, const void* address) {
     if (!block) FailStorm("heap: %s, no block known", kind);
-    FailStorm("heap: %s: block %d of %u bytes, offset %ld", kind, block->number,
-              static_cast<unsigned>(block->size),
+    FailStorm("heap: %s: block %d of %u bytes made in step %u, offset %ld", kind, block->number,
+              static_cast<unsigned>(block->size), static_cast<unsigned>(block->step),
               static_cast<long>(static_cast<const BYTE*>(address) - block->begin));
 }
 
@@ -114,7 +115,8 @@ void* Allocate(size_t size, bool isZeroed, Family family) {
     std::memset(pages, kAround, static_cast<size_t>(begin - pages));
     std::memset(begin + size, kAround, room - size);
     std::memset(begin, isZeroed ? 0 : kFresh, size);
-    blocks[PageNumber(pages)] = {pages, begin, size, pageBytes, family, true, ++made};
+    blocks[PageNumber(pages)] = {pages, begin,  size,   pageBytes,
+                                family, true, ++made, progress.step};
     ++live;
     return begin;
 }
@@ -230,7 +232,7 @@ const char* DescribeLiveBlocks(int madeBefore) {
     for (const auto& [page, block] : blocks) {
         if (!block.isLive || block.number <= madeBefore || text.size() > 500) continue;
         text += "block " + std::to_string(block.number) + " of " + std::to_string(block.size) +
-                " bytes; ";
+                " bytes made in step " + std::to_string(block.step) + "; ";
     }
     return text.c_str();
 }

@@ -107,20 +107,27 @@ HWND Stage::host(int number) {
     if (!place || !isLive(place)) {
         place = CreateWindowExW(0, kHostClass, L"", WS_POPUP | WS_VISIBLE, 0, 0, 240, 180, nullptr,
                                 nullptr, Instance(), nullptr);
-        live_[place] = {kKinds, false};
+        live_[place] = {kKinds, false, false};
     }
     return place;
 }
 
+// Null for a window that has been told of its end: what is created in it then may never be.
 HWND Stage::parent(int number) {
+    HWND window = anyParent(number);
+    const auto found = live_.find(window);
+    return found == live_.end() || found->second.isDying ? nullptr : window;
+}
+
+HWND Stage::anyParent(int number) {
     if (number == 7) return nullptr;
     if (number == 6) return windows_[kGrid][0];
     if (number >= 4) return host(number);
     HWND& place = panes_[number & 3];
     if (!place || !isLive(place)) {
         place = CreateWindowExW(0, kHostClass, L"", WS_CHILD | WS_VISIBLE, 0, 0, 160, 120,
-                                host(number >> 1), nullptr, Instance(), nullptr);
-        if (place) live_[place] = {kKinds, false};
+                                parent(4 + (number >> 1)), nullptr, Instance(), nullptr);
+        if (place) live_[place] = {kKinds, false, false};
     }
     return place;
 }
@@ -138,6 +145,8 @@ HWND Stage::create(Kind kind, int place, int parentNumber, int width, int height
 }
 
 HWND Stage::ensure(Kind kind, int place) {
+    // A second grid takes everything over from the first: few are made, see create.
+    if (kind == kGrid && !isLive(windows_[kGrid][place & 3])) place = 0;
     HWND window = windows_[kind][place & 3];
     if (window && isLive(window)) return window;
     return create(kind, place, place & 1, 60 + 30 * (place & 3), 70, UsualStyle(kind));
@@ -162,14 +171,16 @@ LRESULT CALLBACK Stage::controlProc(HWND window, UINT message, WPARAM wParam, LP
 
 LRESULT Stage::onControl(Kind kind, HWND window, UINT message, WPARAM wParam, LPARAM lParam) {
     if (message == WM_NCCREATE) {
-        live_[window] = {kind, false};
+        live_[window] = {kind, false, false};
         if (awaited_ && awaitedKind_ == kind) {
             *awaited_ = window;
             awaited_ = nullptr;
         }
     }
+    if (message == WM_DESTROY) live_[window].isDying = true;
     if (message == WM_CREATE && kind == kGrid && lParam) {
         ++gridsCreated;
+        hasMixedGrids = gridsInCreation_++ > 0;
         if (currentGrid_ && isLive(currentGrid_)) hadTwoGrids = true;
         currentGrid_ = window;
         stripsInStep = false;
@@ -179,10 +190,16 @@ LRESULT Stage::onControl(Kind kind, HWND window, UINT message, WPARAM wParam, LP
     const bool isSystems = kind == kList || kind == kTree;
     if (!isSystems && spring(Event::kBefore, message, 0)) noteDisturbed(kind, message);
     // A control cannot be created in a window that is gone.
-    if (message == WM_CREATE && !isLive(window)) return -1;
+    if (message == WM_CREATE && !isLive(window)) {
+        if (kind == kGrid && lParam) --gridsInCreation_;
+        return -1;
+    }
     const LRESULT result = CallWindowProcW(original_[kind], window, message, wParam, lParam);
     if (kind == kGrid) noteSelecting(window, message, wParam, lParam);  // what came inside is over
-    if (message == WM_CREATE && kind == kGrid && lParam) wrapChildren(window);
+    if (message == WM_CREATE && kind == kGrid && lParam) {
+        --gridsInCreation_;
+        wrapChildren(window);
+    }
     if (!isSystems && spring(Event::kAfter, message, 0)) noteDisturbed(kind, message);
     if (message == WM_NCDESTROY) live_.erase(window);
     return result;
@@ -200,16 +217,16 @@ void Stage::noteDisturbed(Kind kind, UINT message) {
 // elsewhere, since each arrow has rules of its own; the pointer over a view beyond the sheet.
 void Stage::noteSelecting(HWND grid, UINT message, WPARAM wParam, LPARAM lParam) {
     const bool isPress = message == WM_LBUTTONDOWN;
+    const bool isPointer = isPress || message == WM_MOUSEMOVE || message == HCN_ITEMCLICK;
     if (isPress) isAnchored_ = true;
     if (message == WM_LBUTTONUP && !(wParam & MK_SHIFT)) isAnchored_ = false;
     if (message == WM_KEYDOWN && isAnchored_) selectionIsAnything = true;
-    if (isPress || message == WM_MOUSEMOVE || message == HCN_ITEMCLICK) {
-        GridVisibleRange range = {};
-        GetVisibleRange(&range);
-        if (range.firstColumn >= KORGRID_COLUMNS || range.firstRow >= KORGRID_ROWS) {
-            selectionIsAnything = true;
-        }
-    }
+    GridVisibleRange range = {};
+    GetVisibleRange(&range);
+    const bool isOutside = range.firstColumn >= KORGRID_COLUMNS || range.firstRow >= KORGRID_ROWS;
+    if (isPress && isOutside) isAnchorOutside_ = true;
+    if (isPointer && (isOutside || isAnchorOutside_)) selectionIsAnything = true;
+    if (!isAnchored_) isAnchorOutside_ = false;
     if (message != HCN_ITEMCLICK) return;
     const bool isRow = reinterpret_cast<HWND>(wParam) == GetDlgItem(grid, 3);
     const DWORD count = isRow ? GetNumberOfVisibleRows() : GetNumberOfVisibleColumns();
@@ -235,6 +252,7 @@ LRESULT Stage::onHost(HWND window, UINT message, WPARAM wParam, LPARAM lParam) {
         message == GRIDN_EQUATIONEMPTY) {
         CheckNotification(*this, message, wParam, lParam);
     }
+    if (message == WM_DESTROY) live_[window].isDying = true;
     const bool isOfList = message == WM_NOTIFY && (wParam == 100 + kList || wParam == 100 + kTree);
     if (!isOfList) {
         spring(Event::kHost, message, message == WM_NOTIFY ? static_cast<UINT>(wParam) : 0);

@@ -47,6 +47,7 @@ public:
     HWND currentGrid() const { return currentGrid_; }
     bool stripsInStep = false;  // the current grid has been laid out, and nothing came in between
     bool hadTwoGrids = false;  // at the same time: the first one's objects are lost then
+    bool hasMixedGrids = false;  // the last grid was created inside another one's creation
     int gridsCreated = 0;
     int textsLeft = 0;  // texts of single items that were deleted from a function bar
     bool selectionIsAnything = false;  // see noteSelecting
@@ -80,6 +81,7 @@ private:
     struct Live {
         Kind kind;
         bool isWithoutRecord;
+        bool isDying;
     };
     struct Trap {
         Event event;
@@ -102,6 +104,7 @@ private:
     void noteDisturbed(Kind kind, UINT message);
     bool spring(Event::Place place, UINT message, UINT code);
     HWND host(int number);
+    HWND anyParent(int number);
 
     HWND hosts_[2]{};
     HWND panes_[4]{};
@@ -113,7 +116,9 @@ private:
     Kind awaitedKind_ = kStrip;
     HWND currentGrid_ = nullptr;
     std::vector<Trap> traps_;
+    int gridsInCreation_ = 0;
     bool isAnchored_ = false;  // a press in the grid has not been let go
+    bool isAnchorOutside_ = false;  // pressed while the view lay beyond the sheet
     int depth_ = 0;
     int innerLeft_ = 0;  // operations that traps may still do in this step
 };

@@ -134,13 +134,13 @@ bool IsPlainGrid(const Stage& stage, const RECT& client) {
            client.right <= kLargestSide && client.bottom <= kLargestSide &&
            kor::zoomLevel <= kLargestZoom && grid.firstVisibleColumn >= 0 &&
            grid.firstVisibleColumn < KORGRID_COLUMNS && grid.firstVisibleRow < KORGRID_ROWS &&
-           stage.stripsInStep;
+           stage.stripsInStep && !stage.hasMixedGrids;
 }
 
 // A new size makes a new image, and so takes everything away that came before.
 void CompareGrid(Stage& stage) {
     HWND window = stage.currentGrid();
-    if (!window || !stage.isLive(window) || stage.hadTwoGrids) return;
+    if (!window || !stage.isLive(window)) return;
     RECT client = {};
     GetClientRect(window, &client);
     if (!IsPlainGrid(stage, client)) return;
@@ -159,17 +159,29 @@ void CompareGrid(Stage& stage) {
     ++gridsCompared;
 }
 
+// Nothing of it is hidden, or outside of its parent.
+bool IsWholeVisible(HWND window, const RECT& client) {
+    HDC dc = GetDC(window);
+    RECT shown = {};
+    const bool isWhole = GetClipBox(dc, &shown) == SIMPLEREGION && EqualRect(&shown, &client);
+    ReleaseDC(window, dc);
+    return isWhole && IsWindowVisible(window);
+}
+
 void CompareStrip(Stage& stage, HWND window) {
     const kor::HeaderRecord* record = kor::FindHeaderRecord(window);
     RECT client = {};
     GetClientRect(window, &client);
-    if (!record || !IsWindowVisible(window) || client.right < 1 || client.bottom < 1 ||
+    stage.runAlone([&] { SetWindowPos(window, HWND_TOP, 0, 0, 0, 0, SWP_NOSIZE | SWP_NOACTIVATE); });
+    if (!record || !IsWholeVisible(window, client) || client.right < 1 || client.bottom < 1 ||
         client.right > kLargestSide || client.bottom > kLargestSide ||
         kor::zoomLevel > kLargestZoom) {
         return;
     }
     Strip strip = {client.right, client.bottom, kor::IsVertical(*record), kor::zoomLevel, {}};
-    for (uint32_t i = 0; i < record->count; ++i) {
+    uint32_t first = 0;  // items without a size at the very start are left out
+    while (first < record->count && record->sizes[first] == 0) ++first;
+    for (uint32_t i = first; i < record->count; ++i) {
         const wchar_t* text = record->texts[i];
         strip.items.push_back({text ? text : L"", record->sizes[i], record->states[i]});
     }

@@ -77,7 +77,8 @@ const size_t kHostWordCount = std::size(kHostWords);
 
 template <Kind kind>
 void WindowWords<kind>::create(Stage& stage, const Arguments& a) {
-    stage.create(kind, a[0], a[1], a[2], a[3],
+    const bool isSecondGrid = kind == kGrid && (a[4] & 63) == 0;
+    stage.create(kind, kind != kGrid || isSecondGrid ? a[0] : 0, a[1], a[2], a[3],
                  a[5] ? OddStyle(a[4]) : OddStyle(a[4] & HCS_VERTICAL));
 }
 
