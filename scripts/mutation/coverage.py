@@ -2,6 +2,7 @@
 
 import json
 import os
+import re
 import shutil
 import subprocess
 from collections import Counter, defaultdict
@@ -70,32 +71,42 @@ def map_of(program, jobs, say):
 
 
 def measure_program(program, jobs, say):
-    listed = units.units_of(tree.PLAIN / "bin", program, SCRATCH / f"{program}.log")
-    branches = Counter()
+    suites = units.units_of(tree.PLAIN / "bin", program, SCRATCH / f"{program}.log")
+    found, branches = [], Counter()
     with ThreadPoolExecutor(jobs) as pool:
-        for taken in pool.map(measure_unit, listed):
+        for measured, taken in pool.map(measure_suite, suites):
+            found += measured
             branches.update(taken)
-    by_test = [unit.suite for unit in listed if not unit.whole]
     say(
-        f"{program}: {len(listed)} suites in {sum(unit.seconds for unit in listed):.0f} s"
-        + (f", test by test {', '.join(by_test)}" if by_test else "")
+        f"{program}: {len(suites)} suites in {len(found)} processes, {sum(unit.seconds for unit in found):.0f} s, "
+        f"{sum(not unit.whole for unit in found)} of them for single tests"
     )
     return {
-        "units": [asdict(unit) for unit in listed],
+        "units": [asdict(unit) for unit in found],
         "branches": [[*key, count] for key, count in branches.items()],
     }
 
 
+def measure_suite(suite):
+    """Whole, or each of its tests; and the branches."""
+    taken = measure_unit(suite)
+    if taken is not None:
+        return [suite], taken
+    found, branches = suite.split(), Counter()
+    for unit in found:
+        taken = measure_unit(unit)
+        if taken is None:
+            raise SystemExit(f"mutants: {unit.name} fails although nothing is broken; see {SCRATCH / 'data'}")
+        branches.update(taken)
+    return found, branches
+
+
 def measure_unit(unit):
-    """Fills in the unit's lines, seconds, and whether it can run whole; gives its branches."""
-    folder = SCRATCH / "data" / f"{unit.program}.{unit.suite.replace('/', '.')}"
-    log = Path(f"{folder}.log")
-    outcome = run_instrumented(unit, folder, log)
+    """Fills in the unit's lines and seconds; gives its branches, or None where it fails."""
+    folder = SCRATCH / "data" / re.sub(r"[^\w.]+", "-", unit.name)
+    outcome = run_instrumented(unit, folder, Path(f"{folder}.log"))
     if not outcome.passed:
-        unit.whole = False
-        outcome = run_instrumented(unit, folder, log)
-    if not outcome.passed:
-        raise SystemExit(f"mutants: {unit.name} fails although nothing is broken; see {log}")
+        return None
     unit.lines, branches = read_data(folder)
     shutil.rmtree(folder)
     return branches

@@ -1,4 +1,4 @@
-"""Test suites as they are run here: whole in one process, or test by test where that fails."""
+"""Test suites as they are run here: whole in one process, or one test in each where that fails."""
 
 import os
 import re
@@ -13,19 +13,25 @@ PATIENCE = 900  # seconds, for a suite of which nothing is known
 
 @dataclass
 class Unit:
+    """What one process runs."""
+
     program: str
     suite: str
-    tests: list  # all of its tests
+    tests: list  # all of the suite's, or a single one
     whole: bool = True
     seconds: float = 0.0
     lines: dict = field(default_factory=dict)  # file: the lines that it ran
 
     @property
-    def name(self):
-        return f"{self.program}: {self.suite}"
+    def filter(self):
+        return f"{self.suite}.{'*' if self.whole else self.tests[0]}"
 
-    def filters(self):
-        return [f"{self.suite}.*"] if self.whole else [f"{self.suite}.{test}" for test in self.tests]
+    @property
+    def name(self):
+        return f"{self.program}: {self.filter}"
+
+    def split(self):
+        return [Unit(self.program, self.suite, [test], False) for test in self.tests]
 
     def size(self):
         return sum(map(len, self.lines.values()))
@@ -69,27 +75,21 @@ def start(folder, program, arguments, log, environment=None):
 def run(unit, folder, log, limit=PATIENCE, environment=None):
     """Runs the unit's tests up to the first failure; its outcome and its seconds."""
     begin = time.monotonic()
-    for test_filter in unit.filters():
-        outcome = run_filter(unit.program, test_filter, folder, log, limit, environment)
-        if not outcome.passed:
-            break
-    return outcome, time.monotonic() - begin
-
-
-def run_filter(program, test_filter, folder, log, limit, environment):
-    process = start(folder, program, [f"--gtest_filter={test_filter}", "--gtest_fail_fast"], log, environment)
+    arguments = [f"--gtest_filter={unit.filter}", "--gtest_fail_fast"]
+    process = start(folder, unit.program, arguments, log, environment)
     try:
         status = process.wait(limit)
     except subprocess.TimeoutExpired:
         process.kill()
         process.wait()
         status = None
-    return outcome_of(status, log.read_text(encoding="utf-8", errors="replace"))
+    seconds = time.monotonic() - begin
+    return outcome_of(status, log.read_text(encoding="utf-8", errors="replace")), seconds
 
 
 def outcome_of(status, output):
-    running = re.findall(r"^\[ RUN      \] (\S+)", output, re.MULTILINE)
-    test = running[-1] if running else ""
+    failed = re.findall(r"^\[  FAILED  \] (\S+\.\S+?),? ", output, re.MULTILINE)
+    test = (failed[:1] or re.findall(r"^\[ RUN      \] (\S+)", output, re.MULTILINE)[-1:] or [""])[0]
     if status == 0 and "[  PASSED  ]" in output and "] Running 0 tests" not in output:
         return Outcome("passed")
     if re.search(r": Failure$|^\[  FAILED  \]", output, re.MULTILINE):
