@@ -3,6 +3,7 @@
 import re
 import shutil
 import threading
+from collections import Counter
 from dataclasses import dataclass
 
 from mutation import tree, units
@@ -18,7 +19,8 @@ class Result:
     kind: str  # does not compile, identical, uncovered, survived, assertion, crash, hang
     suite: str = ""
     test: str = ""
-    ran: int = 0
+    ran: int = 0  # processes
+    covering: int = 0  # of so many that run the line
 
     @property
     def counts(self):
@@ -32,9 +34,10 @@ class Result:
 class Bench:
     """Slots in which mutants are tried at the same time, and what they share."""
 
-    def __init__(self, programs, coverage, sources, jobs):
+    def __init__(self, programs, coverage, sources, jobs, most):
         self.coverage = coverage
         self.sources = sources
+        self.most = most  # processes for a mutant
         self.compiler = tree.Compiler(programs)
         self.free = [Slot(self, number, programs) for number in range(jobs)]
         self.lock = threading.Lock()
@@ -107,10 +110,15 @@ class Bench:
         return self.compiler.dependents(mutant.file)
 
     def units_of(self, reach):
+        """Of each suite the quickest and most specific first, then of each the second, and so on."""
         found = {}
         for file, lines in reach.items():
             found.update((unit.name, unit) for unit in self.coverage.units_at(file, lines))
-        return sorted(found.values(), key=lambda unit: unit.seconds * unit.size())
+        ranked, seen = [], Counter()
+        for unit in sorted(found.values(), key=lambda unit: unit.seconds * unit.size()):
+            ranked.append((seen[unit.program, unit.suite], len(ranked), unit))
+            seen[unit.program, unit.suite] += 1
+        return [unit for _, _, unit in sorted(ranked, key=lambda each: each[:2])]
 
 
 class Slot:
@@ -158,7 +166,7 @@ class Slot:
     def run(self, mutant, objects, covering):
         linked = set()
         folder = self.folder / "bin"
-        for count, unit in enumerate(covering, 1):
+        for count, unit in enumerate(covering[: self.bench.most], 1):
             program = f"{unit.program}.exe"
             linking = program if program in self.bench.compiler.links else "korcontrols.dll"
             if linking not in linked:
@@ -167,5 +175,5 @@ class Slot:
             limit = HANG_FACTOR * unit.seconds + HANG_SECONDS
             outcome, _ = units.run(unit, folder, self.folder / "log", limit)
             if not outcome.passed and self.bench.is_steady(unit, self.folder / "log.whole"):
-                return Result(mutant, outcome.kind, unit.name, outcome.test, count)
-        return Result(mutant, "survived", ran=len(covering))
+                return Result(mutant, outcome.kind, unit.name, outcome.test, count, len(covering))
+        return Result(mutant, "survived", ran=min(len(covering), self.bench.most), covering=len(covering))
