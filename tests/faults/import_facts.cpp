@@ -153,6 +153,7 @@ const ImportFact kFacts[] = {
     Fails("ImageList_Draw", kBadHandle),
     Fails("ImageList_GetImageInfo", kBadHandle),
     // ---- Modules and resources ------------------------------------------------------------------
+    Fails("GetModuleFileNameW", ERROR_INVALID_HANDLE),
     Fails("LoadLibraryW", ERROR_MOD_NOT_FOUND),  // modules stay for the life of the process
     Fails("GetProcAddress", ERROR_PROC_NOT_FOUND),
     Fails("LoadStringW", ERROR_RESOURCE_NAME_NOT_FOUND),

@@ -653,6 +653,10 @@ void User::tidyUp() {
         removeSheet();
         check();
     }
+    // In place of a large picture of a chart, should that be on the clipboard.
+    desk_.focusGrid();
+    desk_.keyWith({VK_CONTROL}, 'C');
+    clipboard_ = Rows{{L""}};
 }
 
 void User::goOn() {

@@ -21,6 +21,7 @@ constexpr Signature kStdcall[] = {
     {"GlobalFree", 1},
     {"GlobalLock", 1},
     {"GlobalUnlock", 1},
+    {"GetModuleFileNameW", 3},
     {"LoadLibraryW", 1},
     {"LoadResource", 2},
     {"LocalAlloc", 2},
