@@ -52,6 +52,13 @@ void GuardedBlocks::decommit(GuardedBlock& block) {
     VirtualFree(block.firstPage, block.pageBytes, MEM_DECOMMIT);
 }
 
+bool GuardedBlocks::startOver() {
+    if (!liveBlocksAfter(0).empty()) return false;
+    byEnd_.clear();
+    arenaUsed_ = 0;
+    return true;
+}
+
 GuardedBlock* GuardedBlocks::containing(const void* address) {
     const auto* byte = static_cast<const BYTE*>(address);
     // The first block that ends behind the address.

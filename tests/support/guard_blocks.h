@@ -37,6 +37,9 @@ public:
     // Takes the block's pages away; its description stays.
     void decommit(GuardedBlock& block);
 
+    // Forgets every block, so that addresses come again. False, and nothing done, while one lives.
+    bool startOver();
+
     // The block, freed or not, whose pages (its guard page included) contain the address; or
     // nullptr.
     GuardedBlock* containing(const void* address);

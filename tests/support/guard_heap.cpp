@@ -102,6 +102,12 @@ std::vector<HeapFault> GuardHeap::faults() const {
 
 std::string GuardHeap::report() const { return FaultReport(faults()); }
 
+bool GuardHeap::startOver() {
+    if (!Memory().blocks.startOver()) return false;
+    blocksBefore_ = 0;
+    return true;
+}
+
 int GuardHeap::live() const {
     return static_cast<int>(Memory().blocks.liveBlocksAfter(blocksBefore_).size());
 }

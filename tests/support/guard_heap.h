@@ -31,6 +31,11 @@ public:
     std::vector<HeapFault> faults() const;
     std::string report() const;  // one line per fault; empty when there is none
 
+    // Between two lives of a library that has freed everything: what one left behind is not seen in
+    // the next any more, but the address space lasts for any number of them. False while a block
+    // lives.
+    bool startOver();
+
     int live() const;                // blocks handed out and not freed
     std::string liveReport() const;  // their numbers and sizes
 

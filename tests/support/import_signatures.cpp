@@ -164,6 +164,7 @@ constexpr Signature kStdcall[] = {
     {"SetBkColor", 2},
     {"SetBkMode", 2},
     {"SetPixel", 4},
+    {"SetRectRgn", 5},
     {"SetROP2", 2},
     {"SetTextAlign", 2},
     {"SetTextColor", 2},
