@@ -185,6 +185,9 @@ LRESULT Stage::onControl(Kind kind, HWND window, UINT message, WPARAM wParam, LP
         currentGrid_ = window;
         stripsInStep = false;
     }
+    if (kind == kGrid && message == WM_LBUTTONUP && !(wParam & MK_SHIFT)) {
+        isAnchored_ = isAnchorOutside_ = false;
+    }
     if (kind == kGrid) noteSelecting(window, message, wParam, lParam);
     // The system's own views are not to be destroyed inside their messages.
     const bool isSystems = kind == kList || kind == kTree;
@@ -219,14 +222,12 @@ void Stage::noteSelecting(HWND grid, UINT message, WPARAM wParam, LPARAM lParam)
     const bool isPress = message == WM_LBUTTONDOWN;
     const bool isPointer = isPress || message == WM_MOUSEMOVE || message == HCN_ITEMCLICK;
     if (isPress) isAnchored_ = true;
-    if (message == WM_LBUTTONUP && !(wParam & MK_SHIFT)) isAnchored_ = false;
     if (message == WM_KEYDOWN && isAnchored_) selectionIsAnything = true;
     GridVisibleRange range = {};
     GetVisibleRange(&range);
     const bool isOutside = range.firstColumn >= KORGRID_COLUMNS || range.firstRow >= KORGRID_ROWS;
     if (isPress && isOutside) isAnchorOutside_ = true;
     if (isPointer && (isOutside || isAnchorOutside_)) selectionIsAnything = true;
-    if (!isAnchored_) isAnchorOutside_ = false;
     if (message != HCN_ITEMCLICK) return;
     const bool isRow = reinterpret_cast<HWND>(wParam) == GetDlgItem(grid, 3);
     const DWORD count = isRow ? GetNumberOfVisibleRows() : GetNumberOfVisibleColumns();
