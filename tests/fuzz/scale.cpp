@@ -52,6 +52,17 @@ void CheckTicks(const kor::GraphRecord& graph) {
     });
 }
 
+// Any step between any values: multiples that can be counted.
+void CheckTickRange(Input& input) {
+    constexpr double kMost = 100000.0;
+    const double a = AnyDouble(input);
+    const double b = AnyDouble(input);
+    const kor::TickRange range = kor::TicksBetween(a, b, std::fabs(AnyDouble(input)));
+    EXPECT_THAT(std::isfinite(range.first) && std::isfinite(range.last));
+    EXPECT_THAT(range.last - range.first <= kMost);
+    EXPECT_THAT(range.first + 1 > range.first && range.last + 1 > range.last);
+}
+
 }  // namespace
 }  // namespace korfuzz
 
@@ -78,5 +89,6 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
     CheckQuickPixels(graph.xCentre, graph.xUnitsPerPixel, values);
     CheckQuickPixels(graph.yCentre, graph.yUnitsPerPixel, values);
     CheckTicks(graph);
+    CheckTickRange(input);
     return 0;
 }

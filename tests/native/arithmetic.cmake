@@ -24,5 +24,5 @@ function(korcontrols_arithmetic name)
     ${KORCONTROLS_ROOT}/tests/native/no_drawing.cpp)
   target_include_directories(${name} PUBLIC
     ${KORCONTROLS_ROOT}/tests/native/include ${KORCONTROLS_ROOT}/include ${src})
-  target_compile_options(${name} PUBLIC -DKORCONTROLS_ASSERTIONS ${ARGN})
+  target_compile_options(${name} PRIVATE -O1 PUBLIC -DKORCONTROLS_ASSERTIONS ${ARGN})
 endfunction()

@@ -12,8 +12,7 @@
 namespace kortest {
 namespace {
 
-// Without a guard there is room behind such a block, so that nothing is broken.
-constexpr int kSize = 5;
+constexpr int kSize = 16;
 
 // The library's own way to a function.
 template <typename Function>
@@ -44,6 +43,10 @@ TEST_F(Victim, LeavesItAlone) {
 }
 
 TEST_F(Victim, WritesBehindABlock) { write(kSize); }
+
+TEST_F(Victim, GetsABlockInsideAPage) {
+    EXPECT_NE((reinterpret_cast<ULONG_PTR>(block()) + kSize) % 4096, 0u);
+}
 
 TEST_F(Victim, WritesBeforeABlock) { write(-1); }
 

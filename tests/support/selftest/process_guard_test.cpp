@@ -82,39 +82,40 @@ TEST(ProcessGuard, LetsProperUsePass) {
 TEST(ProcessGuard, FailsATestForAWriteBehindABlock) {
     const Outcome outcome = OutcomeOf(L"Victim.WritesBehindABlock", L"end");
     EXPECT_EQ(outcome.status, 1u);
-    EXPECT_TRUE(outcome.says("overrun: block 1 of 5 bytes, write at offset 5")) << outcome.text;
+    EXPECT_TRUE(outcome.says("overrun: block 1 of 16 bytes, write at offset 16")) << outcome.text;
     EXPECT_TRUE(outcome.says("[  FAILED  ] Victim.WritesBehindABlock")) << outcome.text;
 }
 
 TEST(ProcessGuard, FailsATestForAWriteBeforeABlock) {
     const Outcome outcome = OutcomeOf(L"Victim.WritesBeforeABlock", L"begin");
     EXPECT_EQ(outcome.status, 1u);
-    EXPECT_TRUE(outcome.says("underrun: block 1 of 5 bytes, write at offset -1")) << outcome.text;
+    EXPECT_TRUE(outcome.says("underrun: block 1 of 16 bytes, write at offset -1")) << outcome.text;
 }
 
 TEST(ProcessGuard, FailsATestForAWriteToAFreedBlock) {
     for (const wchar_t* side : {L"end", L"begin"}) {
         const Outcome outcome = OutcomeOf(L"Victim.WritesToAFreedBlock", side);
         EXPECT_EQ(outcome.status, 1u);
-        EXPECT_TRUE(outcome.says("use after free: block 1 of 5 bytes")) << outcome.text;
+        EXPECT_TRUE(outcome.says("use after free: block 1 of 16 bytes")) << outcome.text;
     }
 }
 
 TEST(ProcessGuard, LiesBelowATestsOwnSpy) {
     const Outcome outcome = OutcomeOf(L"Victim.WritesBehindABlockThatASpySaw", L"end");
     EXPECT_EQ(outcome.status, 1u);
-    EXPECT_TRUE(outcome.says("overrun: block 1 of 5 bytes")) << outcome.text;
+    EXPECT_TRUE(outcome.says("overrun: block 1 of 16 bytes")) << outcome.text;
     EXPECT_FALSE(outcome.says("spy.count")) << outcome.text;
 }
 
 TEST(ProcessGuard, SeesWhatComesWithTheFixturesEnd) {
     const Outcome outcome = OutcomeOf(L"LateVictim.WritesBehindABlock", L"end");
     EXPECT_EQ(outcome.status, 1u);
-    EXPECT_TRUE(outcome.says("overrun: block 1 of 5 bytes")) << outcome.text;
+    EXPECT_TRUE(outcome.says("overrun: block 1 of 16 bytes")) << outcome.text;
 }
 
 TEST(ProcessGuard, IsNotThereUnasked) {
-    EXPECT_EQ(OutcomeOf(L"Victim.WritesBehindABlock", nullptr).status, 0u);
+    EXPECT_EQ(OutcomeOf(L"Victim.GetsABlockInsideAPage", nullptr).status, 0u);
+    EXPECT_EQ(OutcomeOf(L"Victim.GetsABlockInsideAPage", L"end").status, 1u);
 }
 
 TEST(ProcessGuard, RefusesAnotherWord) {
