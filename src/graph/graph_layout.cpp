@@ -8,6 +8,7 @@
 #include "graph/graph_numbers.h"
 #include "platform/gdi_scopes.h"
 #include "platform/runtime.h"
+#include "text/text_run.h"
 
 namespace kor {
 
@@ -62,9 +63,7 @@ int LeftMargin(GraphRecord& graph, HDC dc) {
 
 SIZE MeasureText(HDC dc, HFONT font, const wchar_t* text) {
     SelectScope selected(dc, font);
-    RECT measured = {};
-    DrawTextW(dc, text, -1, &measured, DT_CALCRECT);
-    return {measured.right - measured.left, measured.bottom - measured.top};
+    return DrawnSize(dc, text);
 }
 
 void CreateGraphFonts(GraphRecord& graph, HDC dc) {

@@ -31,6 +31,12 @@ bool IsPlainFormat(UINT format) {
 
 }  // namespace
 
+SIZE DrawnSize(HDC dc, const wchar_t* text, int length) noexcept {
+    RECT measured = {};
+    if (!dc || !DrawTextW(dc, text, length, &measured, DT_CALCRECT)) return {};
+    return {measured.right - measured.left, measured.bottom - measured.top};
+}
+
 TextRun::TextRun(HDC dc, const wchar_t* text) noexcept
     : dc_(dc), text_(text), plainLength_(PlainLength(text)) {}
 
@@ -41,9 +47,7 @@ int TextRun::Width() noexcept {
         GetTextExtentExPointW(dc_, text_, plainLength_, 0, nullptr, nullptr, &size);
         width_ = size.cx;
     } else {
-        RECT measured = {};
-        DrawTextW(dc_, text_, -1, &measured, DT_CALCRECT);
-        width_ = measured.right - measured.left;
+        width_ = DrawnSize(dc_, text_).cx;
     }
     return width_;
 }

@@ -9,6 +9,10 @@
 
 namespace kor {
 
+// Size of a text as DrawTextW measures it with DT_CALCRECT alone; empty without a DC, where the
+// platform leaves what it likes. `length` is in characters, -1 for up to the terminator.
+SIZE DrawnSize(HDC dc, const wchar_t* text, int length = -1) noexcept;
+
 class TextRun {
 public:
     // `text` is zero-terminated and outlives the run; the DC's font stays selected for as long.

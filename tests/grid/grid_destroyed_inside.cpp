@@ -57,41 +57,52 @@ TEST_F(GridDestroyedInside, SizesThatGoMeanwhileAreGone) {
     EXPECT_EQ(heap.report(), "");
 }
 
-// ---- In the middle of its creation ---------------------------------------------------------------
+// ---- In the middle of its creation
+// ---------------------------------------------------------------
 
 class GridDestroyedInCreation : public GridUse {
 protected:
-    // What the creation of a grid leaves behind, but for the strips' font, which is never deleted.
-    std::vector<std::string> leftBy(const std::function<void(HWND child)>& action) {
-        MessageHook hook(host.window());
-        hook.before(WM_PARENTNOTIFY,
-                    [&](WPARAM, LPARAM child) { action(reinterpret_cast<HWND>(child)); });
+    void SetUp() override { RegisterGridControl(GetModuleHandleW(nullptr)); }
+
+    HWND createGridWindow() {
+        return CreateWindowExW(0, KORGRID_CLASS, L"", WS_CHILD | WS_VISIBLE, 0, 0, 330, 168,
+                               host.window(), nullptr, GetModuleHandleW(nullptr), nullptr);
+    }
+
+    // What the creation leaves behind, but for the strips' font, which is never deleted, when a
+    // host acts inside the creation of the grid's first button.
+    std::vector<std::string> leftBy(const std::function<void(HWND grid)>& action) {
+        constexpr size_t kParent = 8;
+        int children = 0;
         WatchHandles(spy);
-        host.createGrid(330, 168);
-        EXPECT_TRUE(hook.hasActed());
-        std::vector<std::string> left = UnreturnedHandles(spy);
-        std::erase_if(left, [](const std::string& handle) {
-            return handle.find("CreateFontIndirectW") != std::string::npos;
+        spy.watch("CreateWindowExW");
+        spy.replace("CreateWindowExW", [&](ULONG_PTR* arguments) {
+            const ULONG_PTR child = spy.callReal("CreateWindowExW", arguments);
+            if (++children == 2) action(reinterpret_cast<HWND>(arguments[kParent]));
+            return child;
         });
+        createGridWindow();
+        EXPECT_GE(children, 2);
+        std::vector<std::string> left = UnreturnedHandles(spy);
+        std::erase(left, "CreateFontIndirectW");
         return left;
     }
 };
 
 TEST_F(GridDestroyedInCreation, LeavesNothingBehind) {
-    const auto left = leftBy([](HWND child) { DestroyWindow(GetParent(child)); });
+    const auto left = leftBy([](HWND unfinished) { DestroyWindow(unfinished); });
     EXPECT_EQ(left, std::vector<std::string>{});
 }
 
 TEST_F(GridDestroyedInCreation, LeavesTheNextGridAlone) {
     HWND next = nullptr;
-    leftBy([&](HWND child) {
-        DestroyWindow(GetParent(child));
-        next = CreateWindowExW(0, KORGRID_CLASS, L"", WS_CHILD | WS_VISIBLE, 0, 0, 200, 100,
-                               host.window(), nullptr, GetModuleHandleW(nullptr), nullptr);
+    leftBy([&](HWND unfinished) {
+        DestroyWindow(unfinished);
+        next = createGridWindow();
     });
     ASSERT_TRUE(IsWindow(next));
     DestroyWindow(next);
-    EXPECT_EQ(UnreturnedHandles(spy).size(), 1u) << "the strips' font";
+    EXPECT_EQ(UnreturnedHandles(spy), std::vector<std::string>{"CreateFontIndirectW"});
 }
 
 }  // namespace

@@ -9,6 +9,7 @@
 #include "platform/gdi_scopes.h"
 #include "platform/records.h"
 #include "platform/windows_helpers.h"
+#include "text/text_run.h"
 
 namespace kor {
 
@@ -36,11 +37,7 @@ struct LegendRecord {
 
 void FreeRecord(LegendRecord* legend) { DeleteRecord(legend); }
 
-int LineHeight(HDC dc) {
-    RECT measured = {};
-    DrawTextW(dc, L"M", -1, &measured, DT_CALCRECT);
-    return measured.bottom;
-}
+int LineHeight(HDC dc) { return DrawnSize(dc, L"M").cy; }
 
 void DrawSwatch(HDC dc, int top, COLORREF colour) {
     LocalGdiObject<HBRUSH> brush(CreateSolidBrush(colour));

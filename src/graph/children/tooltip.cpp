@@ -5,6 +5,7 @@
 #include "platform/gdi_scopes.h"
 #include "platform/local_text.h"
 #include "platform/records.h"
+#include "text/text_run.h"
 
 namespace kor {
 
@@ -41,10 +42,8 @@ void TakeText(ToolTipRecord& tip, const wchar_t* text) {
 // Size of the text with its frame.
 SIZE MeasureTip(HWND hwnd, const wchar_t* text) {
     WindowDC dc(hwnd);
-    RECT measured = {};
-    DrawTextW(dc.get(), text, static_cast<int>(wcslen(text)), &measured, DT_CALCRECT);
-    return {measured.right - measured.left + 2 * kInset,
-            measured.bottom - measured.top + 2 * kInset};
+    const SIZE measured = DrawnSize(dc.get(), text, static_cast<int>(wcslen(text)));
+    return {measured.cx + 2 * kInset, measured.cy + 2 * kInset};
 }
 
 LRESULT OnShow(ToolTipRecord& tip, const ToolTipRequest* request) {
