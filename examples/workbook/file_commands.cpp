@@ -63,9 +63,33 @@ OPENFILENAMEW FileDialog(const Workbook& workbook, const std::wstring& folder,
     return dialog;
 }
 
-bool SaveTo(Workbook& workbook, const std::wstring& path) {
+// Whether to write a file that others have changed or removed. What they wrote goes only by a "Yes"
+// that was meant; what they removed is written again by Enter, too.
+bool MayReplace(const Workbook& workbook, const FileProblem& problem) {
+    const bool isChanged = problem.kind == FileProblemKind::ChangedByOthers;
+    const std::wstring question =
+        problem.message + (isChanged
+                               ? L"\n\nReplace it, and lose those changes? (Save As keeps both.)"
+                               : L"\n\nSave it again?");
+    const UINT preset = isChanged ? MB_DEFBUTTON2 : MB_DEFBUTTON1;
+    return MessageBoxW(workbook.window, question.c_str(), L"Workbook",
+                       MB_YESNO | MB_ICONWARNING | preset) == IDYES;
+}
+
+using SaveFunction = std::optional<FileProblem> (Document::*)(const std::wstring&) noexcept;
+
+std::optional<FileProblem> SaveBy(SaveFunction save, Workbook& workbook, const std::wstring& path) {
     const WaitCursor wait;
-    const std::optional<FileProblem> problem = workbook.document().save(path);
+    return (workbook.document().*save)(path);
+}
+
+//   result  whether the sheet is saved now
+bool SaveTo(Workbook& workbook, const std::wstring& path, SaveFunction save) {
+    std::optional<FileProblem> problem = SaveBy(save, workbook, path);
+    if (problem && problem->kind != FileProblemKind::Failed) {
+        if (!MayReplace(workbook, *problem)) return false;
+        problem = SaveBy(&Document::saveOver, workbook, path);
+    }
     if (problem) ShowProblem(workbook, *problem);
     ShowTitle(workbook);
     return !problem;
@@ -133,7 +157,7 @@ void OpenFile(Workbook& workbook, const std::wstring& path) {
 bool Save(Workbook& workbook) {
     CommitTyping(workbook);
     const std::wstring path = workbook.document().path();
-    return path.empty() ? SaveAs(workbook) : SaveTo(workbook, path);
+    return path.empty() ? SaveAs(workbook) : SaveTo(workbook, path, &Document::save);
 }
 
 bool SaveAs(Workbook& workbook) {
@@ -149,7 +173,8 @@ bool SaveAs(Workbook& workbook) {
                                L"\" is open as another sheet. Choose another name."});
         return false;
     }
-    return SaveTo(workbook, file.data());
+    // The dialog has asked whether an existing file is to be replaced.
+    return SaveTo(workbook, file.data(), &Document::saveOver);
 }
 
 void CloseSheet(Workbook& workbook) {

@@ -1,4 +1,4 @@
-// Start-up, the message loop, the end.
+// Start-up and the end.
 #include <windows.h>
 
 #include <commctrl.h>
@@ -24,18 +24,6 @@ std::vector<std::wstring> FilesOnCommandLine() {
     return files;
 }
 
-// The loop. Before it waits, the window catches up with what the grid does without telling.
-void RunMessageLoop(workbook::Workbook& workbook) {
-    MSG message = {};
-    for (;;) {
-        if (!PeekMessageW(&message, nullptr, 0, 0, PM_NOREMOVE)) workbook::OnIdle(workbook);
-        if (GetMessageW(&message, nullptr, 0, 0) <= 0) return;
-        if (workbook::HandleBeforeDispatch(workbook, message)) continue;
-        if (workbook::MayBecomeCharacter(message)) TranslateMessage(&message);
-        DispatchMessageW(&message);
-    }
-}
-
 }  // namespace
 
 int WINAPI WinMain(HINSTANCE instance, HINSTANCE, LPSTR, int show) {
@@ -48,6 +36,7 @@ int WINAPI WinMain(HINSTANCE instance, HINSTANCE, LPSTR, int show) {
         MessageBoxW(nullptr, L"The window could not be created.", L"Workbook", MB_ICONERROR);
         return 1;
     }
-    RunMessageLoop(workbook);
+    while (workbook::HandleNextMessage(workbook)) {
+    }
     return 0;
 }

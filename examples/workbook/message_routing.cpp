@@ -3,6 +3,7 @@
 #include "grid_host.h"
 #include "resource.h"
 #include "workbook.h"
+#include "workbook_window.h"
 
 namespace workbook {
 
@@ -69,6 +70,16 @@ bool MayBecomeCharacter(const MSG& message) {
     // AltGr, which types characters, is Ctrl and Alt together.
     const bool control = IsDown(VK_CONTROL) && !IsDown(VK_MENU);
     return !control || message.hwnd == GetHandleToEquationControl();
+}
+
+bool HandleNextMessage(Workbook& workbook) {
+    MSG message = {};
+    if (!PeekMessageW(&message, nullptr, 0, 0, PM_NOREMOVE)) OnIdle(workbook);
+    if (GetMessageW(&message, nullptr, 0, 0) <= 0) return false;
+    if (HandleBeforeDispatch(workbook, message)) return true;
+    if (MayBecomeCharacter(message)) TranslateMessage(&message);
+    DispatchMessageW(&message);
+    return true;
 }
 
 }  // namespace workbook

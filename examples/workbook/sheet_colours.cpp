@@ -24,7 +24,8 @@ double Luminance(COLORREF colour) {
 }
 
 double Contrast(COLORREF one, COLORREF other) {
-    const auto [low, high] = std::minmax(Luminance(one), Luminance(other));
+    // By value: of two temporaries std::minmax gives references that dangle.
+    const auto [low, high] = std::minmax({Luminance(one), Luminance(other)});
     return (high + 0.05) / (low + 0.05);
 }
 

@@ -8,6 +8,7 @@
 #include "graph/graph_points.h"
 #include "graph/graph_scale.h"
 #include "graph/graph_series.h"
+#include "platform/assert.h"
 #include "platform/runtime.h"
 
 namespace kor {
@@ -132,6 +133,7 @@ int HitTestGraphValue(const GraphRecord& graph, int x, int y, wchar_t* text) {
         AppendNumber(text, SliceShare(*series, slice) * 100.0, kSharePrecision);
         wcscat(text, L"%\r\n");
         AppendValue(text, series->values[slice]);
+        KOR_ASSERT(wcslen(text) < kTipTextCapacity);  // two numbers and nine characters
         return 1;
     }
     for (int i = 0; i < graph.seriesCount; ++i) {

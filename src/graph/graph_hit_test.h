@@ -2,10 +2,12 @@
 #pragma once
 
 #include "graph/graph_record.h"
+#include "platform/number_text.h"
 
 namespace kor {
 
 constexpr int kTipTextCapacity = 128;
+static_assert(kTipTextCapacity > 2 * kNumberTextCapacity + 10);  // a share, a value, their words
 
 // Fills `text` (kTipTextCapacity characters) and returns 1 when a point lies under an image
 // position; otherwise empties it and returns 0. Series are tried in the order they were added.

@@ -39,6 +39,7 @@ void DrawAreaSeries(const GraphRecord& graph, HDC dc, const GraphSeries& series)
     const int count = points.count() + 2 * kBasePoint;
     corners[0] = {xPixel(graph, 1), base};
     corners[count - 1] = {xPixel(graph, series.pointCount), base};
+    // DrawArea closes the outline behind its last corner: the second of the spare places there.
     DrawArea(dc, view, {corners, count});
 }
 

@@ -61,7 +61,7 @@ struct Reach {
 };
 
 void TraceSeries(const GraphRecord& graph, GraphSeries& series, Reach& reach) {
-    series.livePointCount = series.pointCount;
+    series.livePointCount = series.pointCount;  // liveBuffer was made for as many, or more
     for (int i = 1; i <= series.pointCount; ++i) {
         const POINT point = {xPixel(graph, i), yPixel(graph, series.values[i - 1])};
         series.liveBuffer[i - 1] = point;

@@ -8,6 +8,7 @@
 #include "graph/graph_numbers.h"
 #include "graph/graph_points.h"
 #include "graph/graph_scale.h"
+#include "platform/assert.h"
 #include "platform/gdi_scopes.h"
 #include "platform/local_text.h"
 #include "platform/runtime.h"
@@ -96,6 +97,8 @@ public:
         const uint32_t shift = place % kWordBits;
         const int first = std::max(y - kRadius, static_cast<int>(area_.top));
         const int past = std::min(y - kRadius + kSide, static_cast<int>(area_.bottom));
+        // A circle reaches less than a word out of the area, which has a spare word on each side.
+        KOR_ASSERT(place / kWordBits + 1 < static_cast<uint32_t>(words_));
         for (int row = first; row < past; ++row) {
             const uint32_t covered = circle.bits[row - (y - kRadius)];
             uint32_t* bits = bits_ + (row - area_.top) * words_ + place / kWordBits;
@@ -159,6 +162,7 @@ public:
     void Begin(int highest, int lowest) {
         const int first = std::max(highest - top_, 0);
         missing_ = std::min(lowest - top_, height_ - 1) - first + 1;
+        KOR_ASSERT(missing_ <= 0 || first + missing_ <= height_);
         if (missing_ > 0) memset(rows_ + first, 0, static_cast<size_t>(missing_));
     }
 
@@ -168,6 +172,7 @@ public:
     bool Insert(int y) {
         const int row = y - top_;
         if (row < 0 || row >= height_ || rows_[row]) return false;
+        KOR_ASSERT(missing_ > 0);
         rows_[row] = 1;
         --missing_;
         return true;

@@ -11,6 +11,7 @@
 #include "graph/graph_palette.h"
 #include "graph/graph_series.h"
 #include "graph/graph_slice_walk.h"
+#include "platform/assert.h"
 #include "platform/gdi_scopes.h"
 #include "platform/local_text.h"
 
@@ -99,12 +100,14 @@ public:
         SelectScope selected(dc_, pen);
         if (!halfWidths_ || !(end.edge.degrees > start.edge.degrees)) return;
         const POINT centre = pie_.centre;
-        WalkSlice(start.edge, end.edge, RowsOfSlice(pie_.radius, start, end), halfWidths_,
-                  [&](int dy, DiscRun run) {
-                      const POINT ends[] = {{centre.x + run.from, centre.y + dy},
-                                            {centre.x + run.to, centre.y + dy}};
-                      Polyline(dc_, ends, 2);
-                  });
+        const RowRange rows = RowsOfSlice(pie_.radius, start, end);
+        KOR_ASSERT(rows.first >= -pie_.radius &&
+                   rows.last <= pie_.radius);  // halfWidths_ ends there
+        WalkSlice(start.edge, end.edge, rows, halfWidths_, [&](int dy, DiscRun run) {
+            const POINT ends[] = {{centre.x + run.from, centre.y + dy},
+                                  {centre.x + run.to, centre.y + dy}};
+            Polyline(dc_, ends, 2);
+        });
     }
 
 private:

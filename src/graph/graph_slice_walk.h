@@ -61,6 +61,7 @@ template <typename Take>
 void WalkBetween(EdgeWalk from, EdgeWalk to, RowRange rows, const int32_t* halfWidths, RowPart part,
                  Take take) {
     for (int dy = rows.first; dy <= rows.last; ++dy) {
+        // `halfWidths` reaches as far as the rows, which RowsOfSlice keeps within the radius.
         const int halfWidth = halfWidths[dy < 0 ? -dy : dy];
         const DiscRun run = {std::max(from.column(), part == RowPart::right ? 0 : -halfWidth),
                              std::min(to.column(), part == RowPart::left ? 0 : halfWidth)};

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "platform/assert.h"
 #include "platform/local_heap.h"
 #include "platform/runtime.h"
 #include "platform/windows_helpers.h"
@@ -35,6 +36,7 @@ bool StoreSize(SizeOverride*& table, uint32_t& count, int defaultSize, int index
         return true;
     }
     if (!MakeRoom(table, count)) return false;
+    KOR_ASSERT(place == count || table[place].index > entry.index);  // sorted, without duplicates
     memmove(table + place + 1, table + place, (count - place) * sizeof(SizeOverride));
     table[place] = entry;
     ++count;

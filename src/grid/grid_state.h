@@ -6,6 +6,7 @@
 
 #include "grid/grid_geometry.h"
 #include "platform/platform.h"
+#include "platform/records.h"
 
 namespace kor {
 
@@ -67,9 +68,14 @@ struct GridState {
     int32_t lastMouseY = 0;
     int32_t resizeLinePos = kNoResizeLine;  // client x or y of the inverted line
     uint8_t editBuffer[kEditBufferBytes] = {};
+    RecordLife life = {};
 };
 
 extern GridState grid;
+
+// The state itself never goes. What a grid that was destroyed in the middle of its own work has
+// made after that goes when the work ends.
+void FreeRecord(GridState* state);
 
 // What follows from other initial values: done once, when the process attaches the library.
 void InitialiseGridState();

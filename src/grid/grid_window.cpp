@@ -95,22 +95,7 @@ void CreateImageDC() {
     ReleaseDC(grid.hwndGrid, parentDC);  // it came from the parent; the platform goes by the DC
 }
 
-// Places nothing: WM_SIZE follows and does.
-LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
-    if (!creation) return 0;
-    RegisterHeaderClass(
-        creation->hInstance);  // fails when it already is, and need not succeed then
-    grid.hwndParent = creation->hwndParent;
-    grid.hwndGrid = hwnd;
-    WhenHeaderResizeIsLost(OnHeaderResizeLost);
-    CreateChildren(creation->hInstance);
-    grid.gridLinePen = CreatePen(PS_SOLID, 1, kGridLineColour);
-    CreateImageDC();
-    return 0;
-}
-
-LRESULT OnDestroy() {
-    LoseGridDrag();
+void ReleaseDrawingObjects() {
     if (grid.memoryBitmap) {
         SelectObject(grid.memoryDC, grid.blankBitmap);
         DeleteObject(grid.memoryBitmap);
@@ -120,7 +105,30 @@ LRESULT OnDestroy() {
     grid.memoryBitmap = nullptr;
     grid.memoryDC = nullptr;
     grid.gridLinePen = nullptr;
+}
+
+// Places nothing: WM_SIZE follows and does.
+LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
+    if (!creation) return 0;
+    grid.life.retired = false;
+    ReleaseDrawingObjects();  // of a grid that this one follows while it still lives
+    RegisterHeaderClass(
+        creation->hInstance);  // fails when it already is, and need not succeed then
+    grid.hwndParent = creation->hwndParent;
+    grid.hwndGrid = hwnd;
+    WhenHeaderResizeIsLost(OnHeaderResizeLost);
+    CreateChildren(creation->hInstance);
+    if (grid.life.retired || grid.hwndGrid != hwnd) return 0;  // a host has destroyed it by now
+    grid.gridLinePen = CreatePen(PS_SOLID, 1, kGridLineColour);
+    CreateImageDC();
+    return 0;
+}
+
+LRESULT OnDestroy() {
+    LoseGridDrag();
+    ReleaseDrawingObjects();
     ForgetSizes();
+    if (!grid.life.retired) RetireRecord(grid);
     return 0;
 }
 
@@ -151,6 +159,7 @@ LRESULT OnSetEquationText(WPARAM mark, LPARAM text) {
 }
 
 LRESULT CALLBACK GridProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
+    const RecordUse use(&grid);
     const int lowWord = LowWord(static_cast<WPARAM>(lParam));
     const int highWord = HighWord(static_cast<WPARAM>(lParam));
     const auto sender = reinterpret_cast<HWND>(wParam);
@@ -187,6 +196,11 @@ LRESULT CALLBACK GridProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam)
 }
 
 }  // namespace
+
+void FreeRecord(GridState* state) {
+    ReleaseDrawingObjects();
+    state->life.retired = false;
+}
 
 }  // namespace kor
 

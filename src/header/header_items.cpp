@@ -1,5 +1,6 @@
 #include "header/header_items.h"
 
+#include "platform/assert.h"
 #include "platform/local_heap.h"
 #include "platform/runtime.h"
 
@@ -51,6 +52,7 @@ bool Grow(HeaderRecord& header) {
 // Makes an empty place at `index` by moving all places from there up to the capacity by one.
 void OpenPlace(HeaderRecord& header, uint32_t index) {
     const uint32_t last = index < header.capacity ? header.capacity - 1 : header.capacity;
+    KOR_ASSERT(index <= last);
     FreeLabel(header, last);  // falls off the end
     const size_t moved = last - index;
     memmove(header.texts + index + 1, header.texts + index, moved * sizeof(wchar_t*));
@@ -67,6 +69,7 @@ LRESULT InsertItem(HeaderRecord& header, int index, const HeaderItemDesc* item) 
     const bool append = index < 0 || static_cast<uint32_t>(index) > header.capacity;
     const uint32_t place = append ? header.count : static_cast<uint32_t>(index);
     ++header.count;
+    KOR_ASSERT(place <= header.capacity && header.count <= header.capacity);
     OpenPlace(header, place);
     header.sizes[place] = item->size;
     header.states[place] = 0;

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "platform/assert.h"
 #include "platform/runtime.h"
 #include "text/scratch_bitmap.h"
 #include "text/text_run.h"
@@ -37,6 +38,7 @@ Advances AdvancesOf(const NumberWidths& widths, const wchar_t* text) {
             found.count = -1;
             return found;
         }
+        KOR_ASSERT(found.count < kLongestNumber);
         found.each[found.count] = widths.widths[place];
         found.width += widths.widths[place];
     }

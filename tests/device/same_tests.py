@@ -22,7 +22,7 @@ def tests_of(ctest, tree):
     desktop, device = {}, {}
     for test in json.loads(listed.stdout)["tests"]:
         labels = [p["value"] for p in test["properties"] if p["name"] == "LABELS"]
-        if ["device"] not in labels:
+        if not labels:
             desktop[test["name"]] = test.get("command", [])
         elif test["name"].startswith(PREFIX):
             device[test["name"].removeprefix(PREFIX)] = test.get("command", [])

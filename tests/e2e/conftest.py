@@ -19,6 +19,7 @@ FAILURES = ROOT / "build" / "e2e-failures"
 
 def pytest_addoption(parser):
     parser.addoption("--machine", action="append", help="i686, x86_64 (default: both) or device")
+    parser.addoption("--kills", type=int, default=6, help="how often a program is killed as it saves")
     parser.addoption("--build", default=ROOT / "build", help="the folder of the presets' builds")
 
 
@@ -79,12 +80,17 @@ def clipboard(desktop, programs):
 
 @pytest.fixture
 def open_workbook(desktop, probe, programs, machine, request):
-    """open_workbook(path, ...) starts workbook.exe with these files as arguments."""
+    """open_workbook(path, ...) starts workbook.exe with these files as arguments; `options` go to
+    Popen."""
     started = []
 
-    def open_one(*files):
+    def open_one(*files, **options):
         workbook = Workbook(
-            desktop, probe, programs / "workbook.exe", *[windows_path(file) for file in files]
+            desktop,
+            probe,
+            programs / "workbook.exe",
+            *[windows_path(file) for file in files],
+            **options,
         )
         started.append(workbook)
         return workbook

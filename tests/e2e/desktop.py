@@ -101,15 +101,15 @@ class Desktop:
 
     # ---- Programs ----
 
-    def start(self, program, *arguments, **pipes):
-        """Starts a Windows program; `pipes` go to Popen, its output is thrown away by default."""
-        pipes.setdefault("stdin", subprocess.DEVNULL)
-        pipes.setdefault("stdout", subprocess.DEVNULL)
+    def start(self, program, *arguments, **options):
+        """Starts a Windows program; `options` go to Popen, its output is thrown away by default."""
+        options.setdefault("stdin", subprocess.DEVNULL)
+        options.setdefault("stdout", subprocess.DEVNULL)
         return subprocess.Popen(
             [str(WINE_RUN), "--direct", str(program), *arguments],
             env=self._environment,
             stderr=subprocess.DEVNULL,
-            **pipes,
+            **options,
         )
 
     # ---- Hands ----

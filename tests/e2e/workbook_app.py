@@ -115,9 +115,9 @@ class View:
 
 
 class Workbook:
-    def __init__(self, desktop, probe, program, *arguments):
+    def __init__(self, desktop, probe, program, *arguments, **options):
         self.desktop, self.probe = desktop, probe
-        self.process = desktop.start(program, *arguments)
+        self.process = desktop.start(program, *arguments, **options)
         wait_until(self._main, "the workbook shows its window", 60)
         self.settle()
 

@@ -2,7 +2,10 @@
 // one of its own children.
 #include "grid/use_grid.h"
 
+#include "support/handle_balance.h"
 #include "support/message_hook.h"
+
+#include <functional>
 
 namespace kortest {
 namespace {
@@ -52,6 +55,43 @@ TEST_F(GridDestroyedInside, SizesThatGoMeanwhileAreGone) {
     EXPECT_TRUE(hook.hasActed());
     EXPECT_EQ(HeaderSizes(rowHeader)[1], kRowHeight);
     EXPECT_EQ(heap.report(), "");
+}
+
+// ---- In the middle of its creation ---------------------------------------------------------------
+
+class GridDestroyedInCreation : public GridUse {
+protected:
+    // What the creation of a grid leaves behind, but for the strips' font, which is never deleted.
+    std::vector<std::string> leftBy(const std::function<void(HWND child)>& action) {
+        MessageHook hook(host.window());
+        hook.before(WM_PARENTNOTIFY,
+                    [&](WPARAM, LPARAM child) { action(reinterpret_cast<HWND>(child)); });
+        WatchHandles(spy);
+        host.createGrid(330, 168);
+        EXPECT_TRUE(hook.hasActed());
+        std::vector<std::string> left = UnreturnedHandles(spy);
+        std::erase_if(left, [](const std::string& handle) {
+            return handle.find("CreateFontIndirectW") != std::string::npos;
+        });
+        return left;
+    }
+};
+
+TEST_F(GridDestroyedInCreation, LeavesNothingBehind) {
+    const auto left = leftBy([](HWND child) { DestroyWindow(GetParent(child)); });
+    EXPECT_EQ(left, std::vector<std::string>{});
+}
+
+TEST_F(GridDestroyedInCreation, LeavesTheNextGridAlone) {
+    HWND next = nullptr;
+    leftBy([&](HWND child) {
+        DestroyWindow(GetParent(child));
+        next = CreateWindowExW(0, KORGRID_CLASS, L"", WS_CHILD | WS_VISIBLE, 0, 0, 200, 100,
+                               host.window(), nullptr, GetModuleHandleW(nullptr), nullptr);
+    });
+    ASSERT_TRUE(IsWindow(next));
+    DestroyWindow(next);
+    EXPECT_EQ(UnreturnedHandles(spy).size(), 1u) << "the strips' font";
 }
 
 }  // namespace

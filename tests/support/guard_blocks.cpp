@@ -7,6 +7,8 @@ namespace kortest {
 namespace {
 
 constexpr size_t kPage = 4096;
+// Of the end of a block. Compiled 64-bit code may rely on blocks at multiples of 16 bytes.
+constexpr size_t kAlignment = sizeof(void*) == 4 ? 1 : 16;
 constexpr size_t kArena = 64 * 1024 * 1024;
 constexpr BYTE kAround = 0xFD;  // bytes of a block's pages that nobody asked for
 constexpr BYTE kFresh = 0xCD;
@@ -27,18 +29,22 @@ BYTE* GuardedBlocks::reserve(size_t bytes) {
     return place;
 }
 
-GuardedBlock* GuardedBlocks::allocate(size_t size, bool isZeroed, HeapFamily family) {
+GuardedBlock* GuardedBlocks::allocate(size_t size, bool isZeroed, HeapFamily family,
+                                      GuardedSide side) {
     if (size > kArena) return nullptr;
-    const size_t room = RoundUp(std::max<size_t>(size, 1), alignment_);
+    const size_t room = RoundUp(std::max<size_t>(size, 1), kAlignment);
     const size_t pageBytes = RoundUp(room, kPage);
-    BYTE* pages = reserve(pageBytes + kPage);
-    if (!pages || !VirtualAlloc(pages, pageBytes, MEM_COMMIT, PAGE_READWRITE)) return nullptr;
+    BYTE* place = reserve(pageBytes + kPage);
+    if (!place) return nullptr;
+    const bool atEnd = side == GuardedSide::End;
+    BYTE* pages = atEnd ? place : place + kPage;
+    if (!VirtualAlloc(pages, pageBytes, MEM_COMMIT, PAGE_READWRITE)) return nullptr;
 
-    BYTE* begin = pages + pageBytes - room;
+    BYTE* begin = atEnd ? pages + pageBytes - room : pages;
     std::memset(pages, kAround, pageBytes);
     std::memset(begin, isZeroed ? 0 : kFresh, size);
     const GuardedBlock block{count() + 1, pages, begin, size, pageBytes, family, false};
-    return &byGuardPage_.emplace(block.guardPage(), block).first->second;
+    return &byEnd_.emplace(place + pageBytes + kPage, block).first->second;
 }
 
 void GuardedBlocks::decommit(GuardedBlock& block) {
@@ -46,16 +52,20 @@ void GuardedBlocks::decommit(GuardedBlock& block) {
     VirtualFree(block.firstPage, block.pageBytes, MEM_DECOMMIT);
 }
 
+bool GuardedBlocks::startOver() {
+    if (!liveBlocksAfter(0).empty()) return false;
+    byEnd_.clear();
+    arenaUsed_ = 0;
+    return true;
+}
+
 GuardedBlock* GuardedBlocks::containing(const void* address) {
     const auto* byte = static_cast<const BYTE*>(address);
-    // The first block whose guard page does not end before the address.
-    auto found = byGuardPage_.lower_bound(byte);
-    if (found != byGuardPage_.begin()) {
-        auto before = std::prev(found);
-        if (byte < before->second.guardPage() + kPage) found = before;
-    }
-    if (found == byGuardPage_.end() || byte < found->second.firstPage) return nullptr;
-    return &found->second;
+    // The first block that ends behind the address.
+    auto found = byEnd_.upper_bound(byte);
+    if (found == byEnd_.end()) return nullptr;
+    const BYTE* place = found->first - found->second.pageBytes - kPage;
+    return byte < place ? nullptr : &found->second;
 }
 
 GuardedBlock* GuardedBlocks::beginningAt(const void* address) {
@@ -65,8 +75,8 @@ GuardedBlock* GuardedBlocks::beginningAt(const void* address) {
 
 long GuardedBlocks::findDamage(const GuardedBlock& block) {
     const auto isChanged = [](BYTE byte) { return byte != kAround; };
-    const BYTE* behind = std::find_if(block.slackBegin(), block.guardPage(), isChanged);
-    if (behind != block.guardPage()) return static_cast<long>(behind - block.begin);
+    const BYTE* behind = std::find_if(block.slackBegin(), block.slackEnd(), isChanged);
+    if (behind != block.slackEnd()) return static_cast<long>(behind - block.begin);
     const BYTE* before = std::find_if(block.firstPage, block.begin, isChanged);
     if (before != block.begin) return static_cast<long>(before - block.begin);
     return 0;
@@ -74,7 +84,7 @@ long GuardedBlocks::findDamage(const GuardedBlock& block) {
 
 std::vector<const GuardedBlock*> GuardedBlocks::liveBlocksAfter(int number) const {
     std::vector<const GuardedBlock*> live;
-    for (const auto& entry : byGuardPage_) {
+    for (const auto& entry : byEnd_) {
         const GuardedBlock& block = entry.second;
         if (!block.isFreed && block.number > number) live.push_back(&block);
     }

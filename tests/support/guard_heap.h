@@ -1,41 +1,41 @@
-// Gives the library heap blocks that end at a page nobody may touch.
+// Gives the library heap blocks that end, or begin, at a page nobody may touch.
 //
 // LocalAlloc, LocalReAlloc, LocalFree (with LocalLock, LocalUnlock and LocalSize) and the malloc
-// family of the library are replaced through the import spy. An access past a block's end or to a
-// freed block is noted and then let through, so that one run can report several.
+// family of the library are replaced through the import spy. An access past that side of a block or
+// to a freed block is noted and then let through, so that one run can report several.
 #pragma once
 
+#include "support/guarded_memory.h"
 #include "support/import_spy.h"
 
+#include <optional>
 #include <string>
 #include <vector>
 
 namespace kortest {
 
-struct HeapFault {
-    std::string kind;  // "overrun", "use after free", "double free", ...
-    int block;         // number of the block in order of allocation, from 1; 0: no known block
-    size_t blockSize;  // bytes asked for
-    long offset;       // of the access, from the block's begin
-    bool isWrite;
-    ULONG_PTR codeOffset;  // of the instruction from the library's base; 0 when seen later
-};
-
-// One at a time; it outlives every window of the library made during its life.
+// One at a time, also where the whole process is guarded (process_guard.cpp); it outlives every
+// window of the library made during its life.
 //
 // Compiled 64-bit code may rely on blocks at multiples of 16 bytes, so there a read of the few
 // bytes between a block's end and the next such multiple goes unseen (a write is seen when it is
 // freed).
 class GuardHeap {
 public:
-    explicit GuardHeap(ImportSpy& spy, size_t alignment = sizeof(void*) == 4 ? 1 : 16);
+    // Without a side it is the process's own, or the end.
+    explicit GuardHeap(ImportSpy& spy, std::optional<GuardedSide> side = {});
     ~GuardHeap();
     GuardHeap(const GuardHeap&) = delete;
     GuardHeap& operator=(const GuardHeap&) = delete;
 
-    const std::vector<HeapFault>& faults() const;
+    std::vector<HeapFault> faults() const;
     std::string report() const;  // one line per fault; empty when there is none
-    void clearFaults();
+    void clearFaults();          // once they are reported, or were made on purpose
+
+    // Between two lives of a library that has freed everything: what one left behind is not seen in
+    // the next any more, but the address space lasts for any number of them. False while a block
+    // lives.
+    bool startOver();
 
     int live() const;                // blocks handed out and not freed
     std::string liveReport() const;  // their numbers and sizes
@@ -45,6 +45,10 @@ public:
 
 private:
     ImportSpy& spy_;
+    GuardedSide sideBefore_;
+    HMODULE moduleBefore_;
+    size_t faultsBefore_;
+    int blocksBefore_;
 };
 
 // Frees a block that the library gave away, whether a guard heap made it or not.

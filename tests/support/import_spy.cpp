@@ -1,5 +1,6 @@
 #include "support/import_spy.h"
 
+#include "support/import_table.h"
 #include "support/import_thunk.h"
 
 #include <gtest/gtest.h>
@@ -11,45 +12,6 @@ namespace {
 
 ImportSpy* activeSpy = nullptr;
 
-using ImportVisitor = std::function<void(const char* dll, const char* name, ULONG_PTR* slot)>;
-
-void VisitImports(HMODULE module, const ImportVisitor& visit) {
-    auto* base = reinterpret_cast<BYTE*>(module);
-    auto* dos = reinterpret_cast<IMAGE_DOS_HEADER*>(base);
-    auto* nt = reinterpret_cast<IMAGE_NT_HEADERS*>(base + dos->e_lfanew);
-    const auto& directory = nt->OptionalHeader.DataDirectory[IMAGE_DIRECTORY_ENTRY_IMPORT];
-    if (!directory.Size) return;
-
-    auto* dll = reinterpret_cast<IMAGE_IMPORT_DESCRIPTOR*>(base + directory.VirtualAddress);
-    for (; dll->Name; ++dll) {
-        auto* name = reinterpret_cast<IMAGE_THUNK_DATA*>(base + dll->OriginalFirstThunk);
-        auto* slot = reinterpret_cast<IMAGE_THUNK_DATA*>(base + dll->FirstThunk);
-        for (; name->u1.AddressOfData; ++name, ++slot) {
-            if (IMAGE_SNAP_BY_ORDINAL(name->u1.Ordinal)) continue;
-            auto* entry = reinterpret_cast<IMAGE_IMPORT_BY_NAME*>(base + name->u1.AddressOfData);
-            visit(reinterpret_cast<const char*>(base + dll->Name),
-                  reinterpret_cast<const char*>(entry->Name),
-                  reinterpret_cast<ULONG_PTR*>(&slot->u1.Function));
-        }
-    }
-}
-
-// Address of the module's pointer to the imported function, or nullptr.
-ULONG_PTR* FindImportSlot(HMODULE module, const std::string& wanted) {
-    ULONG_PTR* found = nullptr;
-    VisitImports(module, [&](const char*, const char* name, ULONG_PTR* slot) {
-        if (wanted == name) found = slot;
-    });
-    return found;
-}
-
-void WriteSlot(ULONG_PTR* slot, ULONG_PTR value) {
-    DWORD protection = 0;
-    VirtualProtect(slot, sizeof value, PAGE_READWRITE, &protection);
-    *slot = value;
-    VirtualProtect(slot, sizeof value, protection, &protection);
-}
-
 }  // namespace
 
 struct ImportSpy::Watch {
@@ -58,11 +20,13 @@ struct ImportSpy::Watch {
     CallingConvention convention;
     ULONG_PTR* slot;
     ULONG_PTR realFunction;
-    Handler handler;
+    Handler handler = nullptr;
     int callsUntilFailure = 0;  // 1: the next call fails; 0: none does
     bool failsAlways = false;
+    bool failsOn = false;  // once a call has failed, all do
     ULONG_PTR failureResult = 0;
     DWORD failureError = 0;
+    Handler failure = nullptr;  // instead of the two
 };
 
 HMODULE LibraryModule() { return GetModuleHandleW(L"korcontrols.dll"); }
@@ -81,7 +45,7 @@ ImportSpy::ImportSpy(HMODULE module) : module_(module) {
 }
 
 ImportSpy::~ImportSpy() {
-    for (const auto& watch : watches_) WriteSlot(watch->slot, watch->realFunction);
+    for (const auto& watch : watches_) WriteImportSlot(watch->slot, watch->realFunction);
     activeSpy = nullptr;
 }
 
@@ -116,7 +80,7 @@ bool ImportSpy::watch(const std::string& name, int argumentCount, CallingConvent
     entry->slot = slot;
     entry->realFunction = *slot;
     watches_.push_back(std::move(entry));
-    WriteSlot(slot, reinterpret_cast<ULONG_PTR>(thunk));
+    WriteImportSlot(slot, reinterpret_cast<ULONG_PTR>(thunk));
     return true;
 }
 
@@ -131,6 +95,14 @@ void ImportSpy::failNth(const std::string& name, int nth, ULONG_PTR result, DWOR
     watch.callsUntilFailure = nth;
     watch.failureResult = result;
     watch.failureError = lastError;
+    watch.failure = nullptr;
+    watch.failsOn = false;
+}
+
+void ImportSpy::failNth(const std::string& name, int nth, Failing failing, Handler failure) {
+    failNth(name, nth);
+    require(name).failsOn = failing == Failing::kForEver;
+    require(name).failure = std::move(failure);
 }
 
 void ImportSpy::failAlways(const std::string& name, ULONG_PTR result, DWORD lastError) {
@@ -142,6 +114,8 @@ void ImportSpy::stopFailing(const std::string& name) {
     Watch& watch = require(name);
     watch.callsUntilFailure = 0;
     watch.failsAlways = false;
+    watch.failsOn = false;
+    watch.failure = nullptr;
 }
 
 void ImportSpy::replace(const std::string& name, Handler handler) {
@@ -182,26 +156,45 @@ void ImportSpy::clearCalls() {
     ++generation_;
 }
 
+int ImportSpy::indexOf(const std::string& name) const {
+    for (size_t i = 0; i < watches_.size(); ++i) {
+        if (watches_[i]->name == name) return static_cast<int>(i);
+    }
+    return -1;
+}
+
 ULONG_PTR __cdecl ImportSpy::dispatch(int index, ULONG_PTR* arguments) {
     ImportSpy& spy = *activeSpy;
     Watch& watch = *spy.watches_[static_cast<size_t>(index)];
-    const size_t place = spy.calls_.size();
-    const int generation = spy.generation_;
-    spy.calls_.push_back({watch.name, {arguments, arguments + watch.argumentCount}, 0, false});
-
     bool failed = false;
-    const ULONG_PTR result = spy.answer(watch, arguments, failed);
-    if (generation == spy.generation_) {
-        spy.calls_[place].result = result;
-        spy.calls_[place].failed = failed;
+    const ULONG_PTR result = spy.keepsCalls_ ? spy.answerAndRecord(watch, arguments, failed)
+                                             : spy.answer(watch, arguments, failed);
+    if (spy.observer_) {
+        const DWORD error = GetLastError();  // the library may be about to read it
+        spy.observer_({index, watch.name, arguments, result, failed});
+        SetLastError(error);
+    }
+    return result;
+}
+
+ULONG_PTR ImportSpy::answerAndRecord(Watch& watch, ULONG_PTR* arguments, bool& failed) {
+    const size_t place = calls_.size();
+    const int generation = generation_;
+    calls_.push_back({watch.name, {arguments, arguments + watch.argumentCount}, 0, false});
+    const ULONG_PTR result = answer(watch, arguments, failed);
+    if (generation == generation_) {
+        calls_[place].result = result;
+        calls_[place].failed = failed;
     }
     return result;
 }
 
 ULONG_PTR ImportSpy::answer(Watch& watch, ULONG_PTR* arguments, bool& failed) {
     const bool isDue = watch.callsUntilFailure > 0 && --watch.callsUntilFailure == 0;
+    if (isDue && watch.failsOn) watch.failsAlways = true;
     if (watch.failsAlways || isDue) {
         failed = true;
+        if (watch.failure) return watch.failure(arguments);
         if (watch.failureError) SetLastError(watch.failureError);
         return watch.failureResult;
     }
@@ -222,7 +215,7 @@ ImportSpy::Watch& ImportSpy::require(const std::string& name) {
     if (Watch* watch = find(name)) return *watch;
     if (watch(name)) return *find(name);
     ADD_FAILURE() << name << " is not imported";
-    static Watch none{name, 0, CallingConvention::Stdcall, nullptr, 0, nullptr};
+    static Watch none{name, 0, CallingConvention::Stdcall, nullptr, 0};
     return none;
 }
 

@@ -10,6 +10,7 @@
 #include <functional>
 #include <memory>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace kortest {
@@ -27,12 +28,22 @@ struct ImportCall {
     bool failed;  // the spy answered, neither the function nor a replacement was called
 };
 
+// A call as an observer sees it, after it was answered.
+struct WatchedCall {
+    int index;  // of the watch
+    const std::string& name;
+    const ULONG_PTR* arguments;
+    ULONG_PTR result;
+    bool failed;
+};
+
 enum class CallingConvention { Stdcall, Cdecl };
 
 // One spy at a time. Its end puts every import back.
 class ImportSpy {
 public:
     using Handler = std::function<ULONG_PTR(ULONG_PTR* arguments)>;
+    using Observer = std::function<void(const WatchedCall& call)>;
 
     explicit ImportSpy(HMODULE module = LibraryModule());
     ~ImportSpy();
@@ -55,6 +66,10 @@ public:
     void failAlways(const std::string& name, ULONG_PTR result = 0, DWORD lastError = 0);
     void stopFailing(const std::string& name);
 
+    // The same with `failure` answering in the function's stead: the nth call alone, or from it on.
+    enum class Failing { kOnce, kForEver };
+    void failNth(const std::string& name, int nth, Failing failing, Handler failure);
+
     // Calls `handler` instead of the function; a failure that is due still comes first.
     void replace(const std::string& name, Handler handler);
     void restore(const std::string& name);
@@ -70,17 +85,25 @@ public:
 
     void clearCalls();  // failures and replacements stay
 
+    // Told of every watched call. Whoever runs millions of calls keeps no list of them besides.
+    void observe(Observer observer) { observer_ = std::move(observer); }
+    void keepCalls(bool kept) { keepsCalls_ = kept; }
+    int indexOf(const std::string& name) const;  // of a watch; -1 when there is none
+
 private:
     struct Watch;
 
     static ULONG_PTR __cdecl dispatch(int index, ULONG_PTR* arguments);
     ULONG_PTR answer(Watch& watch, ULONG_PTR* arguments, bool& failed);
+    ULONG_PTR answerAndRecord(Watch& watch, ULONG_PTR* arguments, bool& failed);
     Watch* find(const std::string& name);
     Watch& require(const std::string& name);
 
     HMODULE module_;
     std::deque<std::unique_ptr<Watch>> watches_;  // a thunk carries its watch's index
     std::vector<ImportCall> calls_;
+    Observer observer_;
+    bool keepsCalls_ = true;
     int generation_ = 0;  // counts clearCalls, for calls that are still under way then
 };
 

@@ -1,5 +1,6 @@
 #include "file_io.h"
 
+#include "file_rights.h"
 #include "support/import_spy.h"
 #include "temporary_folder.h"
 
@@ -133,65 +134,108 @@ TEST(FileIo, KeepsAFileThatAnotherProgramHolds) {
 
 // ---- Calls of the system that fail
 
-struct Failure {
+constexpr const char* kOld = "old";
+constexpr const char* kNew = "new";
+
+// What the call gives when it fails. It is made nevertheless where the system would do its work and
+// fail all the same.
+struct FailingCall {
     const char* function;
     int arguments;
-    int call;  // which one, from 1
-    ULONG_PTR result;
+    bool isMade = false;
+    ULONG_PTR result = 0;
 };
 
-// Makes one of the program's own calls fail, as on a full disk.
-std::optional<FileProblem> ReplaceWithFailure(const std::wstring& path, const Failure& failure) {
+const auto kNoHandle = reinterpret_cast<ULONG_PTR>(INVALID_HANDLE_VALUE);
+const FailingCall kCallsOfSaving[] = {{"CreateFileW", 7, false, kNoHandle},
+                                      {"GetFileInformationByHandleEx", 4},
+                                      {"GetKernelObjectSecurity", 5},
+                                      {"GetFinalPathNameByHandleW", 4},
+                                      {"SetFileInformationByHandle", 4},
+                                      {"SetKernelObjectSecurity", 3},
+                                      {"WriteFile", 5},
+                                      {"FlushFileBuffers", 1},
+                                      {"ReadFile", 5},
+                                      {"CloseHandle", 1, true},
+                                      {"DeleteFileW", 1},
+                                      {"MoveFileExW", 3}};
+
+struct Attempt {
+    bool failed = false;  // the call was reached
+    std::optional<FileProblem> problem;
+};
+
+// Replaces a file that must hold kOld while the nth call of the function fails.
+Attempt ReplaceWithFailing(const std::wstring& path, const FailingCall& call, int nth) {
     kortest::ImportSpy spy(GetModuleHandleW(nullptr));
-    if (!spy.watch(failure.function, failure.arguments, kortest::CallingConvention::Stdcall))
-        return std::nullopt;
-    spy.failNth(failure.function, failure.call, failure.result, ERROR_DISK_FULL);
-    const std::string bytes(size_t{3} << 20, 'n');
-    return ReplaceFileBytes(path, bytes);
+    EXPECT_TRUE(spy.watch(call.function, call.arguments, kortest::CallingConvention::Stdcall));
+    Attempt attempt;
+    int left = nth;
+    spy.replace(call.function, [&](ULONG_PTR* arguments) -> ULONG_PTR {
+        if (--left != 0) return spy.callReal(call.function, arguments);
+        attempt.failed = true;
+        if (call.isMade) spy.callReal(call.function, arguments);
+        SetLastError(ERROR_GEN_FAILURE);
+        return call.result;
+    });
+    attempt.problem = ReplaceFileBytes(path, kNew, MarkOf(kOld));
+    return attempt;
 }
 
-TEST(FileIo, KeepsTheOldFileWhateverFails) {
-    const auto invalid = reinterpret_cast<ULONG_PTR>(INVALID_HANDLE_VALUE);
-    for (const Failure& failure : {Failure{"CreateFileW", 7, 1, invalid},
-                                   {"WriteFile", 5, 1, 0},
-                                   {"WriteFile", 5, 3, 0},
-                                   {"FlushFileBuffers", 1, 1, 0},
-                                   {"MoveFileExW", 3, 1, 0}}) {
-        const TemporaryFolder folder;
-        folder.put(L"a.csv", "old");
-        const auto problem = ReplaceWithFailure(folder.at(L"a.csv"), failure);
-        ASSERT_TRUE(problem) << failure.function;
-        EXPECT_TRUE(MessageNames(problem->message, folder.at(L"a.csv")));
-        EXPECT_EQ(folder.get(L"a.csv"), "old") << failure.function;
-        EXPECT_EQ(folder.names(), Names{L"a.csv"}) << failure.function;
+// Where the system cannot tell the way behind links or rights, the file may be saved without.
+void ExpectOldOrNew(const TemporaryFolder& folder, const Attempt& attempt) {
+    EXPECT_EQ(folder.names(), Names{L"a.csv"});
+    EXPECT_EQ(folder.get(L"a.csv"), attempt.problem ? kOld : kNew);
+    if (attempt.problem) {
+        EXPECT_EQ(attempt.problem->kind, FileProblemKind::Failed);
+        EXPECT_TRUE(MessageNames(attempt.problem->message, folder.at(L"a.csv")))
+            << attempt.problem->message;
     }
 }
 
-TEST(FileIo, KeepsTheOldFileWhenClosingTheNewOneFails) {
-    const TemporaryFolder folder;
-    folder.put(L"a.csv", "old");
-    kortest::ImportSpy spy(GetModuleHandleW(nullptr));
-    ASSERT_TRUE(spy.watch("CloseHandle", 1, kortest::CallingConvention::Stdcall));
-    spy.replace("CloseHandle", [&spy](ULONG_PTR* arguments) -> ULONG_PTR {
-        spy.callReal("CloseHandle", arguments);
-        SetLastError(ERROR_DISK_FULL);
-        return 0;
-    });
-    const auto problem = ReplaceFileBytes(folder.at(L"a.csv"), "new");
-    spy.restore("CloseHandle");
-    ASSERT_TRUE(problem);
-    EXPECT_EQ(folder.get(L"a.csv"), "old");
-    EXPECT_EQ(folder.names(), Names{L"a.csv"});
+// How often saving gave up, over all calls of the function.
+//   rights  of the file that is replaced; empty: those that a new file has
+int CountProblems(const FailingCall& call, const std::wstring& rights) {
+    int problems = 0;
+    for (int nth = 1;; ++nth) {
+        SCOPED_TRACE(call.function + std::string(" ") + std::to_string(nth));
+        const TemporaryFolder folder;
+        folder.put(L"a.csv", kOld);
+        if (!rights.empty()) SetRights(folder.at(L"a.csv"), rights);
+        const Attempt attempt = ReplaceWithFailing(folder.at(L"a.csv"), call, nth);
+        ExpectOldOrNew(folder, attempt);
+        if (!attempt.failed) return problems;
+        problems += attempt.problem.has_value();
+    }
 }
 
-TEST(FileIo, FailsWhenNothingMoreIsWritten) {
+TEST(FileIo, LeavesTheOldFileOrTheNewOneWhateverFails) {
+    for (const FailingCall& call : kCallsOfSaving) {
+        const int usual = CountProblems(call, {});
+        const int locked = CountProblems(call, kEverybodysRights);
+        const std::string function = call.function;
+        if (function == "GetFinalPathNameByHandleW") {
+            EXPECT_EQ(usual + locked, 0) << function;
+        } else {
+            EXPECT_GT(usual + locked, 0) << function;
+        }
+    }
+}
+
+TEST(FileIo, LeavesTheOldFileWhenALaterPieceFails) {
     const TemporaryFolder folder;
-    folder.put(L"a.csv", "old");
-    // Success that wrote nothing: the count stays 0.
-    const auto problem = ReplaceWithFailure(folder.at(L"a.csv"), {"WriteFile", 5, 2, 1});
-    ASSERT_TRUE(problem);
-    EXPECT_EQ(folder.get(L"a.csv"), "old");
-    EXPECT_EQ(folder.names(), Names{L"a.csv"});
+    folder.put(L"a.csv", kOld);
+    kortest::ImportSpy spy(GetModuleHandleW(nullptr));
+    ASSERT_TRUE(spy.watch("WriteFile", 5, kortest::CallingConvention::Stdcall));
+    const ULONG_PTR succeeded = 1;  // but with a count of 0
+    for (const ULONG_PTR result : {ULONG_PTR{0}, succeeded}) {
+        spy.failNth("WriteFile", 3, result, ERROR_DISK_FULL);
+        const auto problem =
+            ReplaceFileBytes(folder.at(L"a.csv"), std::string(size_t{3} << 20, 'n'));
+        ASSERT_TRUE(problem);
+        EXPECT_EQ(folder.get(L"a.csv"), kOld);
+        EXPECT_EQ(folder.names(), Names{L"a.csv"});
+    }
 }
 
 TEST(FileIo, SaysWhyReadingFailedHalfWay) {

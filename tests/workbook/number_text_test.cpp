@@ -75,6 +75,7 @@ TEST(NumberText, ShowsSmallNumbersWithAnExponent) {
     EXPECT_EQ(DisplayNumber(0.00001), L"1E-05");
     EXPECT_EQ(DisplayNumber(0.0000123456789), L"1.23457E-05");
     EXPECT_EQ(DisplayNumber(-1.5e-300), L"-1.5E-300");
+    EXPECT_EQ(DisplayNumber(-1.234567e-280), L"-1.23457E-280");
     EXPECT_EQ(DisplayNumber(0.0000999999999), L"0.0001");
 }
 

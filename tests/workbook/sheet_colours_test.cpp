@@ -40,6 +40,15 @@ TEST(SheetColours, CanBeReadOnTheMenuAndOnItsHighlight) {
     }
 }
 
+TEST(SheetColours, BecomeTheShadeThatIsReadBest) {
+    for (int colour = 0; colour < kSheetColours; ++colour) {
+        const COLORREF black = RGB(0, 0, 0);
+        const COLORREF white = RGB(255, 255, 255);
+        EXPECT_EQ(ReadableSheetColour(colour, black, black), white) << colour;
+        EXPECT_EQ(ReadableSheetColour(colour, white, white), black) << colour;
+    }
+}
+
 TEST(SheetColours, KeepTheirHueWhenTheyAreMadeReadable) {
     const COLORREF green = ReadableSheetColour(0, kLightMenu, kDarkBlue);
     EXPECT_GT(GetGValue(green), GetRValue(green));

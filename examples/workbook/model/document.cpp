@@ -63,6 +63,7 @@ void Document::startNew() {
     sheet_ = std::move(empty);
     format_ = {};
     path_.clear();
+    mark_.reset();
     history_.forgetAll();
 }
 
@@ -77,6 +78,7 @@ std::optional<FileProblem> Document::open(const std::wstring& path) noexcept {
         sheet_ = std::move(result.document->sheet);
         format_ = std::move(result.document->format);
         path_ = std::move(ownPath);
+        mark_ = MarkOf(contents.bytes);
         history_.forgetAll();
         return std::nullopt;
     } catch (const std::bad_alloc&) {
@@ -85,6 +87,15 @@ std::optional<FileProblem> Document::open(const std::wstring& path) noexcept {
 }
 
 std::optional<FileProblem> Document::save(const std::wstring& path) noexcept {
+    return write(path, path == path_ ? mark_ : std::nullopt);
+}
+
+std::optional<FileProblem> Document::saveOver(const std::wstring& path) noexcept {
+    return write(path, std::nullopt);
+}
+
+std::optional<FileProblem> Document::write(const std::wstring& path,
+                                           const std::optional<FileMark>& expected) noexcept {
     try {
         std::wstring ownPath = path;
         const std::string bytes = WriteCsv(sheet_, format_);
@@ -92,8 +103,9 @@ std::optional<FileProblem> Document::save(const std::wstring& path) noexcept {
             return FileProblem{L"Cannot write \"" + path +
                                L"\": the file would be larger than 64 MB, and could not be opened "
                                L"again."};
-        if (auto problem = ReplaceFileBytes(path, bytes)) return problem;
+        if (auto problem = ReplaceFileBytes(path, bytes, expected)) return problem;
         path_ = std::move(ownPath);
+        mark_ = MarkOf(bytes);
         history_.markSaved();
         return std::nullopt;
     } catch (const std::bad_alloc&) {

@@ -38,8 +38,12 @@ public:
 
     std::optional<FileProblem> open(const std::wstring& path) noexcept;
 
-    // Writes the file and makes `path` the document's own.
+    // Writes the file and makes `path` the document's own. When that is its own already and
+    // somebody else has changed or removed it since it was read or written, the problem tells so.
     std::optional<FileProblem> save(const std::wstring& path) noexcept;
+
+    // The same whatever is there: its user wants it replaced.
+    std::optional<FileProblem> saveOver(const std::wstring& path) noexcept;
 
     const std::wstring& path() const { return path_; }  // empty while unnamed
     std::wstring name() const;                          // without folders; "Untitled" while unnamed
@@ -75,12 +79,15 @@ public:
     std::optional<Block> redo() noexcept;
 
 private:
+    std::optional<FileProblem> write(const std::wstring& path,
+                                     const std::optional<FileMark>& expected) noexcept;
     EditResult apply(EditStep step);
     bool exchange(EditStep& step) noexcept;
 
     Sheet sheet_;
     CsvFormat format_;
     std::wstring path_;
+    std::optional<FileMark> mark_;  // what the file held when it was read or written
     int number_;
     EditHistory history_;
 };

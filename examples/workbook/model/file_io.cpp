@@ -1,17 +1,8 @@
-// The only file of the model that knows the operating system.
 #include "file_io.h"
 
 #include "last_words.h"
+#include "new_file.h"
 
-#ifndef WIN32_LEAN_AND_MEAN
-#define WIN32_LEAN_AND_MEAN
-#endif
-#ifndef NOMINMAX
-#define NOMINMAX
-#endif
-#include <windows.h>
-
-#include <algorithm>
 #include <new>
 
 namespace workbook {
@@ -19,27 +10,6 @@ namespace workbook {
 namespace {
 
 constexpr size_t kChunk = size_t{1} << 20;  // bytes per call to the system
-constexpr int kTemporaryNames = 100;
-
-class FileHandle {
-public:
-    explicit FileHandle(HANDLE handle) : handle_(handle) {}
-    ~FileHandle() { close(); }
-    FileHandle(const FileHandle&) = delete;
-    FileHandle& operator=(const FileHandle&) = delete;
-
-    bool isOpen() const { return handle_ != INVALID_HANDLE_VALUE; }
-    HANDLE get() const { return handle_; }
-    bool close() {
-        if (!isOpen()) return true;
-        const bool closed = CloseHandle(handle_) != 0;
-        handle_ = INVALID_HANDLE_VALUE;
-        return closed;
-    }
-
-private:
-    HANDLE handle_;
-};
 
 // The system's sentence for an error number, without the line break at its end.
 std::wstring SystemMessage(DWORD error) {
@@ -90,51 +60,94 @@ FileContents ReadUnguarded(const std::wstring& path, size_t largest) {
     }
 }
 
-// A new, empty file beside `path`. On failure the handle is INVALID_HANDLE_VALUE.
-HANDLE CreateTemporary(const std::wstring& path, std::wstring& temporaryPath) {
-    for (int attempt = 0; attempt < kTemporaryNames; ++attempt) {
-        temporaryPath = path + L"." + std::to_wstring(GetCurrentProcessId()) + L"-" +
-                        std::to_wstring(attempt) + L".tmp";
-        const HANDLE file = CreateFileW(temporaryPath.c_str(), GENERIC_WRITE, 0, nullptr,
-                                        CREATE_NEW, FILE_ATTRIBUTE_NORMAL, nullptr);
-        if (file != INVALID_HANDLE_VALUE || GetLastError() != ERROR_FILE_EXISTS) return file;
-    }
-    return INVALID_HANDLE_VALUE;
+// ---- Replacing ----
+
+FileHandle OpenForAll(const std::wstring& path, DWORD access) {
+    return FileHandle(CreateFileW(path.c_str(), access,
+                                  FILE_SHARE_READ | FILE_SHARE_WRITE | FILE_SHARE_DELETE, nullptr,
+                                  OPEN_EXISTING, FILE_ATTRIBUTE_NORMAL, nullptr));
 }
 
-bool WriteAll(HANDLE file, std::string_view bytes) {
-    while (!bytes.empty()) {
-        DWORD written = 0;
-        const auto wanted = static_cast<DWORD>(std::min(bytes.size(), kChunk));
-        if (!WriteFile(file, bytes.data(), wanted, &written, nullptr)) return false;
-        if (written == 0) {
-            SetLastError(ERROR_DISK_FULL);
-            return false;
-        }
-        bytes.remove_prefix(written);
+// Whose place is taken, and what it hands down.
+struct OldFile {
+    std::wstring place;                // behind links
+    std::optional<FileNature> nature;  // nothing: there is no file yet
+};
+
+//   result  the error number
+DWORD Examine(const std::wstring& path, OldFile& old) {
+    old.place = path;
+    // To write, too: a file that may not be written may not be replaced either.
+    const FileHandle file = OpenForAll(path, GENERIC_READ | FILE_WRITE_DATA);
+    if (!file.isOpen()) {
+        const DWORD error = GetLastError();
+        return error == ERROR_FILE_NOT_FOUND ? ERROR_SUCCESS : error;
     }
-    return FlushFileBuffers(file) != 0;
+    old.nature = NatureOf(file.get());
+    if (!old.nature) return GetLastError();
+    if ((old.nature->basic.FileAttributes & FILE_ATTRIBUTE_READONLY) != 0)
+        return ERROR_ACCESS_DENIED;
+    old.place = PlaceOf(file.get(), path);
+    return ERROR_SUCCESS;
 }
 
-std::optional<FileProblem> ReplaceUnguarded(const std::wstring& path, std::string_view bytes) {
-    // Renaming over a write-protected file fails on some systems only.
-    const DWORD attributes = GetFileAttributesW(path.c_str());
-    if (attributes != INVALID_FILE_ATTRIBUTES && (attributes & FILE_ATTRIBUTE_READONLY) != 0)
-        return CannotWrite(path, ERROR_ACCESS_DENIED);
+// Reads on while the file may still hold what is expected.
+//   result  the error number
+DWORD Compare(HANDLE file, const FileMark& expected, bool& isSame) {
+    FileMark mark;
+    std::string bytes(kChunk, '\0');
+    DWORD count = 1;
+    while (count > 0 && mark.length() <= expected.length()) {
+        if (!ReadFile(file, bytes.data(), kChunk, &count, nullptr)) return GetLastError();
+        mark.add(std::string_view(bytes).substr(0, count));
+    }
+    isSame = mark == expected;
+    return ERROR_SUCCESS;
+}
 
-    std::wstring temporaryPath;
-    FileHandle file(CreateTemporary(path, temporaryPath));
-    if (!file.isOpen()) return CannotWrite(path, GetLastError());
+FileProblem RemovedByOthers(const std::wstring& path) {
+    return {L"\"" + path +
+                L"\" is no longer there. Another program has deleted, moved or renamed it.",
+            FileProblemKind::RemovedByOthers};
+}
 
-    // Not short-circuited into one condition: the error number belongs to the step that failed.
-    DWORD error = WriteAll(file.get(), bytes) ? ERROR_SUCCESS : GetLastError();
-    if (!file.close() && error == ERROR_SUCCESS) error = GetLastError();
-    if (error == ERROR_SUCCESS && !MoveFileExW(temporaryPath.c_str(), path.c_str(),
-                                               MOVEFILE_REPLACE_EXISTING | MOVEFILE_WRITE_THROUGH))
-        error = GetLastError();
-    if (error == ERROR_SUCCESS) return std::nullopt;
-    DeleteFileW(temporaryPath.c_str());
-    return CannotWrite(path, error);
+FileProblem ChangedByOthers(const std::wstring& path) {
+    return {L"\"" + path +
+                L"\" has been changed by another program since it was opened or saved here.",
+            FileProblemKind::ChangedByOthers};
+}
+
+// Whether somebody else has been at the file. It is opened anew: many programs write a file by
+// putting another one in its place.
+std::optional<FileProblem> CheckOthers(const std::wstring& path, const FileMark& expected) {
+    const FileHandle file = OpenForAll(path, GENERIC_READ);
+    if (!file.isOpen()) {
+        const DWORD error = GetLastError();
+        if (error == ERROR_FILE_NOT_FOUND) return RemovedByOthers(path);
+        return CannotWrite(path, error);
+    }
+    bool isSame = false;
+    const DWORD error = Compare(file.get(), expected, isSame);
+    if (error != ERROR_SUCCESS) return CannotWrite(path, error);
+    if (!isSame) return ChangedByOthers(path);
+    return std::nullopt;
+}
+
+std::optional<FileProblem> ReplaceUnguarded(const std::wstring& path, std::string_view bytes,
+                                            const std::optional<FileMark>& expected) {
+    OldFile old;
+    const DWORD error = Examine(path, old);
+    if (error != ERROR_SUCCESS) return CannotWrite(path, error);
+
+    NewFile file;
+    if (!file.create(old.place, old.nature) || !file.write(bytes))
+        return CannotWrite(path, GetLastError());
+    // As late as possible: what others write from here on is lost.
+    if (expected) {
+        if (auto problem = CheckOthers(path, *expected)) return problem;
+    }
+    if (!file.moveTo(old.place)) return CannotWrite(path, GetLastError());
+    return std::nullopt;
 }
 
 }  // namespace
@@ -147,10 +160,10 @@ FileContents ReadWholeFile(const std::wstring& path, size_t largest) noexcept {
     }
 }
 
-std::optional<FileProblem> ReplaceFileBytes(const std::wstring& path,
-                                            std::string_view bytes) noexcept {
+std::optional<FileProblem> ReplaceFileBytes(const std::wstring& path, std::string_view bytes,
+                                            const std::optional<FileMark>& expected) noexcept {
     try {
-        return ReplaceUnguarded(path, bytes);
+        return ReplaceUnguarded(path, bytes, expected);
     } catch (const std::bad_alloc&) {
         return FileProblem{TextOrNothing(L"There is not enough memory to write the file.")};
     }

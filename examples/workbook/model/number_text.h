@@ -14,7 +14,8 @@ namespace workbook {
 std::optional<double> ReadNumber(std::wstring_view text);
 
 // As a cell shows it: at most 11 characters without the sign, and an exponent from 1E+11 upwards
-// and below 0.0001, then with 6 digits ("0.333333333", "12345678901", "1.23457E+11", "1E-05").
+// and below 0.0001, then with 6 digits ("0.333333333", "12345678901", "1.23457E+11", "1E-05"). An
+// exponent of three digits has a 12th character ("1.23457E-100").
 std::wstring DisplayNumber(double number);
 
 // As the joining operator writes it: up to 15 significant digits ("0.333333333333333").

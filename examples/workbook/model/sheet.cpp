@@ -51,7 +51,8 @@ void Sheet::setText(CellAddress cell, std::wstring text) {
 void Sheet::exchangeTexts(std::vector<CellText>& cells) {
     // Emptied cells go last: taking a page's last cell throws the page away, and another cell of
     // this exchange may count on its room.
-    std::ranges::partition(cells, [](const CellText& each) { return !each.text.empty(); });
+    std::partition(cells.begin(), cells.end(),
+                   [](const CellText& each) { return !each.text.empty(); });
 
     std::vector<Cell> contents;
     contents.reserve(cells.size());

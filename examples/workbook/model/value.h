@@ -49,8 +49,8 @@ struct Value {
 // "#DIV/0!" and its like.
 std::wstring_view ErrorName(ErrorCode error);
 
-// What a cell with this value shows: numbers in at most 11 characters (see DisplayNumber), TRUE or
-// FALSE, the error's name, a text as it is, and nothing for an empty one.
+// What a cell with this value shows: numbers as DisplayNumber writes them, TRUE or FALSE,
+// the error's name, a text as it is, and nothing for an empty one.
 std::wstring DisplayText(const ValueView& value);
 
 }  // namespace workbook

@@ -11,6 +11,8 @@ HMODULE FaultyModule() { return GetModuleHandleW(L"faulty_library.dll"); }
 
 class GuardHeapTest : public ::testing::Test {
 protected:
+    explicit GuardHeapTest(GuardedSide side = GuardedSide::End) : heap(spy, side) {}
+
     std::string kinds() const {
         std::string text;
         for (const HeapFault& fault : heap.faults()) {
@@ -21,7 +23,7 @@ protected:
     }
 
     ImportSpy spy{FaultyModule()};
-    GuardHeap heap{spy};
+    GuardHeap heap;
 };
 
 TEST_F(GuardHeapTest, LetsProperUsePass) {
@@ -30,6 +32,17 @@ TEST_F(GuardHeapTest, LetsProperUsePass) {
     FaultyRead(5000, 4999);
     EXPECT_EQ(heap.report(), "");
     EXPECT_EQ(heap.live(), 0);
+}
+
+TEST_F(GuardHeapTest, StartsOverOnlyWhenNothingLives) {
+    void* first = FaultyLeak(40);
+    EXPECT_FALSE(heap.startOver());
+    EXPECT_EQ(heap.live(), 1);
+    ReleaseLocal(first);
+    EXPECT_TRUE(heap.startOver());
+    FaultyWrite(48, 48);
+    ASSERT_EQ(kinds(), "overrun");
+    EXPECT_EQ(heap.faults()[0].block, 1) << "counted anew";
 }
 
 TEST_F(GuardHeapTest, SeesAWriteBehindABlock) {
@@ -99,6 +112,48 @@ TEST_F(GuardHeapTest, ServesTheMallocFamily) {
     EXPECT_EQ(spy.count("malloc"), 1);
     EXPECT_EQ(heap.report(), "");
     EXPECT_EQ(heap.live(), 0);
+}
+
+class GuardHeapAtTheBegin : public GuardHeapTest {
+protected:
+    GuardHeapAtTheBegin() : GuardHeapTest(GuardedSide::Begin) {}
+};
+
+TEST_F(GuardHeapAtTheBegin, LetsProperUsePass) {
+    FaultyWrite(40, 0);
+    FaultyWrite(40, 39);
+    FaultyRead(5000, 4999);
+    EXPECT_EQ(FaultyGrow(20, LMEM_MOVEABLE | LMEM_ZEROINIT), 55);
+    EXPECT_EQ(heap.report(), "");
+    EXPECT_EQ(heap.live(), 0);
+}
+
+TEST_F(GuardHeapAtTheBegin, SeesAReadBeforeABlock) {
+    FaultyRead(48, -1);
+    ASSERT_EQ(kinds(), "underrun");
+    EXPECT_EQ(heap.faults()[0].offset, -1);
+    EXPECT_EQ(heap.faults()[0].blockSize, 48u);
+    EXPECT_FALSE(heap.faults()[0].isWrite);
+}
+
+TEST_F(GuardHeapAtTheBegin, SeesAReadBeforeTheSecondBlock) {
+    void* first = FaultyLeak(4096);
+    FaultyRead(8192, -4096);
+    ASSERT_EQ(kinds(), "underrun");
+    EXPECT_EQ(heap.faults()[0].blockSize, 8192u);
+    ReleaseLocal(first);
+}
+
+TEST_F(GuardHeapAtTheBegin, SeesAWriteBehindABlockWhenItIsFreed) {
+    FaultyWrite(48, 48);
+    ASSERT_EQ(kinds(), "overrun, seen when freed");
+    EXPECT_EQ(heap.faults()[0].offset, 48);
+}
+
+TEST_F(GuardHeapAtTheBegin, SeesUseAfterFree) {
+    FaultyUseAfterFree();
+    ASSERT_EQ(kinds(), "use after free");
+    EXPECT_EQ(heap.faults()[0].offset, 12);
 }
 
 TEST_F(GuardHeapTest, FailsAnAllocationWhenTheSpySaysSo) {

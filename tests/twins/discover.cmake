@@ -1,12 +1,13 @@
-# Included by CTest in a folder's tests: adds tests of PROGRAM once more, as "device.<test>", run on
-# the device's image. Their names are NAMES, or come from the program beside the desktop's library
-# (LISTED); what runs is its twin beside the stand-in (TESTED).
+# Included by CTest in a folder's tests: adds tests of PROGRAM once more, as "KIND.<test>", run with
+# another library. Their names are NAMES, or come from the program beside the desktop's library
+# (LISTED); what runs is its twin beside the other one (TESTED), once the FIXTURE is there.
 #
 # Tests that do not apply say why and count as skipped: all of the program for its REASON, or those
 # in the file NOT_APPLICABLE, which has a test's name and a reason in each line.
-set(listing ${FOLDER}/${PROGRAM}.tests)
+set(listing ${LISTING})
 if(NOT EXISTS ${LISTED})
-  add_test(device.${PROGRAM}_NOT_BUILT ${PROGRAM}_NOT_BUILT)
+  add_test(${KIND}.${PROGRAM}_NOT_BUILT ${PROGRAM}_NOT_BUILT)
+  set_tests_properties(${KIND}.${PROGRAM}_NOT_BUILT PROPERTIES LABELS ${LABEL})
   return()
 endif()
 
@@ -38,7 +39,7 @@ endif()
 
 list(LENGTH tests count)
 if(REASON)
-  message("device skips the ${count} tests of ${PROGRAM}: ${REASON}")
+  message("${KIND} skips the ${count} tests of ${PROGRAM}: ${REASON}")
 endif()
 file(STRINGS ${NOT_APPLICABLE} exceptions REGEX "^[^#]")
 foreach(test IN LISTS tests)
@@ -47,17 +48,20 @@ foreach(test IN LISTS tests)
     string(FIND "${exception}" "${test} " place)
     if(place EQUAL 0)
       string(REPLACE "${test} " "" reason "${exception}")
-      message("device skips ${test}: ${reason}")
+      message("${KIND} skips ${test}: ${reason}")
     endif()
   endforeach()
   if(reason)
-    add_test(device.${test} ${CMAKE} -E echo "does not apply to the device: ${reason}")
-    set_tests_properties(device.${test} PROPERTIES
-      LABELS device SKIP_REGULAR_EXPRESSION "does not apply to the device")
+    add_test(${KIND}.${test} ${CMAKE} -E echo "does not apply to the ${LABEL}: ${reason}")
+    set_tests_properties(${KIND}.${test} PROPERTIES
+      LABELS ${LABEL} SKIP_REGULAR_EXPRESSION "does not apply to the ${LABEL}")
   else()
-    add_test(device.${test} ${EMULATOR} ${TESTED} --gtest_filter=${test})
-    set_tests_properties(device.${test} PROPERTIES
-      LABELS device TIMEOUT 900 FIXTURES_REQUIRED device_image
+    add_test(${KIND}.${test} ${EMULATOR} ${TESTED} --gtest_filter=${test})
+    set_tests_properties(${KIND}.${test} PROPERTIES
+      LABELS ${LABEL} TIMEOUT 900
       SKIP_REGULAR_EXPRESSION "\\[  SKIPPED \\]" FAIL_REGULAR_EXPRESSION "Running 0 tests")
+    if(FIXTURE)
+      set_tests_properties(${KIND}.${test} PROPERTIES FIXTURES_REQUIRED ${FIXTURE})
+    endif()
   endif()
 endforeach()

@@ -1,0 +1,48 @@
+# Twins of the desktop's tests: the same programs beside another korcontrols.dll.
+
+# korcontrols_place_beside(FOLDER TARGET): the target's file appears in the folder as well, without
+# taking place on the disk. The stamps of a folder are in its global property.
+function(korcontrols_place_beside folder target)
+  set(name $<TARGET_FILE_NAME:${target}>)
+  add_custom_command(OUTPUT ${folder}/${target}.stamp
+    COMMAND ${CMAKE_COMMAND} -E create_hardlink $<TARGET_FILE:${target}> ${folder}/${name}
+    COMMAND ${CMAKE_COMMAND} -E touch ${folder}/${target}.stamp
+    DEPENDS ${target} $<TARGET_FILE:${target}>
+    VERBATIM)
+  set_property(GLOBAL APPEND PROPERTY KORCONTROLS_BESIDE_${folder} ${folder}/${target}.stamp)
+endfunction()
+
+# korcontrols_place_programs(FOLDER): all that the tests run.
+function(korcontrols_place_programs folder)
+  get_property(programs GLOBAL PROPERTY KORCONTROLS_TEST_PROGRAMS)
+  foreach(program IN LISTS programs
+      ITEMS commdlg wingdi faulty_library guard_victim reload_host module_host clipboard_partner
+        workbook window_probe chart_viewer smallest_host function_bar printing_host)
+    if(TARGET ${program})
+      korcontrols_place_beside(${folder} ${program})
+    endif()
+  endforeach()
+endfunction()
+
+# korcontrols_add_twins(KIND LABEL FIXTURE PROGRAM TESTED REASON [TEST...]): the program's tests, or
+# these of them, once more as "KIND.<test>", by running TESTED. Where there is a REASON, they do not
+# apply. not_applicable.txt in the caller's folder names single ones that do not.
+function(korcontrols_add_twins kind label fixture program tested reason)
+  set(include ${CMAKE_CURRENT_BINARY_DIR}/${kind}.${program}.cmake)
+  file(GENERATE OUTPUT ${include} CONTENT
+"set(KIND ${kind})
+set(LABEL ${label})
+set(FIXTURE \"${fixture}\")
+set(PROGRAM ${program})
+set(REASON \"${reason}\")
+set(NAMES \"${ARGN}\")
+set(LISTING ${CMAKE_BINARY_DIR}/tests/${program}.tests)
+set(CMAKE ${CMAKE_COMMAND})
+set(EMULATOR ${CMAKE_CROSSCOMPILING_EMULATOR})
+set(LISTED $<TARGET_FILE:${program}>)
+set(TESTED ${tested})
+set(NOT_APPLICABLE ${CMAKE_CURRENT_SOURCE_DIR}/not_applicable.txt)
+include(${PROJECT_SOURCE_DIR}/tests/twins/discover.cmake)
+")
+  set_property(DIRECTORY APPEND PROPERTY TEST_INCLUDE_FILES ${include})
+endfunction()
