@@ -174,6 +174,8 @@ class Slot:
                 linked.add(linking)
             limit = HANG_FACTOR * unit.seconds + HANG_SECONDS
             outcome, _ = units.run(unit, folder, self.folder / "log", limit)
+            if outcome.kind == "hang":  # or this machine was halted for a while
+                outcome, _ = units.run(unit, folder, self.folder / "log", limit)
             if not outcome.passed and self.bench.is_steady(unit, self.folder / "log.whole"):
                 return Result(mutant, outcome.kind, unit.name, outcome.test, count, len(covering))
         return Result(mutant, "survived", ran=min(len(covering), self.bench.most), covering=len(covering))

@@ -23,6 +23,24 @@ TEST_F(GraphCategoryMessages, LabelTheXAxis) {
     EXPECT_TRUE(draws(L"Mar"));
 }
 
+// Of several that share the plot's last row each is drawn.
+TEST_F(GraphCategoryMessages, LabelTheLastRowOfABarChart) {
+    create();
+    add(std::vector<double>(1000, 1.0));
+    KorGraph_SetType(graph, KORGRAPH_BAR);
+    KorGraph_SetZoom(graph, KORGRAPH_ZOOM200);
+    std::vector<const wchar_t*> labels(1000, nullptr);
+    std::vector<int> drawn;
+    for (int number = 241; number <= 252; ++number) {
+        labels[static_cast<size_t>(number - 1)] = L"here";
+        categories(labels);
+        if (draws(L"here")) drawn.push_back(number);
+        labels[static_cast<size_t>(number - 1)] = nullptr;
+    }
+    // Nearly eight share a row; 250 lies on the edge of the plot, and 243 begins that row.
+    EXPECT_EQ(drawn, (std::vector<int>{243, 244, 245, 246, 247, 248, 249, 250, 251, 252}));
+}
+
 TEST_F(GraphCategoryMessages, AreCopies) {
     create();
     add({1, 2, 3});

@@ -31,7 +31,9 @@ TEST_F(GraphPalette, HasItsColours) {
 TEST_F(GraphPalette, Entry20BehindTheTableIsBlack) { EXPECT_EQ(kor::PaletteEntry(20), 0x000000u); }
 
 TEST_F(GraphPalette, HasNothingElse) {
-    for (const int index : {-1, 21, INT_MIN, INT_MAX}) EXPECT_EQ(kor::PaletteEntry(index), 0u);
+    for (int index = -40; index < 0; ++index) EXPECT_EQ(kor::PaletteEntry(index), 0u) << index;
+    for (int index = 21; index < 60; ++index) EXPECT_EQ(kor::PaletteEntry(index), 0u) << index;
+    for (const int index : {INT_MIN, INT_MAX}) EXPECT_EQ(kor::PaletteEntry(index), 0u);
 }
 
 TEST_F(GraphPalette, FirstSeriesIsGreen) { EXPECT_EQ(kor::ColourOfSeriesNumber(1), 0x00FF00u); }

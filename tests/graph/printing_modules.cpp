@@ -53,7 +53,8 @@ TEST_F(PrintModules, AreNotLookedForInAFolderThatIsNotKnown) {
     for (const ULONG_PTR length : {0, MAX_PATH, MAX_PATH - 3}) {
         spy.replace("GetModuleFileNameW", [length](ULONG_PTR* arguments) {
             auto* path = reinterpret_cast<wchar_t*>(arguments[1]);
-            std::fill_n(path, length, L'\\');
+            std::fill_n(path, length, L'x');
+            if (length > 0) path[length == MAX_PATH ? 2 : length - 1] = L'\\';
             return length;
         });
         createAnyhow();

@@ -42,6 +42,22 @@ TEST_F(HeaderCapture, LostEndsABorderDragWithTheSizeThatItReached) {
     EXPECT_EQ(SizesOf(header), (std::vector<int>{75, 60, 60}));
 }
 
+TEST_F(HeaderCapture, LostOrLetGoLeavesNothingForAnotherRelease) {
+    PressAt(header, 60, 5);
+    MoveTo(header, 75, 5);
+    ReleaseAt(header, 75, 5);
+    posted();
+    SetCapture(host->window());
+    ReleaseAt(header, 75, 5);
+    EXPECT_EQ(GetCapture(), host->window()) << "it is not the strip's any more";
+    PressAt(header, 75, 5);
+    SetCapture(host->window());
+    posted();
+    ReleaseAt(header, 75, 5);
+    EXPECT_EQ(GetCapture(), host->window());
+    EXPECT_EQ(posted(), Lines{});
+}
+
 TEST_F(HeaderCapture, IsLostToACancelledMode) {
     PressAt(header, 60, 5);
     SendMessageW(header, WM_CANCELMODE, 0, 0);
