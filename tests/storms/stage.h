@@ -61,6 +61,9 @@ public:
     void run(const Operation& operation);
     void setTrap(const Operation& operation);
 
+    // Traps at WM_ENTERIDLE in a host, which the system sends while a dialog is open.
+    void springIdle() { spring(Event::kHost, WM_ENTERIDLE, 0); }
+
     // Does something with all traps out of the way.
     template <typename Action>
     void runAlone(Action action) {
