@@ -18,6 +18,7 @@ namespace {
 
 constexpr int32_t kCallsOfAStep = 3000000;
 constexpr size_t kStepsBetweenPictures = 64;
+constexpr size_t kStepsBetweenChecksOfAll = 16;
 constexpr size_t kWarmUp = 400;  // operations before the balance is taken the first time
 
 struct Balance {
@@ -59,7 +60,9 @@ void RunSteps(Stage& stage, const Sequence& sequence, size_t first, size_t end) 
     for (size_t i = first; i < end; ++i) {
         progress.step = i;
         AllowImportCalls(kCallsOfAStep);
+        stage.forgetTouched();
         stage.run(sequence[i]);
+        if (i % kStepsBetweenChecksOfAll == 0) stage.touchAll();
         CheckStage(stage);
         CheckRecords(stage);
         if (i % kStepsBetweenPictures == kStepsBetweenPictures - 1) ComparePictures(stage);
