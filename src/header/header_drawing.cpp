@@ -108,7 +108,9 @@ void DrawHeaderItems(const HeaderRecord& header, const RECT& area) {
     LocalGdiObject<HFONT> font(
         CreateZoomedFont(static_cast<HFONT>(GetCurrentObject(header.dc, OBJ_FONT))));
     SelectScope pen(header.dc, headerPaint.framePen);
-    SelectScope brush(header.dc, GetStockObject(NULL_BRUSH));
+    // Items select brushes of their own: whatever fails, the DC's own is put back in the end.
+    const HGDIOBJ hollow = GetStockObject(NULL_BRUSH);
+    SelectScope brush(header.dc, hollow ? hollow : headerPaint.faceBrush);
     int start = 0;
     // The first item past the area is painted as well: the DC is not clipped to the area.
     bool past = false;

@@ -33,6 +33,26 @@ void ReleaseRecordDC(HeaderRecord& record) {
     record.dc = nullptr;
 }
 
+// A record in no list yet, or null when there is no memory.
+HeaderRecord* NewHeaderRecord(const CREATESTRUCTW& creation, HWND window) {
+    auto* record = AllocateLocal<HeaderRecord>(1);
+    if (!record) return nullptr;
+    record->window = window;
+    record->parent = creation.hwndParent;
+    record->style = static_cast<uint32_t>(creation.style);
+    record->capacity = kHeaderInitialCapacity;
+    record->dc = GetDC(window);
+    record->texts = AllocateLocal<wchar_t*>(kHeaderInitialCapacity + 1);
+    record->sizes = AllocateLocal<uint16_t>(kHeaderInitialCapacity + 1);
+    record->states = AllocateLocal<uint8_t>(kHeaderInitialCapacity + 1);
+    if (!record->texts || !record->sizes || !record->states) {
+        ReleaseRecordDC(*record);
+        FreeRecord(record);
+        return nullptr;
+    }
+    return record;
+}
+
 void Append(HeaderRecord* record) {
     HeaderRecord** link = &firstRecord;
     while (*link) link = &(*link)->next;
@@ -55,22 +75,12 @@ HeaderRecord* FindHeaderRecord(HWND window) {
 
 HeaderRecord* CreateHeaderRecord(const CREATESTRUCTW& creation, HWND window) {
     CreatePaintObjects();
-    auto* record = AllocateLocal<HeaderRecord>(1);
-    if (!record) return nullptr;
-    record->window = window;
-    record->parent = creation.hwndParent;
-    record->style = static_cast<uint32_t>(creation.style);
-    record->capacity = kHeaderInitialCapacity;
-    record->dc = GetDC(window);
-    record->texts = AllocateLocal<wchar_t*>(kHeaderInitialCapacity + 1);
-    record->sizes = AllocateLocal<uint16_t>(kHeaderInitialCapacity + 1);
-    record->states = AllocateLocal<uint8_t>(kHeaderInitialCapacity + 1);
-    if (!record->texts || !record->sizes || !record->states) {
-        ReleaseRecordDC(*record);
-        FreeRecord(record);
-        return nullptr;
+    HeaderRecord* record = NewHeaderRecord(creation, window);
+    if (record) {
+        Append(record);
+    } else if (!firstRecord) {
+        DeletePaintObjects();
     }
-    Append(record);
     return record;
 }
 

@@ -105,6 +105,7 @@ bool RegisterHeaderClass(HINSTANCE instance) {
     windowClass.hInstance = instance;
     windowClass.hbrBackground = static_cast<HBRUSH>(GetStockObject(LTGRAY_BRUSH));
     windowClass.lpszClassName = className;
+    if (!windowClass.hbrBackground) return false;  // the next grid tries again
     return RegisterClassW(&windowClass) != 0;
 }
 

@@ -101,7 +101,7 @@ void LiveHeader(Life& life) {
     RegisterStripClass(life);
     for (const bool isVertical : {false, true}) {
         const HWND strip = CreateControl(life, KORHEADER_CLASS, isVertical ? HCS_VERTICAL : 0,
-                                         isVertical ? 30 : 200, isVertical ? 120 : 16);
+                                         isVertical ? 30 : 60, isVertical ? 60 : 16);
         if (!strip) continue;
         UseStrip(life, strip, isVertical);
         DestroyWindow(strip);

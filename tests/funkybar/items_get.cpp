@@ -66,6 +66,8 @@ TEST_F(BarReading, OfATextThatFillsTheBufferLeavesNoTerminator) {
     EXPECT_EQ(raw(6), L"Hello#");
     get(FBIF_TEXT, 0, 3);
     EXPECT_EQ(raw(4), L"Hel#");
+    get(FBIF_TEXT, 0, 1);
+    EXPECT_EQ(raw(2), L"H#");
 }
 
 TEST_F(BarReading, WithoutCapacityCopiesNothing) {

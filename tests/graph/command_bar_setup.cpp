@@ -195,6 +195,18 @@ TEST_F(CommandBarSetup, EqualIdsDoNotMakeTheCombosOverlap) {
         EXPECT_EQ(places[i].left + places[i].right, gaps[i].left + gaps[i].right) << i;
 }
 
+// A host may keep a window of its own with a separator.
+TEST_F(CommandBarSetup, WindowsThatAreNotTheBarsStayWhereTheyAre) {
+    const HWND other = CreateWindowExW(0, L"STATIC", L"", WS_CHILD, 3, 4, 20, 20, host.window(),
+                                       nullptr, nullptr, nullptr);
+    TBBUTTON gap = {};
+    gap.iBitmap = 30;
+    gap.fsStyle = TBSTYLE_SEP;
+    gap.dwData = reinterpret_cast<DWORD_PTR>(other);
+    setUp({gap});
+    EXPECT_EQ(PlaceIn(host.window(), other), (RECT{3, 4, 23, 24}));
+}
+
 // ---- Failures ---------------------------------------------------------------------------------
 
 TEST_F(CommandBarSetup, ABarThatIsGoneGetsNothing) {

@@ -164,6 +164,10 @@ TEST_F(GraphCreation, WithoutAParentTheRecordStays) {
     resize(150, 90);
     tap(50, 50);
     redraw();
+    InvalidateRect(graph, nullptr, FALSE);
+    EXPECT_EQ(send(WM_PAINT), 0);
+    EXPECT_EQ(showLegend({10, 10, 60, 60}), nullptr);
+    EXPECT_EQ(notify(GN_PROPERTIES), 0) << "no sheet, which would wait for its user";
     DestroyWindow(graph);
 }
 

@@ -2,6 +2,9 @@
 // this picture or a later one.
 #include "graph/graph_fixture.h"
 
+#include <algorithm>
+#include <limits>
+
 namespace kortest {
 namespace {
 
@@ -55,6 +58,51 @@ INSTANTIATE_TEST_SUITE_P(
     [](const auto& tested) {
         return std::string(tested.param.function) + std::to_string(tested.param.nth);
     });
+
+// Of so many points that their circles are drawn together.
+class ManyMarkers : public GraphTest {
+protected:
+    ManyMarkers() { createPlain(); }
+
+    // The picture, and how many circles the platform drew.
+    Picture draw(const std::vector<double>& values) {
+        send(WM_NOTIFY, GN_CLEAR);
+        add(values);
+        spy.clearCalls();
+        redraw();
+        return image();
+    }
+
+    static std::vector<double> waves(size_t count) {
+        std::vector<double> values(count);
+        for (size_t i = 0; i < count; ++i) values[i] = static_cast<double>(i % 23);
+        return values;
+    }
+};
+
+TEST_F(ManyMarkers, LeaveOutColumnsWithoutANumber) {
+    spy.watchAll({"Ellipse", "CreateCompatibleBitmap"});
+    std::vector<double> values = waves(2000);
+    std::fill(values.begin() + 600, values.begin() + 1400,
+              std::numeric_limits<double>::quiet_NaN());
+    const Picture united = draw(values);
+    const int shape = spy.count("Ellipse");
+    EXPECT_LE(shape, 1) << "the shape of all";
+    spy.failAlways("CreateCompatibleBitmap");
+    redraw();
+    spy.stopFailing("CreateCompatibleBitmap");
+    EXPECT_TRUE(SamePicture(image(), united));
+}
+
+TEST_F(ManyMarkers, OnAPrinterAreThePlatformsOwn) {
+    spy.watchAll({"Ellipse", "GetDeviceCaps"});
+    spy.replace("GetDeviceCaps", [this](ULONG_PTR* arguments) {
+        if (static_cast<int>(arguments[1]) == TECHNOLOGY) return ULONG_PTR{DT_RASPRINTER};
+        return spy.callReal("GetDeviceCaps", arguments);
+    });
+    draw(waves(2000));
+    EXPECT_EQ(spy.count("Ellipse"), 2000);
+}
 
 }  // namespace
 }  // namespace kortest

@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include <climits>
 #include <iterator>
 
 namespace kortest {
@@ -28,6 +29,10 @@ TEST_F(GraphPalette, HasItsColours) {
 }
 
 TEST_F(GraphPalette, Entry20BehindTheTableIsBlack) { EXPECT_EQ(kor::PaletteEntry(20), 0x000000u); }
+
+TEST_F(GraphPalette, HasNothingElse) {
+    for (const int index : {-1, 21, INT_MIN, INT_MAX}) EXPECT_EQ(kor::PaletteEntry(index), 0u);
+}
 
 TEST_F(GraphPalette, FirstSeriesIsGreen) { EXPECT_EQ(kor::ColourOfSeriesNumber(1), 0x00FF00u); }
 

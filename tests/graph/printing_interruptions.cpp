@@ -126,6 +126,15 @@ TEST_P(PrintWithResize, OnThePageIsFollowed) {
     EXPECT_TRUE(SamePicture(image(), followed));
 }
 
+TEST_F(PrintInterruption, HeightAloneThatChangesOnThePageIsFollowed) {
+    createWithData();
+    const LONG width = record().rcPlot.right;
+    inside[kEndPage] = [this, width] { resize(width, 90); };
+    print();
+    EXPECT_EQ(record().rcPlot, (RECT{0, 0, width, 90}));
+    EXPECT_EQ(bitmapSize().cy, 92);
+}
+
 INSTANTIATE_TEST_SUITE_P(Painted, PrintWithResize, ::testing::Bool());
 
 // ---- The window goes --------------------------------------------------------------------------

@@ -1,11 +1,17 @@
 // The two modules that printing needs: when they are loaded, and what their absence means.
 #include "graph/printing_fixture.h"
 
+#include <algorithm>
+
 namespace kortest {
 namespace {
 
 class PrintModules : public PrintingTest {
 protected:
+    void createAnyhow() {
+        RegisterGraphClass();
+        createAnother();
+    }
     void createAnother() {
         CreateGraphWindow(host.window(), WS_CHILD, {0, 0, 50, 50}, GetModuleHandleW(nullptr));
     }
@@ -39,6 +45,21 @@ TEST_F(PrintModules, StayAfterTheLastChart) {
     destroy();
     EXPECT_EQ(spy.count("FreeLibrary"), 0);
     EXPECT_EQ(IsPrintingAvailableForGraphControl(), 1u);
+}
+
+// The folder of a program far down is cut off, and that of another module is not known.
+TEST_F(PrintModules, AreNotLookedForInAFolderThatIsNotKnown) {
+    spy.watch("GetModuleFileNameW", 3, CallingConvention::Stdcall);
+    for (const ULONG_PTR length : {0, MAX_PATH, MAX_PATH - 3}) {
+        spy.replace("GetModuleFileNameW", [length](ULONG_PTR* arguments) {
+            auto* path = reinterpret_cast<wchar_t*>(arguments[1]);
+            std::fill_n(path, length, L'\\');
+            return length;
+        });
+        createAnyhow();
+        EXPECT_EQ(transcript, Lines{}) << length;
+        EXPECT_EQ(IsPrintingAvailableForGraphControl(), 0u);
+    }
 }
 
 class MissingPrintModule : public PrintModules,

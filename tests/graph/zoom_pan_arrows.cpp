@@ -168,6 +168,20 @@ TEST_F(GraphPan, WithoutDataBeyondTheEdgeInvalidatesOnly) {
     EXPECT_TRUE(invalidations[0].erases);
 }
 
+TEST_F(GraphPan, UpAndDownWithoutDataBeyondTheEdgeInvalidateOnly) {
+    KorGraph_SetRange(graph, KORGRAPH_Y, -40, 40);
+    KorGraph_SetZoom(graph, KORGRAPH_ZOOM200);
+    // y 0 is in the middle; data lies between it and 10, the plot ends at -20 and 20
+    ASSERT_TRUE(isArrowAt(15, 9));
+    ASSERT_TRUE(isArrowAt(15, 121));
+    const Picture before = image();
+    watchInvalidations();
+    press(15, 8);
+    press(15, 122);
+    EXPECT_TRUE(SamePicture(before, image()));
+    EXPECT_EQ(invalidations.size(), 2u);
+}
+
 TEST_F(GraphPan, KeepsTheRange) {
     press(8, 115);
     press(15, 8);

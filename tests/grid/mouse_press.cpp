@@ -49,6 +49,12 @@ TEST_F(MousePress, HeaderAreaMeansTheFirstVisibleCells) {
     EXPECT_EQ(pressed(0, 0), "D8:D8");
 }
 
+TEST_F(MousePress, AboveTheWindowMeansTheFirstCell) {
+    SetFirstVisibleCell(KORGRID_CELL(3, 7));
+    EXPECT_EQ(pressed(middleX(2), -1), "A1:A1");
+    EXPECT_EQ(pressed(middleX(2), 0), "F8:F8");
+}
+
 // At the sheet's end the cells do not fill the view.
 TEST_F(MousePress, PastTheLastColumnOneMoreIsFoundAndThenTheFirst) {
     SetFirstVisibleCell(KORGRID_CELL(253, 0));

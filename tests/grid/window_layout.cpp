@@ -183,6 +183,14 @@ TEST_F(GridLayout, WidthZeroKeepsImageAndLayout) {
     EXPECT_EQ(VisibleRange(), expected.visibleRange());
 }
 
+TEST_F(GridLayout, WidthOneIsASizeLikeOthers) {
+    create(400, 300);
+    resize(1, 300);
+    EXPECT_EQ(host.transcript().size(), 1u);
+    ExpectLayout(grid, expected);
+    EXPECT_EQ(VisibleRange(), expected.visibleRange());
+}
+
 TEST_F(GridLayout, HeightZeroIsASizeLikeOthers) {
     create(400, 300);
     resize(400, 0);

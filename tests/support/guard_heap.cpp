@@ -102,6 +102,8 @@ std::vector<HeapFault> GuardHeap::faults() const {
 
 std::string GuardHeap::report() const { return FaultReport(faults()); }
 
+void GuardHeap::clearFaults() { Memory().faults.resize(faultsBefore_); }
+
 bool GuardHeap::startOver() {
     if (!Memory().blocks.startOver()) return false;
     blocksBefore_ = 0;

@@ -30,6 +30,7 @@ public:
 
     std::vector<HeapFault> faults() const;
     std::string report() const;  // one line per fault; empty when there is none
+    void clearFaults();          // once they are reported, or were made on purpose
 
     // Between two lives of a library that has freed everything: what one left behind is not seen in
     // the next any more, but the address space lasts for any number of them. False while a block

@@ -34,6 +34,17 @@ TEST_F(GuardHeapTest, LetsProperUsePass) {
     EXPECT_EQ(heap.live(), 0);
 }
 
+TEST_F(GuardHeapTest, StartsOverOnlyWhenNothingLives) {
+    void* first = FaultyLeak(40);
+    EXPECT_FALSE(heap.startOver());
+    EXPECT_EQ(heap.live(), 1);
+    ReleaseLocal(first);
+    EXPECT_TRUE(heap.startOver());
+    FaultyWrite(48, 48);
+    ASSERT_EQ(kinds(), "overrun");
+    EXPECT_EQ(heap.faults()[0].block, 1) << "counted anew";
+}
+
 TEST_F(GuardHeapTest, SeesAWriteBehindABlock) {
     FaultyWrite(48, 48);
     ASSERT_EQ(kinds(), "overrun");

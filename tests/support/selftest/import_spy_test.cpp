@@ -39,6 +39,36 @@ TEST_F(ImportSpyTest, RecordsNamesArgumentsAndResultsInOrder) {
     EXPECT_EQ(spy.sequence(), "");
 }
 
+TEST_F(ImportSpyTest, FailsFromTheNthCallOn) {
+    spy.watch("CreatePen");
+    int answered = 0;
+    const auto failure = [&](ULONG_PTR*) -> ULONG_PTR { return ++answered, 0; };
+    spy.failNth("CreatePen", 2, ImportSpy::Failing::kForEver, failure);
+    for (int i = 0; i < 4; ++i) FaultyHandles(0);
+    EXPECT_EQ(spy.sequence(), "CreatePen CreatePen! CreatePen! CreatePen!");
+    EXPECT_EQ(answered, 3);
+    spy.failNth("CreatePen", 1, ImportSpy::Failing::kOnce, failure);
+    spy.stopFailing("CreatePen");
+    spy.clearCalls();
+    FaultyHandles(0);
+    EXPECT_EQ(spy.sequence(), "CreatePen");
+}
+
+TEST_F(ImportSpyTest, TellsAnObserverAndKeepsNoCalls) {
+    spy.watchAll({"CreatePen", "GetDC"});
+    spy.keepCalls(false);
+    std::string seen;
+    spy.observe([&](const WatchedCall& call) {
+        EXPECT_EQ(call.index, spy.indexOf(call.name));
+        seen += call.name + (call.failed ? "! " : call.result ? " " : "0 ");
+    });
+    spy.failNth("GetDC", 1);
+    FaultyHandles(0);
+    EXPECT_EQ(seen, "CreatePen GetDC! ");
+    EXPECT_TRUE(spy.calls().empty());
+    EXPECT_EQ(spy.indexOf("BitBlt"), -1);
+}
+
 TEST_F(ImportSpyTest, HandsOnAllNineArguments) {
     spy.watch("BitBlt");
     std::vector<ULONG_PTR> seen;
