@@ -1,3 +1,4 @@
+#include "storms/dialogs.h"
 #include "storms/window_words.h"
 #include "storms/words.h"
 
@@ -187,6 +188,25 @@ void PressPoint(Stage& stage, const Arguments& a) {
     if (a[3]) stage.send(chart, WM_LBUTTONUP, 0, PairOf(x, y));
 }
 
+// One at a time: a second sheet, or a sheet in a printer's dialog, is a host's mistake.
+bool isDialogOpen = false;
+
+void Print(Stage& stage, const Arguments& a) {
+    HWND chart = Chart(stage, a[0]);
+    if (isDialogOpen) return;
+    isDialogOpen = true;
+    PrintChart(stage, chart, a[1] != 0);
+    isDialogOpen = false;
+}
+
+void Properties(Stage& stage, const Arguments& a) {
+    HWND chart = Chart(stage, a[0]);
+    if (isDialogOpen) return;
+    isDialogOpen = true;
+    UseProperties(stage, chart, TextOf(a[1]), a[2] != 0);
+    isDialogOpen = false;
+}
+
 constexpr Word kWords[] = {
     KORTEST_WINDOW_WORDS(kChart, "chart."),
     {"chart.add", 90, "svmi", Add},
@@ -210,6 +230,8 @@ constexpr Word kWords[] = {
     {"chart.nulls", 6, "s", Nulls},
     {"chart.odd_notice", 10, "snn", OddNotice},
     {"chart.copy", 3, "s", Copy},
+    {"chart.print", 6, "sb", Print},
+    {"chart.properties", 1, "stb", Properties},
     {"chart.legend", 20, "sxxzz", ShowLegend},
     {"chart.legend_scroll", 25, "soi", LegendScroll},
     {"chart.legend_paint", 20, "s", LegendPaint},

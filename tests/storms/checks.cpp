@@ -183,7 +183,8 @@ void CheckBar(HWND bar) {
 void CheckWindows(Stage& stage, Kind kind, void (*check)(HWND window)) {
     for (int place = 0; place < kPlaces; ++place) {
         HWND window = stage.window(kind, place);
-        if (window && stage.isLive(window) && !stage.isWithoutRecord(window)) check(window);
+        if (!stage.isTouched(kind, place) || !window || !stage.isLive(window)) continue;
+        if (!stage.isWithoutRecord(window)) check(window);
     }
 }
 

@@ -5,7 +5,8 @@
 
 namespace kortest {
 
-// By messages, exports, and the records that windows keep in their user data.
+// By messages, exports, and the records that windows keep in their user data. Of the strips, charts
+// and bars those that the step had to do with.
 void CheckStage(Stage& stage);
 
 // Inside a notification: it tells what the exports tell.

@@ -133,6 +133,7 @@ HWND Stage::anyParent(int number) {
 }
 
 HWND Stage::create(Kind kind, int place, int parentNumber, int width, int height, DWORD style) {
+    touched_ |= 1u << (kind * kPlaces + (place & 3));
     HWND& window = windows_[kind][place & 3];
     if (window && isLive(window)) DestroyWindow(window);
     HWND parentWindow = parent(parentNumber);
@@ -147,6 +148,7 @@ HWND Stage::create(Kind kind, int place, int parentNumber, int width, int height
 HWND Stage::ensure(Kind kind, int place) {
     // A second grid takes everything over from the first: few are made, see create.
     if (kind == kGrid && !isLive(windows_[kGrid][place & 3])) place = 0;
+    touched_ |= 1u << (kind * kPlaces + (place & 3));
     HWND window = windows_[kind][place & 3];
     if (window && isLive(window)) return window;
     return create(kind, place, place & 1, 60 + 30 * (place & 3), 70, UsualStyle(kind));

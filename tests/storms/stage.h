@@ -28,6 +28,11 @@ public:
     // ---- Windows -------------------------------------------------------------------------------
     // The window of a place; perhaps one that is gone, perhaps null.
     HWND window(Kind kind, int place) const { return windows_[kind][place & 3]; }
+    // Whether something was done to the place since the last call of forgetTouched.
+    bool isTouched(Kind kind, int place) const { return touched_ >> (kind * kPlaces + place) & 1; }
+    void forgetTouched() { touched_ = 0; }
+    void touchAll() { touched_ = ~0u; }
+
     bool isLive(HWND window) const { return live_.count(window) != 0; }
 
     // Destroys what is in the place, and creates a window there.
@@ -60,6 +65,9 @@ public:
     // ---- Running -------------------------------------------------------------------------------
     void run(const Operation& operation);
     void setTrap(const Operation& operation);
+
+    // Traps at WM_ENTERIDLE in a host, which the system sends while a dialog is open.
+    void springIdle() { spring(Event::kHost, WM_ENTERIDLE, 0); }
 
     // Does something with all traps out of the way.
     template <typename Action>
@@ -115,6 +123,7 @@ private:
     HWND* awaited_ = nullptr;  // the place whose window is being created
     Kind awaitedKind_ = kStrip;
     HWND currentGrid_ = nullptr;
+    uint32_t touched_ = 0;  // a bit for each place of each kind
     std::vector<Trap> traps_;
     int gridsInCreation_ = 0;
     bool isAnchored_ = false;  // a press in the grid has not been let go

@@ -1,6 +1,7 @@
 #include "storms/storm.h"
 
 #include "storms/checks.h"
+#include "storms/dialogs.h"
 #include "storms/failure.h"
 #include "storms/library.h"
 #include "storms/pictures.h"
@@ -17,6 +18,7 @@ namespace {
 
 constexpr int32_t kCallsOfAStep = 3000000;
 constexpr size_t kStepsBetweenPictures = 64;
+constexpr size_t kStepsBetweenChecksOfAll = 16;
 constexpr size_t kWarmUp = 400;  // operations before the balance is taken the first time
 
 struct Balance {
@@ -58,7 +60,9 @@ void RunSteps(Stage& stage, const Sequence& sequence, size_t first, size_t end) 
     for (size_t i = first; i < end; ++i) {
         progress.step = i;
         AllowImportCalls(kCallsOfAStep);
+        stage.forgetTouched();
         stage.run(sequence[i]);
+        if (i % kStepsBetweenChecksOfAll == 0) stage.touchAll();
         CheckStage(stage);
         CheckRecords(stage);
         if (i % kStepsBetweenPictures == kStepsBetweenPictures - 1) ComparePictures(stage);
@@ -92,6 +96,7 @@ bool RunStorm(const StormPlan& plan) {
     CountImportCalls();
 
     Stage stage;
+    ReplacePrinter(stage);
     // What the process keeps for ever is made in the first steps.
     const size_t warm = std::min(kWarmUp, sequence.size() / 2);
     RunSteps(stage, sequence, 0, warm);
@@ -100,10 +105,11 @@ bool RunStorm(const StormPlan& plan) {
     RunSteps(stage, sequence, warm, sequence.size());
     stage.clear();
     CompareBalance(stage, before);
-    std::printf("%s: seed %llu, %s heap, %u steps, %d pictures compared\n", plan.control.c_str(),
+    std::printf("%s: seed %llu, %s heap, %u steps, %d pictures compared, %d pages, %d sheets\n",
+                plan.control.c_str(),
                 static_cast<unsigned long long>(plan.seed), NameOf(plan.heap),
                 static_cast<unsigned>(sequence.size()),
-                ChartsCompared() + OtherPicturesCompared());
+                ChartsCompared() + OtherPicturesCompared(), PagesPrinted(), SheetsUsed());
     std::fflush(stdout);
     return true;
 }
