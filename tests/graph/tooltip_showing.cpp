@@ -1,6 +1,8 @@
 // The tooltip's size and place, showing and hiding.
 #include "graph/graph_fixture.h"
 
+#include <climits>
+
 namespace kortest {
 namespace {
 
@@ -59,6 +61,18 @@ TEST_F(ToolTip, MayStandOutsideItsParent) {
     EXPECT_EQ(place().bottom, 5);
     show(L"Value:12.5", 20, 50, -1000);
     EXPECT_EQ(place().right, -1001);
+}
+
+// The far ends of what a position can be: no sum of them may come out on the other side.
+TEST_F(ToolTip, StaysLeftOfTheLimitFromAnywhere) {
+    show(L"Value:12.5", LONG_MAX, 100, 240);
+    EXPECT_EQ(place().right, 239);
+    spy.watch("SetWindowPos");
+    show(L"Value:12.5", 0, LONG_MIN, LONG_MIN);
+    const auto calls = spy.callsOf("SetWindowPos");
+    ASSERT_EQ(calls.size(), 1u);
+    EXPECT_EQ(static_cast<LONG>(calls[0].arguments[2]), LONG_MIN);
+    EXPECT_EQ(static_cast<LONG>(calls[0].arguments[3]), LONG_MIN);
 }
 
 TEST_F(ToolTip, NullRequestDoesNothing) {

@@ -2,6 +2,8 @@
 
 #include <korcontrols/tooltip.h>
 
+#include <algorithm>
+
 #include "platform/gdi_scopes.h"
 #include "platform/local_text.h"
 #include "platform/records.h"
@@ -46,15 +48,22 @@ SIZE MeasureTip(HWND hwnd, const wchar_t* text) {
     return {measured.cx + 2 * kInset, measured.cy + 2 * kInset};
 }
 
+// What a request's numbers come to, within what a coordinate can be.
+int Coordinate(int64_t pixels) {
+    return static_cast<int>(std::clamp<int64_t>(pixels, INT32_MIN, INT32_MAX));
+}
+
 LRESULT OnShow(ToolTipRecord& tip, const ToolTipRequest* request) {
     if (!request || !request->text || !tip.text) return 0;
     TakeText(tip, request->text);
     const SIZE size = MeasureTip(tip.window, request->text);
     tip.frame = {0, 0, size.cx, size.cy};
-    const bool fits = request->x + size.cx <= request->limit;
-    const int left = fits ? request->x : request->limit - size.cx - 1;
+    const int64_t x = request->x;
+    const bool fits = x + size.cx <= request->limit;
+    const int64_t left = fits ? x : static_cast<int64_t>(request->limit) - size.cx - 1;
+    const int64_t top = static_cast<int64_t>(request->y) - size.cy;
     // To the top, or the chart would cover it.
-    SetWindowPos(tip.window, HWND_TOP, left, request->y - size.cy, size.cx, size.cy, 0);
+    SetWindowPos(tip.window, HWND_TOP, Coordinate(left), Coordinate(top), size.cx, size.cy, 0);
     ShowWindow(tip.window, SW_SHOW);
     return 0;
 }
