@@ -70,8 +70,9 @@ const Names kNotFor64Bits = {"FreeLibrary",
                              "sqrt",
                              "swprintf",
                              "wcstod"};
-const Names kNotForDevice = {"GdiFlush", "GetWindowLongPtrW", "SetWindowLongPtrW", "_snwprintf",
-                             "_wtof",    "lstrcmpiW"};
+const Names kNotForDevice = {"GdiFlush",          "GetModuleFileNameW", "GetWindowLongPtrW",
+                             "SetWindowLongPtrW", "_snwprintf",         "_wtof",
+                             "lstrcmpiW"};
 
 bool IsDevice() { return device::FindCounters() != nullptr; }
 
