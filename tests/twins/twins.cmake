@@ -16,7 +16,7 @@ endfunction()
 function(korcontrols_place_programs folder)
   get_property(programs GLOBAL PROPERTY KORCONTROLS_TEST_PROGRAMS)
   foreach(program IN LISTS programs
-      ITEMS commdlg wingdi faulty_library guard_victim reload_host module_host clipboard_partner
+      ITEMS commdlg wingdi faulty_library guard_victim reload_host module_host saving_loop clipboard_partner
         workbook window_probe chart_viewer smallest_host function_bar printing_host)
     if(TARGET ${program})
       korcontrols_place_beside(${folder} ${program})
