@@ -2,6 +2,7 @@
 room, no folder, a killed program."""
 
 import os
+import pathlib
 import random
 import resource
 import signal
@@ -160,8 +161,13 @@ def test_a_folder_that_has_gone_is_told_and_may_come_back(open_workbook, station
     assert names(folder) == ["stations.csv"]
 
 
+def name_of(process):
+    return pathlib.Path(f"/proc/{process.pid}/comm").read_text(encoding="utf-8").strip()
+
+
 def limit_files(workbook, size):
     """From now on no file of the program may grow beyond this: what a full disk looks like."""
+    assert name_of(workbook.process) == "workbook.exe"  # not a process that only started it
     hard = resource.prlimit(workbook.process.pid, resource.RLIMIT_FSIZE)[1]
     resource.prlimit(workbook.process.pid, resource.RLIMIT_FSIZE, (size, hard))
 
@@ -225,6 +231,7 @@ def test_a_killed_program_leaves_the_old_file_or_the_new_one(programs, tmp_path,
             stderr=subprocess.DEVNULL,
         )
         assert program.stdout.readline().strip() == b"saving"
+        assert name_of(program) == "saving_loop.exe"  # not a process that only started it
         time.sleep(chance.uniform(0, 0.2))
         program.send_signal(signal.SIGKILL)
         program.wait()
