@@ -13,14 +13,18 @@ namespace kor {
 
 namespace {
 
-// A strip gets so many items: new ones are appended empty, surplus ones taken away at the front.
-// All are labelled afterwards, so it does not matter which go.
-void SetItemCount(HWND header, int wanted, int defaultSize) {
+// A strip gets as many items as are visible: new ones are appended empty, surplus ones taken away at
+// the front. All are labelled afterwards, so it does not matter which go. A message to the strip may
+// lead to another update of it: that one is newer and complete, and this one ends.
+void SetItemCount(HWND header, const uint8_t& visibleCount, int defaultSize) {
+    const int wanted = visibleCount;
     const int count = KorHeader_GetItemCount(header);
     wchar_t empty[] = L"";
     const HeaderItemDesc item = {empty, static_cast<WORD>(defaultSize)};
-    for (int i = count; i < wanted; ++i) KorHeader_InsertItem(header, -1, &item);
-    for (int i = wanted; i < count; ++i) KorHeader_DeleteItem(header, 0);
+    for (int i = count; i < wanted && visibleCount == wanted; ++i) {
+        KorHeader_InsertItem(header, -1, &item);
+    }
+    for (int i = wanted; i < count && visibleCount == wanted; ++i) KorHeader_DeleteItem(header, 0);
 }
 
 void Repaint(HWND header) {
@@ -41,18 +45,20 @@ void FormatColumnName(int column, wchar_t (&name)[kColumnNameCapacity]) {
 LRESULT UpdateColumnHeader(int width) {
     const int count =
         CountVisible(ColumnAxis(), grid.firstVisibleColumn, kColumnLimit, width, zoomLevel);
-    SetItemCount(grid.hwndColumnHeader, count, PixelsFromUnits(kDefaultColumnWidth, zoomLevel));
     grid.visibleColumnCount = static_cast<uint8_t>(count);
     grid.maxVisibleColumnCount = std::max(grid.maxVisibleColumnCount, grid.visibleColumnCount);
+    SetItemCount(grid.hwndColumnHeader, grid.visibleColumnCount,
+                 PixelsFromUnits(kDefaultColumnWidth, zoomLevel));
     FillColumnHeader();
     return 1;
 }
 
 LRESULT UpdateRowHeader(int height) {
     const int count = CountVisible(RowAxis(), grid.firstVisibleRow, kRowLimit, height, zoomLevel);
-    SetItemCount(grid.hwndRowHeader, count, PixelsFromUnits(kDefaultRowHeight, zoomLevel));
     grid.visibleRowCount = static_cast<uint8_t>(count);
     grid.maxVisibleRowCount = std::max(grid.maxVisibleRowCount, grid.visibleRowCount);
+    SetItemCount(grid.hwndRowHeader, grid.visibleRowCount,
+                 PixelsFromUnits(kDefaultRowHeight, zoomLevel));
     FillRowHeader();
     return 1;
 }
