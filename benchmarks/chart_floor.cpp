@@ -3,7 +3,7 @@
 #include <cmath>
 #include <cstdlib>
 
-#include "graph/graph_disc.h"
+#include "graph/drawing/disc.h"
 
 namespace bench {
 

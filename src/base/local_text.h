@@ -1,8 +1,8 @@
 // Texts on the local heap.
 #pragma once
 
-#include "platform/local_heap.h"
-#include "platform/runtime.h"
+#include "base/local_heap.h"
+#include "base/runtime.h"
 
 namespace kor {
 

@@ -10,7 +10,7 @@ namespace kor {
 extern HINSTANCE moduleInstance;
 
 // What each platform's entry point calls with the system loader's event (DLL_PROCESS_ATTACH and its
-// like); defined in src/core. Always TRUE.
+// like); defined in src/library. Always TRUE.
 BOOL OnLibraryEvent(HINSTANCE instance, DWORD reason);
 
 }  // namespace kor

@@ -1,7 +1,7 @@
 // Records of windows: where they come from, and when they go.
 #pragma once
 
-#include "platform/assert.h"
+#include "base/assert.h"
 #include "platform/platform.h"
 
 #include <new>

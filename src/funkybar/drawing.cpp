@@ -1,9 +1,9 @@
-#include "funkybar/funkybar_drawing.h"
+#include "funkybar/drawing.h"
 
-#include "funkybar/funkybar_items.h"
-#include "funkybar/funkybar_layout.h"
-#include "platform/gdi_scopes.h"
-#include "platform/windows_helpers.h"
+#include "base/gdi_scopes.h"
+#include "base/windows_helpers.h"
+#include "funkybar/items.h"
+#include "funkybar/layout.h"
 
 namespace kor {
 

@@ -1,7 +1,7 @@
 // What the bar and its menu's entries look like.
 #pragma once
 
-#include "funkybar/funkybar_record.h"
+#include "funkybar/record.h"
 
 namespace kor {
 

@@ -1,6 +1,6 @@
-#include "funkybar/funkybar_items.h"
+#include "funkybar/items.h"
 
-#include "platform/local_text.h"
+#include "base/local_text.h"
 
 namespace kor {
 

@@ -2,7 +2,7 @@
 // window; whoever changes the list repaints.
 #pragma once
 
-#include "funkybar/funkybar_record.h"
+#include "funkybar/record.h"
 
 namespace kor {
 

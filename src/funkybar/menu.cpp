@@ -1,9 +1,9 @@
-#include "funkybar/funkybar_menu.h"
+#include "funkybar/menu.h"
 
-#include "funkybar/funkybar_drawing.h"
-#include "funkybar/funkybar_items.h"
-#include "funkybar/funkybar_layout.h"
-#include "funkybar/funkybar_selection.h"
+#include "funkybar/drawing.h"
+#include "funkybar/items.h"
+#include "funkybar/layout.h"
+#include "funkybar/selection.h"
 
 namespace kor {
 

@@ -1,6 +1,6 @@
-#include "funkybar/funkybar_selection.h"
+#include "funkybar/selection.h"
 
-#include "funkybar/funkybar_items.h"
+#include "funkybar/items.h"
 
 namespace kor {
 

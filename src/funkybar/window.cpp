@@ -2,13 +2,13 @@
 // adds nothing to it but the font and the arrow, which are there from WM_CREATE to WM_DESTROY.
 #include <korcontrols/funkybar.h>
 
-#include "funkybar/funkybar_drawing.h"
-#include "funkybar/funkybar_items.h"
-#include "funkybar/funkybar_layout.h"
-#include "funkybar/funkybar_menu.h"
-#include "funkybar/funkybar_selection.h"
-#include "platform/gdi_scopes.h"
-#include "platform/module.h"
+#include "base/gdi_scopes.h"
+#include "base/module.h"
+#include "funkybar/drawing.h"
+#include "funkybar/items.h"
+#include "funkybar/layout.h"
+#include "funkybar/menu.h"
+#include "funkybar/selection.h"
 
 namespace kor {
 

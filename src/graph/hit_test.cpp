@@ -1,15 +1,15 @@
-#include "graph/graph_hit_test.h"
+#include "graph/hit_test.h"
 
 #include <cmath>
 
-#include "graph/graph_bars.h"
-#include "graph/graph_numbers.h"
-#include "graph/graph_pie.h"
-#include "graph/graph_points.h"
-#include "graph/graph_scale.h"
-#include "graph/graph_series.h"
-#include "platform/assert.h"
-#include "platform/runtime.h"
+#include "base/assert.h"
+#include "base/runtime.h"
+#include "graph/data/series.h"
+#include "graph/drawing/bars.h"
+#include "graph/drawing/pie.h"
+#include "graph/drawing/points.h"
+#include "graph/scale/number_format.h"
+#include "graph/scale/scale.h"
 
 namespace kor {
 

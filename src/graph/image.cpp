@@ -1,14 +1,14 @@
-#include "graph/graph_image.h"
+#include "graph/image.h"
 
 #include <korcontrols/graph.h>
 
 #include <algorithm>
 
-#include "graph/graph_frame.h"
-#include "graph/graph_live.h"
-#include "graph/graph_redraw.h"
-#include "graph/graph_scale.h"
-#include "platform/gdi_scopes.h"
+#include "base/gdi_scopes.h"
+#include "graph/drawing/frame.h"
+#include "graph/drawing/redraw.h"
+#include "graph/live.h"
+#include "graph/scale/scale.h"
 
 namespace kor {
 

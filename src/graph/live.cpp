@@ -1,13 +1,13 @@
-#include "graph/graph_live.h"
+#include "graph/live.h"
 
 #include <algorithm>
 
-#include "graph/graph_frame.h"
-#include "graph/graph_numbers.h"
-#include "graph/graph_scale.h"
-#include "graph/graph_series.h"
-#include "platform/gdi_scopes.h"
-#include "platform/windows_helpers.h"
+#include "base/gdi_scopes.h"
+#include "base/windows_helpers.h"
+#include "graph/data/series.h"
+#include "graph/drawing/frame.h"
+#include "graph/scale/number_format.h"
+#include "graph/scale/scale.h"
 
 namespace kor {
 

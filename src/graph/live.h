@@ -3,7 +3,7 @@
 
 #include <korcontrols/graph.h>
 
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 namespace kor {
 

@@ -1,10 +1,10 @@
-#include "graph/graph_pointer.h"
+#include "graph/pointer.h"
 
 #include <korcontrols/tooltip.h>
 
-#include "graph/graph_hit_test.h"
-#include "graph/graph_redraw.h"
-#include "graph/graph_scale.h"
+#include "graph/drawing/redraw.h"
+#include "graph/hit_test.h"
+#include "graph/scale/scale.h"
 
 namespace kor {
 

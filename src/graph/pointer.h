@@ -1,7 +1,7 @@
 // A press on the chart: it shows the value under it, or pans by an arrow.
 #pragma once
 
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 namespace kor {
 

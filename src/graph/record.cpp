@@ -1,10 +1,10 @@
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 #include <korcontrols/graph.h>
 
-#include "graph/graph_palette.h"
-#include "graph/graph_series.h"
-#include "platform/local_text.h"
+#include "base/local_text.h"
+#include "graph/data/palette.h"
+#include "graph/data/series.h"
 
 namespace kor {
 

@@ -4,9 +4,9 @@
 // whose origin is the client area's; ends of data ranges are data values.
 #pragma once
 
+#include "base/records.h"
 #include "numbers/pixel_scale.h"
 #include "platform/platform.h"
-#include "platform/records.h"
 #include "text/number_run.h"
 
 namespace kor {

@@ -1,12 +1,12 @@
-#include "graph/graph_settings.h"
+#include "graph/settings.h"
 
 #include <utility>
 
-#include "graph/graph_choices.h"
-#include "graph/graph_layout.h"
-#include "graph/graph_redraw.h"
-#include "graph/graph_scale.h"
-#include "platform/local_text.h"
+#include "base/local_text.h"
+#include "graph/data/choices.h"
+#include "graph/drawing/layout.h"
+#include "graph/drawing/redraw.h"
+#include "graph/scale/scale.h"
 
 namespace kor {
 

@@ -1,7 +1,7 @@
 // What the host sets of a chart besides its data: titles, type, options, zoom, colour.
 #pragma once
 
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 namespace kor {
 

@@ -4,11 +4,11 @@
 
 #include <algorithm>
 
-#include "grid/grid_sizes.h"
-#include "grid/grid_state.h"
-#include "grid/grid_visible.h"
-#include "platform/gdi_scopes.h"
-#include "platform/windows_helpers.h"
+#include "base/gdi_scopes.h"
+#include "base/windows_helpers.h"
+#include "grid/sizes.h"
+#include "grid/state.h"
+#include "grid/visible.h"
 #include "text/text_run.h"
 #include "zoom/zoom.h"
 

@@ -1,10 +1,10 @@
-#include "grid/grid_drawing.h"
+#include "grid/drawing.h"
 
-#include "grid/grid_notify.h"
-#include "grid/grid_sizes.h"
-#include "grid/grid_visible.h"
-#include "platform/gdi_scopes.h"
-#include "platform/windows_helpers.h"
+#include "base/gdi_scopes.h"
+#include "base/windows_helpers.h"
+#include "grid/notify.h"
+#include "grid/sizes.h"
+#include "grid/visible.h"
 #include "zoom/zoom.h"
 
 namespace kor {

@@ -1,7 +1,7 @@
 // Drawing into the grid's off-screen image: the lines, the highlight and the redraw cycle.
 #pragma once
 
-#include "grid/grid_state.h"
+#include "grid/state.h"
 
 namespace kor {
 

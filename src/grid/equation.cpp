@@ -1,13 +1,13 @@
 // Whether there is something to commit is the edit's own modified flag. Leaving the edit commits,
 // so whoever moves the focus to the grid commits by that.
-#include "grid/grid_equation.h"
+#include "grid/equation.h"
 
-#include "grid/grid_keyboard.h"
-#include "grid/grid_layout.h"
-#include "grid/grid_notify.h"
-#include "grid/grid_selection.h"
-#include "platform/runtime.h"
-#include "platform/windows_helpers.h"
+#include "base/runtime.h"
+#include "base/windows_helpers.h"
+#include "grid/keyboard.h"
+#include "grid/layout.h"
+#include "grid/notify.h"
+#include "grid/selection.h"
 
 namespace kor {
 

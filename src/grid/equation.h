@@ -2,7 +2,7 @@
 // the parent and never reads it itself.
 #pragma once
 
-#include "grid/grid_state.h"
+#include "grid/state.h"
 
 namespace kor {
 

@@ -1,21 +1,21 @@
-#include "grid/grid_headers.h"
+#include "grid/headers.h"
 
 #include <korcontrols/header.h>
 
 #include <algorithm>
 
-#include "grid/grid_sizes.h"
-#include "platform/runtime.h"
-#include "platform/windows_helpers.h"
+#include "base/runtime.h"
+#include "base/windows_helpers.h"
+#include "grid/sizes.h"
 #include "zoom/zoom.h"
 
 namespace kor {
 
 namespace {
 
-// A strip gets as many items as are visible: new ones are appended empty, surplus ones taken away at
-// the front. All are labelled afterwards, so it does not matter which go. A message to the strip may
-// lead to another update of it: that one is newer and complete, and this one ends.
+// A strip gets as many items as are visible: new ones are appended empty, surplus ones taken away
+// at the front. All are labelled afterwards, so it does not matter which go. A message to the strip
+// may lead to another update of it: that one is newer and complete, and this one ends.
 void SetItemCount(HWND header, const uint8_t& visibleCount, int defaultSize) {
     const int wanted = visibleCount;
     const int count = KorHeader_GetItemCount(header);

@@ -1,10 +1,10 @@
-#include "grid/grid_keyboard.h"
+#include "grid/keyboard.h"
 
-#include "grid/grid_moves.h"
-#include "grid/grid_notify.h"
-#include "grid/grid_scrolling.h"
-#include "grid/grid_selection.h"
-#include "platform/windows_helpers.h"
+#include "base/windows_helpers.h"
+#include "grid/moves.h"
+#include "grid/notify.h"
+#include "grid/scrolling.h"
+#include "grid/selection.h"
 
 namespace kor {
 

@@ -1,7 +1,7 @@
 // The keyboard map of the grid's window.
 #pragma once
 
-#include "grid/grid_state.h"
+#include "grid/state.h"
 
 namespace kor {
 

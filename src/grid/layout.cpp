@@ -1,11 +1,11 @@
-#include "grid/grid_layout.h"
+#include "grid/layout.h"
 
 #include <algorithm>
 
-#include "grid/grid_drawing.h"
-#include "grid/grid_headers.h"
-#include "platform/gdi_scopes.h"
-#include "platform/windows_helpers.h"
+#include "base/gdi_scopes.h"
+#include "base/windows_helpers.h"
+#include "grid/drawing.h"
+#include "grid/headers.h"
 #include "zoom/zoom.h"
 
 namespace kor {

@@ -1,7 +1,7 @@
 // Where the grid's children stand, and laying them out again.
 #pragma once
 
-#include "grid/grid_state.h"
+#include "grid/state.h"
 
 namespace kor {
 

@@ -2,17 +2,17 @@
 // the release stops the timer and clears the anchor. The anchor alone says that moves extend the
 // block: after a release with Shift held, moves without a button go on extending. A host may take
 // the capture away at any time, with a message box for example; that ends a drag as well.
-#include "grid/grid_mouse.h"
+#include "grid/mouse.h"
 
 #include <algorithm>
 
-#include "grid/grid_drawing.h"
-#include "grid/grid_keyboard.h"
-#include "grid/grid_notify.h"
-#include "grid/grid_scrolling.h"
-#include "grid/grid_selection.h"
-#include "grid/grid_sizes.h"
-#include "platform/windows_helpers.h"
+#include "base/windows_helpers.h"
+#include "grid/drawing.h"
+#include "grid/keyboard.h"
+#include "grid/notify.h"
+#include "grid/scrolling.h"
+#include "grid/selection.h"
+#include "grid/sizes.h"
 
 namespace kor {
 

@@ -1,7 +1,7 @@
 // Numbers wrap round below 0, as 16-bit numbers do, and are invalid then.
-#include "grid/grid_moves.h"
+#include "grid/moves.h"
 
-#include "grid/grid_selection.h"
+#include "grid/selection.h"
 
 namespace kor {
 

@@ -4,7 +4,7 @@
 // each is a rule of its own.
 #pragma once
 
-#include "grid/grid_state.h"
+#include "grid/state.h"
 
 namespace kor {
 

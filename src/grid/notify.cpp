@@ -1,7 +1,7 @@
-#include "grid/grid_notify.h"
+#include "grid/notify.h"
 
-#include "grid/grid_visible.h"
-#include "platform/windows_helpers.h"
+#include "base/windows_helpers.h"
+#include "grid/visible.h"
 
 namespace kor {
 

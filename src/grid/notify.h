@@ -2,7 +2,7 @@
 // All are sent, and the parent may call back into the library before they return.
 #pragma once
 
-#include "grid/grid_state.h"
+#include "grid/state.h"
 
 namespace kor {
 

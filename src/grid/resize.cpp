@@ -1,13 +1,13 @@
 // While a border is dragged, an inverted line follows it. It is drawn on the window itself, so the
 // next copy from the image removes what is left of it.
-#include "grid/grid_resize.h"
+#include "grid/resize.h"
 
-#include "grid/grid_drawing.h"
-#include "grid/grid_headers.h"
-#include "grid/grid_notify.h"
-#include "grid/grid_sizes.h"
-#include "platform/gdi_scopes.h"
-#include "platform/windows_helpers.h"
+#include "base/gdi_scopes.h"
+#include "base/windows_helpers.h"
+#include "grid/drawing.h"
+#include "grid/headers.h"
+#include "grid/notify.h"
+#include "grid/sizes.h"
 #include "zoom/zoom.h"
 
 namespace kor {

@@ -1,7 +1,7 @@
 // What the grid does while and after a header border is dragged.
 #pragma once
 
-#include "grid/grid_state.h"
+#include "grid/state.h"
 
 namespace kor {
 

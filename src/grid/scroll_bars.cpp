@@ -1,9 +1,9 @@
-#include "grid/grid_scroll_bars.h"
+#include "grid/scroll_bars.h"
 
 #include <algorithm>
 
-#include "grid/grid_headers.h"
-#include "platform/windows_helpers.h"
+#include "base/windows_helpers.h"
+#include "grid/headers.h"
 
 namespace kor {
 

@@ -1,7 +1,7 @@
 // The two scroll bars: range, page and thumb follow the view and the host's data.
 #pragma once
 
-#include "grid/grid_state.h"
+#include "grid/state.h"
 
 namespace kor {
 

@@ -1,13 +1,13 @@
-#include "grid/grid_scrolling.h"
+#include "grid/scrolling.h"
 
 #include <algorithm>
 #include <optional>
 
-#include "grid/grid_drawing.h"
-#include "grid/grid_headers.h"
-#include "grid/grid_layout.h"
-#include "grid/grid_scroll_bars.h"
-#include "platform/windows_helpers.h"
+#include "base/windows_helpers.h"
+#include "grid/drawing.h"
+#include "grid/headers.h"
+#include "grid/layout.h"
+#include "grid/scroll_bars.h"
 
 namespace kor {
 

@@ -1,7 +1,7 @@
 // Scrolling by whole columns and rows.
 #pragma once
 
-#include "grid/grid_state.h"
+#include "grid/state.h"
 
 namespace kor {
 

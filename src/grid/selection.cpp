@@ -1,9 +1,9 @@
-#include "grid/grid_selection.h"
+#include "grid/selection.h"
 
 #include <algorithm>
 
-#include "grid/grid_drawing.h"
-#include "platform/windows_helpers.h"
+#include "base/windows_helpers.h"
+#include "grid/drawing.h"
 
 namespace kor {
 

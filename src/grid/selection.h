@@ -1,7 +1,7 @@
 // The selected block and its anchor.
 #pragma once
 
-#include "grid/grid_state.h"
+#include "grid/state.h"
 
 namespace kor {
 

@@ -1,11 +1,11 @@
-#include "grid/grid_sizes.h"
+#include "grid/sizes.h"
 
 #include <algorithm>
 
-#include "platform/assert.h"
-#include "platform/local_heap.h"
-#include "platform/runtime.h"
-#include "platform/windows_helpers.h"
+#include "base/assert.h"
+#include "base/local_heap.h"
+#include "base/runtime.h"
+#include "base/windows_helpers.h"
 #include "zoom/zoom.h"
 
 namespace kor {

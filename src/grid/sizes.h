@@ -1,7 +1,7 @@
 // The grid's own columns and rows: which sizes they have now, how those are kept and changed.
 #pragma once
 
-#include "grid/grid_state.h"
+#include "grid/state.h"
 
 namespace kor {
 

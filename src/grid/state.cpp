@@ -1,4 +1,4 @@
-#include "grid/grid_state.h"
+#include "grid/state.h"
 
 #include "zoom/zoom.h"
 

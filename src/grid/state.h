@@ -4,9 +4,9 @@
 
 #include <korcontrols/grid.h>
 
-#include "grid/grid_geometry.h"
+#include "base/records.h"
+#include "grid/geometry.h"
 #include "platform/platform.h"
-#include "platform/records.h"
 
 namespace kor {
 

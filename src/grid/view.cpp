@@ -1,9 +1,9 @@
 // The view's switches: zoom, headers and grid lines.
 #include <korcontrols/grid.h>
 
-#include "grid/grid_layout.h"
-#include "grid/grid_state.h"
-#include "platform/windows_helpers.h"
+#include "base/windows_helpers.h"
+#include "grid/layout.h"
+#include "grid/state.h"
 #include "zoom/zoom.h"
 
 using namespace kor;

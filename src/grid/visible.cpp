@@ -1,7 +1,7 @@
-#include "grid/grid_visible.h"
+#include "grid/visible.h"
 
-#include "grid/grid_sizes.h"
-#include "platform/windows_helpers.h"
+#include "base/windows_helpers.h"
+#include "grid/sizes.h"
 
 namespace kor {
 

@@ -1,7 +1,7 @@
 // Which cells are visible.
 #pragma once
 
-#include "grid/grid_state.h"
+#include "grid/state.h"
 
 namespace kor {
 

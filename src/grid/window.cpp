@@ -5,19 +5,19 @@
 
 #include <algorithm>
 
-#include "grid/grid_equation.h"
-#include "grid/grid_keyboard.h"
-#include "grid/grid_layout.h"
-#include "grid/grid_mouse.h"
-#include "grid/grid_resize.h"
-#include "grid/grid_scrolling.h"
-#include "grid/grid_selection.h"
-#include "grid/grid_sizes.h"
-#include "grid/grid_state.h"
-#include "header/header_window.h"
-#include "platform/gdi_scopes.h"
-#include "platform/runtime.h"
-#include "platform/windows_helpers.h"
+#include "base/gdi_scopes.h"
+#include "base/runtime.h"
+#include "base/windows_helpers.h"
+#include "grid/equation.h"
+#include "grid/keyboard.h"
+#include "grid/layout.h"
+#include "grid/mouse.h"
+#include "grid/resize.h"
+#include "grid/scrolling.h"
+#include "grid/selection.h"
+#include "grid/sizes.h"
+#include "grid/state.h"
+#include "header/window.h"
 
 namespace kor {
 

@@ -2,14 +2,14 @@
 // the capture, so moves and the release come to it; should another strip receive them all the same,
 // an item that it has not is ignored. A drag ends with the release, with the capture, which another
 // window may take, or with the strip.
-#include "header/header_drag.h"
+#include "header/drag.h"
 
 #include <korcontrols/header.h>
 
 #include <algorithm>
 
-#include "header/header_hit_test.h"
-#include "platform/windows_helpers.h"
+#include "base/windows_helpers.h"
+#include "header/hit_test.h"
 #include "zoom/zoom.h"
 
 namespace kor {

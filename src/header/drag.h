@@ -1,7 +1,7 @@
 // The pointer on a strip: pressing items, dragging borders, telling the parent.
 #pragma once
 
-#include "header/header_record.h"
+#include "header/record.h"
 
 namespace kor {
 

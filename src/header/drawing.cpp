@@ -1,10 +1,10 @@
 // Items are drawn as raised buttons with Rectangle calls, so that pen and brush decide each edge.
-#include "header/header_drawing.h"
+#include "header/drawing.h"
 
 #include <korcontrols/header.h>
 
-#include "platform/gdi_scopes.h"
-#include "platform/windows_helpers.h"
+#include "base/gdi_scopes.h"
+#include "base/windows_helpers.h"
 #include "text/text_run.h"
 #include "zoom/zoom.h"
 

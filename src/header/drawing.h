@@ -1,7 +1,7 @@
 // Painting a strip.
 #pragma once
 
-#include "header/header_record.h"
+#include "header/record.h"
 
 namespace kor {
 

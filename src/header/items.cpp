@@ -1,8 +1,8 @@
-#include "header/header_items.h"
+#include "header/items.h"
 
-#include "platform/assert.h"
-#include "platform/local_heap.h"
-#include "platform/runtime.h"
+#include "base/assert.h"
+#include "base/local_heap.h"
+#include "base/runtime.h"
 
 namespace kor {
 

@@ -3,7 +3,7 @@
 
 #include <korcontrols/header.h>
 
-#include "header/header_record.h"
+#include "header/record.h"
 
 namespace kor {
 

@@ -1,8 +1,8 @@
-#include "header/header_record.h"
+#include "header/record.h"
 
 #include <korcontrols/header.h>
 
-#include "platform/local_heap.h"
+#include "base/local_heap.h"
 
 namespace kor {
 

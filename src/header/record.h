@@ -2,8 +2,8 @@
 // strips share, since only one pointer can drag at a time.
 #pragma once
 
+#include "base/records.h"
 #include "platform/platform.h"
-#include "platform/records.h"
 
 namespace kor {
 

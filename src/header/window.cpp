@@ -1,15 +1,15 @@
 // The header strip: a window procedure over a record kept in a module-wide list. A strip whose
 // record could not be made still exists; it answers its messages with their failure results.
-#include "header/header_window.h"
+#include "header/window.h"
 
 #include <korcontrols/header.h>
 
-#include "header/header_drag.h"
-#include "header/header_drawing.h"
-#include "header/header_items.h"
-#include "header/header_record.h"
-#include "platform/gdi_scopes.h"
-#include "platform/windows_helpers.h"
+#include "base/gdi_scopes.h"
+#include "base/windows_helpers.h"
+#include "header/drag.h"
+#include "header/drawing.h"
+#include "header/items.h"
+#include "header/record.h"
 
 namespace kor {
 

@@ -1,7 +1,7 @@
 // What happens when a process attaches the library: state that follows from other state gets its
 // initial value, in a fixed order, before anything else can run. Nothing is left to do at detach.
-#include "grid/grid_state.h"
-#include "platform/module.h"
+#include "base/module.h"
+#include "grid/state.h"
 
 namespace kor {
 

@@ -1,7 +1,7 @@
 // The version export.
 #include <korcontrols/korcontrols.h>
 
-#include "platform/runtime.h"
+#include "base/runtime.h"
 
 namespace {
 

@@ -11,7 +11,8 @@ extern uint32_t zoomLevel;
 
 constexpr uint32_t kZoomWhole = 4;
 
-// From here on letters may be larger than a window. Nobody reads them, but it must not take seconds.
+// From here on letters may be larger than a window. Nobody reads them, but it must not take
+// seconds.
 constexpr uint32_t kZoomHuge = 100 * kZoomWhole;
 
 // Pixels of a size in units (pixels at 100 %); cut to 16 bits.

@@ -11,7 +11,7 @@
 
 namespace {
 
-#define REQUIRE(condition) \
+#define REQUIRE(condition)                                                                         \
     if (!(condition)) std::exit(__LINE__)
 
 using Register = DWORD (*)(HINSTANCE);
@@ -22,8 +22,8 @@ constexpr const wchar_t* kClasses[] = {KORGRID_CLASS,   KORHEADER_CLASS,  KORGRA
 const HINSTANCE program = GetModuleHandleW(nullptr);
 
 bool Call(HMODULE library, const char* name) {
-    return reinterpret_cast<Register>(
-               reinterpret_cast<void*>(GetProcAddress(library, name)))(program) != 0;
+    return reinterpret_cast<Register>(reinterpret_cast<void*>(GetProcAddress(library, name)))(
+               program) != 0;
 }
 
 HWND Create(const wchar_t* windowClass, HWND parent) {

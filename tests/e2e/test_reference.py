@@ -13,7 +13,7 @@ MESSAGE = r"(?:GRIDM|GRIDN|HCM|HCN|GM|GN|TIPM|FBM|FBN)_\w+"
 
 
 def exports():
-    lines = (ROOT / "src" / "korcontrols.def").read_text().splitlines()
+    lines = (ROOT / "src" / "library" / "korcontrols.def").read_text().splitlines()
     return {line.split()[0] for line in lines if re.match(r"\s+\w+\s+@\d+", line)}
 
 

@@ -2,7 +2,7 @@
 // all of them.
 #include "fuzz_input.h"
 
-#include "funkybar/funkybar_layout.h"
+#include "funkybar/layout.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
     using namespace korfuzz;

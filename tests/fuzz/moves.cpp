@@ -1,8 +1,8 @@
 // Keys on a selection: always a block of the sheet, but for the row past the last.
 #include "fuzz_input.h"
 
-#include "grid/grid_moves.h"
-#include "grid/grid_selection.h"
+#include "grid/moves.h"
+#include "grid/selection.h"
 
 namespace korfuzz {
 namespace {

@@ -2,8 +2,8 @@
 // all its points.
 #include "fuzz_chart.h"
 
-#include "graph/graph_numbers.h"
-#include "graph/graph_points.h"
+#include "graph/drawing/points.h"
+#include "graph/scale/number_format.h"
 
 #include <utility>
 

@@ -2,8 +2,8 @@
 // are numbers, few, and in view.
 #include "fuzz_chart.h"
 
-#include "graph/graph_numbers.h"
-#include "graph/graph_walks.h"
+#include "graph/scale/number_format.h"
+#include "graph/scale/walks.h"
 
 namespace korfuzz {
 namespace {

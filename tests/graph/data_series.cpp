@@ -1,7 +1,7 @@
 // Series and category labels: adding, removing, colours and names.
 #include "graph/number_graph.h"
 
-#include "graph/graph_palette.h"
+#include "graph/data/palette.h"
 
 #include <limits>
 

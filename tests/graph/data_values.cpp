@@ -1,7 +1,7 @@
 // Changing single values, and replacing a series' values.
 #include "graph/number_graph.h"
 
-#include "platform/local_text.h"
+#include "base/local_text.h"
 
 #include <limits>
 

@@ -1,5 +1,5 @@
 // Numbers as the chart writes them.
-#include "graph/graph_numbers.h"
+#include "graph/scale/number_format.h"
 
 #include <gtest/gtest.h>
 

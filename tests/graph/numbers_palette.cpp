@@ -1,5 +1,5 @@
 // The two colour tables and who takes which entry.
-#include "graph/graph_palette.h"
+#include "graph/data/palette.h"
 
 #include <gtest/gtest.h>
 

@@ -1,8 +1,8 @@
 // Points by the pixel that they share.
 #include "graph/number_graph.h"
 
-#include "graph/graph_points.h"
-#include "graph/graph_scale.h"
+#include "graph/drawing/points.h"
+#include "graph/scale/scale.h"
 
 #include <random>
 

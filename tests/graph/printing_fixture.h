@@ -7,7 +7,7 @@
 #pragma once
 
 #include "graph/graph_fixture.h"
-#include "graph/graph_record.h"
+#include "graph/record.h"
 #include "platform/print_dialog.h"
 
 #include <optional>

@@ -1,5 +1,5 @@
 // Which multiples of a step an axis shows.
-#include "graph/graph_ticks.h"
+#include "graph/scale/ticks.h"
 
 #include <gtest/gtest.h>
 

@@ -5,19 +5,19 @@ set(KORCONTROLS_ROOT ${CMAKE_CURRENT_LIST_DIR}/../..)
 function(korcontrols_arithmetic name)
   set(src ${KORCONTROLS_ROOT}/src)
   add_library(${name} STATIC
-    ${src}/graph/graph_disc.cpp
-    ${src}/graph/graph_hit_test.cpp
-    ${src}/graph/graph_numbers.cpp
-    ${src}/graph/graph_palette.cpp
-    ${src}/graph/graph_pie.cpp
-    ${src}/graph/graph_points.cpp
-    ${src}/graph/graph_record.cpp
-    ${src}/graph/graph_scale.cpp
-    ${src}/graph/graph_series.cpp
-    ${src}/graph/graph_ticks.cpp
-    ${src}/grid/grid_geometry.cpp
-    ${src}/grid/grid_moves.cpp
-    ${src}/header/header_hit_test.cpp
+    ${src}/graph/drawing/disc.cpp
+    ${src}/graph/hit_test.cpp
+    ${src}/graph/scale/number_format.cpp
+    ${src}/graph/data/palette.cpp
+    ${src}/graph/drawing/pie.cpp
+    ${src}/graph/drawing/points.cpp
+    ${src}/graph/record.cpp
+    ${src}/graph/scale/scale.cpp
+    ${src}/graph/data/series.cpp
+    ${src}/graph/scale/ticks.cpp
+    ${src}/grid/geometry.cpp
+    ${src}/grid/moves.cpp
+    ${src}/header/hit_test.cpp
     ${src}/numbers/pixel_scale.cpp
     ${src}/platform/desktop/number_text.cpp
     ${src}/zoom/zoom.cpp

@@ -1,5 +1,5 @@
 // Drawing that stands in one file with what reckons, and that nothing here may reach.
-#include "graph/graph_frame.h"
+#include "graph/drawing/frame.h"
 
 namespace kor {
 

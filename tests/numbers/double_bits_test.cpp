@@ -1,7 +1,7 @@
 // Arithmetic by bits against the same in floating point.
 #include "numbers/double_bits.h"
 
-#include "graph/graph_numbers.h"
+#include "graph/scale/number_format.h"
 #include "numbers/special_doubles.h"
 
 #include <gtest/gtest.h>

@@ -1,5 +1,5 @@
 // The rules of the arrow and page keys, none of which mirrors another.
-#include "grid/grid_moves.h"
+#include "grid/moves.h"
 
 #include <gtest/gtest.h>
 

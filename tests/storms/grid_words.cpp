@@ -32,7 +32,9 @@ void Columns(Stage&, const Arguments& a) { SetHorizontalDataRange(a[0]); }
 void Rows(Stage&, const Arguments& a) { SetVerticalDataRange(a[0]); }
 void Reset(Stage&, const Arguments&) { ResetGrid(); }
 void Commit(Stage&, const Arguments&) { PressOKButton(); }
-void FunctionId(Stage&, const Arguments& a) { SetFunctionButtonMessageID(static_cast<DWORD>(a[0])); }
+void FunctionId(Stage&, const Arguments& a) {
+    SetFunctionButtonMessageID(static_cast<DWORD>(a[0]));
+}
 
 void Select(Stage&, const Arguments& a) {
     SetSelectedRanged(KORGRID_PAIR(a[0], WrappedSum(a[0], a[2])),

@@ -1,14 +1,14 @@
-#include "graph/graph_legend.h"
+#include "graph/children/show_legend.h"
 
 #include <korcontrols/legend.h>
 
 #include <cmath>
 
+#include "base/gdi_scopes.h"
+#include "base/module.h"
+#include "base/windows_helpers.h"
 #include "graph/children/legend.h"
-#include "graph/graph_numbers.h"
-#include "platform/gdi_scopes.h"
-#include "platform/module.h"
-#include "platform/windows_helpers.h"
+#include "graph/scale/number_format.h"
 
 namespace kor {
 

@@ -1,7 +1,7 @@
 // The chart's side of its legend.
 #pragma once
 
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 namespace kor {
 

@@ -1,8 +1,8 @@
-#include "graph/graph_entries.h"
+#include "graph/data/entries.h"
 
-#include "graph/graph_palette.h"
-#include "graph/graph_record.h"
-#include "graph/graph_series.h"
+#include "graph/data/palette.h"
+#include "graph/data/series.h"
+#include "graph/record.h"
 
 namespace kor {
 

@@ -1,8 +1,8 @@
 // What the legend may know of a chart: its entries, the series or, in a pie, the slices.
 #pragma once
 
+#include "base/runtime.h"
 #include "platform/platform.h"
-#include "platform/runtime.h"
 
 namespace kor {
 

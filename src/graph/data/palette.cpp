@@ -1,4 +1,4 @@
-#include "graph/graph_palette.h"
+#include "graph/data/palette.h"
 
 #include <iterator>
 

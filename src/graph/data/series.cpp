@@ -1,13 +1,13 @@
-#include "graph/graph_series.h"
+#include "graph/data/series.h"
 
 #include <algorithm>
 #include <cmath>
 
-#include "graph/graph_numbers.h"
-#include "graph/graph_palette.h"
-#include "graph/graph_scale.h"
-#include "platform/local_text.h"
-#include "platform/records.h"
+#include "base/local_text.h"
+#include "base/records.h"
+#include "graph/data/palette.h"
+#include "graph/scale/number_format.h"
+#include "graph/scale/scale.h"
 
 namespace kor {
 

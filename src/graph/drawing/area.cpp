@@ -2,7 +2,7 @@
 // column in view is filled on its own. That gives the same pixels, as the outline is drawn over the
 // fill: it covers each pixel whose centre is nearer than half a pixel to an edge, and the others
 // lie inside or outside by any rule of rounding.
-#include "graph/graph_area.h"
+#include "graph/drawing/area.h"
 
 #include <algorithm>
 

@@ -1,7 +1,7 @@
 // The polygon between a series and its zero line.
 #pragma once
 
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 namespace kor {
 

@@ -1,15 +1,15 @@
 // A column is a polygon from the zero line to its value; a bar is the same turned a quarter. Where
 // they have become so thin that several share a pixel, a line from the lowest end to the highest
 // has the pixels of them all.
-#include "graph/graph_bars.h"
+#include "graph/drawing/bars.h"
 
 #include <algorithm>
 
-#include "graph/graph_frame.h"
-#include "graph/graph_numbers.h"
-#include "graph/graph_points.h"
-#include "graph/graph_scale.h"
-#include "platform/gdi_scopes.h"
+#include "base/gdi_scopes.h"
+#include "graph/drawing/frame.h"
+#include "graph/drawing/points.h"
+#include "graph/scale/number_format.h"
+#include "graph/scale/scale.h"
 
 namespace kor {
 

@@ -1,7 +1,7 @@
 // Column and bar charts.
 #pragma once
 
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 namespace kor {
 

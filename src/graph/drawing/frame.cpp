@@ -1,11 +1,11 @@
-#include "graph/graph_frame.h"
+#include "graph/drawing/frame.h"
 
 #include <korcontrols/graph.h>
 
 #include <algorithm>
 
-#include "graph/graph_walks.h"
-#include "platform/gdi_scopes.h"
+#include "base/gdi_scopes.h"
+#include "graph/scale/walks.h"
 
 namespace kor {
 

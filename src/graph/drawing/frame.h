@@ -3,7 +3,7 @@
 // selected.
 #pragma once
 
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 namespace kor {
 

@@ -3,10 +3,10 @@
 
 #include <algorithm>
 
-#include "graph/graph_frame.h"
-#include "graph/graph_numbers.h"
-#include "graph/graph_walks.h"
-#include "platform/gdi_scopes.h"
+#include "base/gdi_scopes.h"
+#include "graph/drawing/frame.h"
+#include "graph/scale/number_format.h"
+#include "graph/scale/walks.h"
 #include "text/text_run.h"
 
 namespace kor {

@@ -1,13 +1,13 @@
-#include "graph/graph_layout.h"
+#include "graph/drawing/layout.h"
 
 #include <korcontrols/graph.h>
 
 #include <algorithm>
 #include <cmath>
 
-#include "graph/graph_numbers.h"
-#include "platform/gdi_scopes.h"
-#include "platform/runtime.h"
+#include "base/gdi_scopes.h"
+#include "base/runtime.h"
+#include "graph/scale/number_format.h"
 #include "text/text_run.h"
 
 namespace kor {

@@ -1,7 +1,7 @@
 // Fonts and margins: how much room titles and labels take around the plot area.
 #pragma once
 
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 namespace kor {
 

@@ -1,10 +1,10 @@
-#include "graph/graph_lines.h"
+#include "graph/drawing/lines.h"
 
-#include "graph/graph_area.h"
-#include "graph/graph_frame.h"
-#include "graph/graph_points.h"
-#include "graph/graph_scale.h"
-#include "platform/gdi_scopes.h"
+#include "base/gdi_scopes.h"
+#include "graph/drawing/area.h"
+#include "graph/drawing/frame.h"
+#include "graph/drawing/points.h"
+#include "graph/scale/scale.h"
 
 namespace kor {
 

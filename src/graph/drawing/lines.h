@@ -1,7 +1,7 @@
 // Line and area charts, and the markers of a line.
 #pragma once
 
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 namespace kor {
 

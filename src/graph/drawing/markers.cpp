@@ -3,15 +3,15 @@
 #include <algorithm>
 #include <iterator>
 
-#include "graph/graph_frame.h"
-#include "graph/graph_lines.h"
-#include "graph/graph_numbers.h"
-#include "graph/graph_points.h"
-#include "graph/graph_scale.h"
-#include "platform/assert.h"
-#include "platform/gdi_scopes.h"
-#include "platform/local_text.h"
-#include "platform/runtime.h"
+#include "base/assert.h"
+#include "base/gdi_scopes.h"
+#include "base/local_text.h"
+#include "base/runtime.h"
+#include "graph/drawing/frame.h"
+#include "graph/drawing/lines.h"
+#include "graph/drawing/points.h"
+#include "graph/scale/number_format.h"
+#include "graph/scale/scale.h"
 
 namespace kor {
 

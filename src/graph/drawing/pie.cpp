@@ -1,4 +1,4 @@
-#include "graph/graph_pie.h"
+#include "graph/drawing/pie.h"
 
 #include <korcontrols/graph.h>
 
@@ -6,14 +6,14 @@
 #include <cmath>
 #include <iterator>
 
-#include "graph/graph_frame.h"
-#include "graph/graph_numbers.h"
-#include "graph/graph_palette.h"
-#include "graph/graph_series.h"
-#include "graph/graph_slice_walk.h"
-#include "platform/assert.h"
-#include "platform/gdi_scopes.h"
-#include "platform/local_text.h"
+#include "base/assert.h"
+#include "base/gdi_scopes.h"
+#include "base/local_text.h"
+#include "graph/data/palette.h"
+#include "graph/data/series.h"
+#include "graph/drawing/frame.h"
+#include "graph/drawing/slice_walk.h"
+#include "graph/scale/number_format.h"
 
 namespace kor {
 

@@ -1,7 +1,7 @@
 // The pie: its layout, which the hit test shares, and its drawing.
 #pragma once
 
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 namespace kor {
 

@@ -1,11 +1,11 @@
-#include "graph/graph_points.h"
+#include "graph/drawing/points.h"
 
 #include <algorithm>
 
-#include "graph/graph_numbers.h"
-#include "graph/graph_scale.h"
-#include "platform/assert.h"
-#include "platform/local_text.h"
+#include "base/assert.h"
+#include "base/local_text.h"
+#include "graph/scale/number_format.h"
+#include "graph/scale/scale.h"
 
 namespace kor {
 

@@ -3,7 +3,7 @@
 // highest and the last. Values that are no numbers, or infinite, have no point. No DC.
 #pragma once
 
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 namespace kor {
 

@@ -1,8 +1,8 @@
-#include "graph/graph_redraw.h"
+#include "graph/drawing/redraw.h"
 
-#include "graph/graph_bars.h"
-#include "graph/graph_lines.h"
-#include "graph/graph_pie.h"
+#include "graph/drawing/bars.h"
+#include "graph/drawing/lines.h"
+#include "graph/drawing/pie.h"
 
 namespace kor {
 

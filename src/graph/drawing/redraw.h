@@ -1,7 +1,7 @@
 // Drawing the whole chart into its off-screen image.
 #pragma once
 
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 namespace kor {
 

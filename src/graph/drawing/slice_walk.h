@@ -3,7 +3,7 @@
 
 #include <algorithm>
 
-#include "graph/graph_disc.h"
+#include "graph/drawing/disc.h"
 
 namespace kor {
 

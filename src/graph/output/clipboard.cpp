@@ -1,12 +1,12 @@
-#include "graph/graph_clipboard.h"
+#include "graph/output/clipboard.h"
 
-#include "graph/graph_image.h"
-#include "graph/graph_palette.h"
+#include "base/gdi_scopes.h"
+#include "base/local_heap.h"
+#include "base/runtime.h"
+#include "base/windows_helpers.h"
+#include "graph/data/palette.h"
+#include "graph/image.h"
 #include "platform/clipboard.h"
-#include "platform/gdi_scopes.h"
-#include "platform/local_heap.h"
-#include "platform/runtime.h"
-#include "platform/windows_helpers.h"
 
 namespace kor {
 

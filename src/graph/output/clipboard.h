@@ -1,7 +1,7 @@
 // The chart's image for other programs.
 #pragma once
 
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 namespace kor {
 

@@ -2,15 +2,15 @@
 // rcPlot are the printer's, and fonts, margins and scaling follow from them. Meanwhile the window
 // procedure keeps all messages away from the record; a paint and a new size are made up for after
 // it.
-#include "graph/printing.h"
+#include "graph/output/printing.h"
 
-#include "graph/graph_frame.h"
-#include "graph/graph_image.h"
-#include "graph/graph_layout.h"
-#include "graph/graph_redraw.h"
-#include "graph/graph_scale.h"
-#include "graph/printing_calls.h"
-#include "platform/windows_helpers.h"
+#include "base/windows_helpers.h"
+#include "graph/drawing/frame.h"
+#include "graph/drawing/layout.h"
+#include "graph/drawing/redraw.h"
+#include "graph/image.h"
+#include "graph/output/printing_calls.h"
+#include "graph/scale/scale.h"
 
 namespace kor {
 

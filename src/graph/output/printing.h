@@ -1,7 +1,7 @@
 // A chart on paper.
 #pragma once
 
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 namespace kor {
 

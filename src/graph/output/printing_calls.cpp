@@ -1,4 +1,4 @@
-#include "graph/printing_calls.h"
+#include "graph/output/printing_calls.h"
 
 #include <korcontrols/graph.h>
 

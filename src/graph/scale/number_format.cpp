@@ -1,6 +1,6 @@
-#include "graph/graph_numbers.h"
+#include "graph/scale/number_format.h"
 
-#include "platform/runtime.h"
+#include "base/runtime.h"
 
 namespace kor {
 

@@ -1,4 +1,4 @@
-#include "graph/graph_scale.h"
+#include "graph/scale/scale.h"
 
 #include <korcontrols/graph.h>
 
@@ -6,7 +6,7 @@
 #include <cmath>
 #include <limits>
 
-#include "graph/graph_numbers.h"
+#include "graph/scale/number_format.h"
 
 namespace kor {
 

@@ -2,7 +2,7 @@
 // zoom.
 #pragma once
 
-#include "graph/graph_record.h"
+#include "graph/record.h"
 
 namespace kor {
 

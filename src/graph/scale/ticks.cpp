@@ -1,9 +1,9 @@
-#include "graph/graph_ticks.h"
+#include "graph/scale/ticks.h"
 
 #include <algorithm>
 #include <cmath>
 
-#include "graph/graph_numbers.h"
+#include "graph/scale/number_format.h"
 
 namespace kor {
 

@@ -1,9 +1,9 @@
 // The multiples of a tick step along each axis of a chart, with their pixels.
 #pragma once
 
-#include "graph/graph_record.h"
-#include "graph/graph_scale.h"
-#include "graph/graph_ticks.h"
+#include "graph/record.h"
+#include "graph/scale/scale.h"
+#include "graph/scale/ticks.h"
 
 namespace kor {
 

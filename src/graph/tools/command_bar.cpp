@@ -1,10 +1,10 @@
-#include "graph/graph_command_bar.h"
+#include "graph/tools/command_bar.h"
 
 #include <korcontrols/graph.h>
 
-#include "graph/graph_choices.h"
+#include "base/module.h"
+#include "graph/data/choices.h"
 #include "platform/command_bar.h"
-#include "platform/module.h"
 
 namespace kor {
 

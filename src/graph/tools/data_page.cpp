@@ -1,9 +1,9 @@
 // The page of the shown ranges, the chart type and the zoom.
 #include <korcontrols/graph.h>
 
-#include "graph/graph_choices.h"
-#include "graph/graph_numbers.h"
-#include "graph/graph_pages.h"
+#include "graph/data/choices.h"
+#include "graph/scale/number_format.h"
+#include "graph/tools/pages.h"
 
 namespace kor {
 

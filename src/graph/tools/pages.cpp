@@ -1,4 +1,4 @@
-#include "graph/graph_pages.h"
+#include "graph/tools/pages.h"
 
 #include <korcontrols/graph.h>
 
@@ -6,10 +6,10 @@
 
 #include <prsht.h>
 
-#include "graph/graph_choices.h"
+#include "base/module.h"
+#include "base/records.h"
+#include "graph/data/choices.h"
 #include "platform/input_panel.h"
-#include "platform/module.h"
-#include "platform/records.h"
 
 namespace kor {
 

@@ -1,8 +1,8 @@
 // The page of the chart's and the axes' titles.
 #include <korcontrols/graph.h>
 
-#include "graph/graph_pages.h"
-#include "platform/gdi_scopes.h"
+#include "base/gdi_scopes.h"
+#include "graph/tools/pages.h"
 
 namespace kor {
 

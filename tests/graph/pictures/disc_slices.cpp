@@ -1,7 +1,7 @@
 // The pixels of a pie's slices, by number alone.
-#include "graph/graph_disc.h"
+#include "graph/drawing/disc.h"
 
-#include "graph/graph_pie.h"
+#include "graph/drawing/pie.h"
 
 #include <gtest/gtest.h>
 
