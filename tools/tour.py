@@ -11,7 +11,7 @@ import sys
 
 sys.dont_write_bytecode = True
 ROOT = pathlib.Path(__file__).resolve().parents[1]
-sys.path.insert(0, str(ROOT / "tests" / "e2e"))
+sys.path.insert(0, str(ROOT / "tools" / "desktop"))
 
 from desktop import OUT_OF_THE_WAY, Desktop, wait_until  # noqa: E402
 from probe import Probe  # noqa: E402

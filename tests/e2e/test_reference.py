@@ -8,7 +8,7 @@ import pytest
 from desktop import ROOT
 
 HEADERS = sorted((ROOT / "include" / "korcontrols").glob("*.h"))
-WORKBOOK = ROOT / "examples" / "workbook"
+WORKBOOK = ROOT / "apps" / "workbook"
 MESSAGE = r"(?:GRIDM|GRIDN|HCM|HCN|GM|GN|TIPM|FBM|FBN)_\w+"
 
 

@@ -1,7 +1,7 @@
 #include "storms/pictures.h"
 
 #include "graph/pictures/chart_pair.h"
-#include "graph/pictures/literal_chart.h"
+#include "literal_chart/literal_chart.h"
 #include "graph/record.h"
 #include "storms/failure.h"
 #include "storms/stage.h"

@@ -1,4 +1,4 @@
-#include "graph/pictures/chart_state.h"
+#include "literal_chart/chart_state.h"
 
 #include <algorithm>
 #include <cmath>

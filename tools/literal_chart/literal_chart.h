@@ -2,7 +2,7 @@
 // every marker its own Ellipse, every column its own polygon, every tick a step away from 0.
 #pragma once
 
-#include "graph/pictures/chart_state.h"
+#include "literal_chart/chart_state.h"
 
 #include <functional>
 

@@ -1,6 +1,6 @@
 // The pie is the one picture whose filling leaves the pixels along a boundary open: here a pixel
 // has the colour of the slice that holds its own angle.
-#include "graph/pictures/literal_chart.h"
+#include "literal_chart/literal_chart.h"
 
 #include <algorithm>
 #include <cmath>

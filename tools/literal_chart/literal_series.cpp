@@ -1,4 +1,4 @@
-#include "graph/pictures/literal_chart.h"
+#include "literal_chart/literal_chart.h"
 
 #include <algorithm>
 #include <cmath>
