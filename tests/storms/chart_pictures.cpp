@@ -1,8 +1,8 @@
 #include "storms/pictures.h"
 
 #include "graph/pictures/chart_pair.h"
-#include "literal_chart/literal_chart.h"
 #include "graph/record.h"
+#include "literal_chart/literal_chart.h"
 #include "storms/failure.h"
 #include "storms/stage.h"
 

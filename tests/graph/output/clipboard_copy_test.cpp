@@ -1,5 +1,5 @@
 // GM_COPY: the bytes on the clipboard.
-#include "graph/clipboard_fixture.h"
+#include "graph/output/clipboard_fixture.h"
 
 namespace kortest {
 namespace {

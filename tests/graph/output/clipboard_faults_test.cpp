@@ -1,5 +1,5 @@
 // GM_COPY when something fails, and what it gives back.
-#include "graph/clipboard_fixture.h"
+#include "graph/output/clipboard_fixture.h"
 
 namespace kortest {
 namespace {

@@ -1,4 +1,4 @@
-#include "graph/clipboard_fixture.h"
+#include "graph/output/clipboard_fixture.h"
 
 #include <cstdio>
 #include <cstring>

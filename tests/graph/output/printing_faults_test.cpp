@@ -1,5 +1,5 @@
 // Prints in which the platform's calls fail one by one, and many prints in a row.
-#include "graph/printing_fixture.h"
+#include "graph/output/printing_fixture.h"
 
 namespace kortest {
 namespace {

@@ -1,4 +1,4 @@
-#include "graph/printing_fixture.h"
+#include "graph/output/printing_fixture.h"
 
 #include <cstring>
 

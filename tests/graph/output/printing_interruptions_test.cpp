@@ -1,5 +1,5 @@
 // A print lets other messages through: in its dialog, and where a printer driver waits.
-#include "graph/printing_fixture.h"
+#include "graph/output/printing_fixture.h"
 
 namespace kortest {
 namespace {

@@ -1,5 +1,5 @@
 // The two modules that printing needs: when they are loaded, and what their absence means.
-#include "graph/printing_fixture.h"
+#include "graph/output/printing_fixture.h"
 
 #include <algorithm>
 

@@ -1,5 +1,5 @@
 // What is on the page.
-#include "graph/printing_fixture.h"
+#include "graph/output/printing_fixture.h"
 
 namespace kortest {
 namespace {

@@ -1,5 +1,5 @@
 // Which functions a print calls, in which order and with what.
-#include "graph/printing_fixture.h"
+#include "graph/output/printing_fixture.h"
 
 #include <cstring>
 

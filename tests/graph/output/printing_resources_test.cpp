@@ -1,5 +1,5 @@
 // The dialog that hosts may show while a chart is printed.
-#include "graph/dialog_template.h"
+#include "graph/tools/dialog_template.h"
 #include "support/import_spy.h"
 
 #include <gtest/gtest.h>

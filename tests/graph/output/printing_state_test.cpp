@@ -1,5 +1,5 @@
 // After a print the chart is as it was: its record field by field, its image, its redraws.
-#include "graph/printing_fixture.h"
+#include "graph/output/printing_fixture.h"
 
 #include <cstring>
 

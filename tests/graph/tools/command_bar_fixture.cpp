@@ -1,4 +1,4 @@
-#include "graph/command_bar_fixture.h"
+#include "graph/tools/command_bar_fixture.h"
 
 namespace kortest {
 namespace {

@@ -1,7 +1,7 @@
 // What SetupGraphCommandBar puts into a bar.
-#include "graph/command_bar_fixture.h"
+#include "graph/tools/command_bar_fixture.h"
 
-#include "graph/sheet_driver.h"
+#include "graph/tools/sheet_driver.h"
 
 namespace kortest {
 namespace {

@@ -1,6 +1,6 @@
 // The tooltip texts: what the bar is handed, who may be sent the message, how the first text
 // follows the chart.
-#include "graph/command_bar_fixture.h"
+#include "graph/tools/command_bar_fixture.h"
 
 namespace kortest {
 namespace {

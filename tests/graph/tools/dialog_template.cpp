@@ -1,4 +1,4 @@
-#include "graph/dialog_template.h"
+#include "graph/tools/dialog_template.h"
 
 #include "support/message_text.h"
 

@@ -1,5 +1,5 @@
 // The page of ranges, type and zoom.
-#include "graph/properties_fixture.h"
+#include "graph/tools/properties_fixture.h"
 
 #include <commctrl.h>
 #include <prsht.h>

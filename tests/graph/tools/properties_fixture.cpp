@@ -1,4 +1,4 @@
-#include "graph/properties_fixture.h"
+#include "graph/tools/properties_fixture.h"
 
 #include <cstdio>
 

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "graph/graph_fixture.h"
-#include "graph/sheet_driver.h"
+#include "graph/tools/sheet_driver.h"
 
 namespace kortest {
 

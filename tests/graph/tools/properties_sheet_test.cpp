@@ -1,6 +1,6 @@
 // The property sheet as a whole: its resources, its place, its failures.
-#include "graph/dialog_template.h"
-#include "graph/properties_fixture.h"
+#include "graph/tools/dialog_template.h"
+#include "graph/tools/properties_fixture.h"
 
 #include <commctrl.h>
 #include <prsht.h>

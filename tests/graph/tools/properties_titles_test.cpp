@@ -1,5 +1,5 @@
 // The page of titles: what it shows, and what OK sends.
-#include "graph/properties_fixture.h"
+#include "graph/tools/properties_fixture.h"
 
 namespace kortest {
 namespace {

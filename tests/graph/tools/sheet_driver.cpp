@@ -1,4 +1,4 @@
-#include "graph/sheet_driver.h"
+#include "graph/tools/sheet_driver.h"
 
 #include "support/input.h"
 
