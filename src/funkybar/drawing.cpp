@@ -36,7 +36,7 @@ private:
 };
 
 // Empty for an item without an image, without an image list, and for a bad index into the list.
-SIZE ImageSize(const FunkyBarItem& item) {
+Size ImageSize(const FunkyBarItem& item) {
     if (!HasField(item, FBIF_IMAGE) || !funkyBar.itemImages) return {};
     IMAGEINFO info = {};
     if (!ImageList_GetImageInfo(funkyBar.itemImages, item.image, &info)) return {};
@@ -55,30 +55,30 @@ void SetItemColours(HDC dc, const FunkyBarItem& item) {
 }
 
 // In the font that is selected.
-SIZE TextSize(HDC dc, const FunkyBarItem& item) {
+Size TextSize(HDC dc, const FunkyBarItem& item) {
     SIZE size = {};
     const auto length = static_cast<int>(item.textBytes / sizeof(wchar_t)) - 1;
     GetTextExtentExPointW(dc, item.text, length, 0, nullptr, nullptr, &size);
-    return size;
+    return {size.cx, size.cy};
 }
 
-void DrawArrow(HDC dc, POINT place) {
+void DrawArrow(HDC dc, Point place) {
     if (!funkyBar.arrowImages) return;
     ImageList_Draw(funkyBar.arrowImages, 0, dc, place.x, place.y, ILD_TRANSPARENT);
 }
 
 void DrawCurrentItem(HDC dc, const RECT& client, const FunkyBarItem& item) {
     SelectScope font(dc, funkyBar.font);
-    const SIZE image = ImageSize(item);
-    DrawImage(item, dc, kBarLeft, BarImageTop(client.bottom, image.cy), ILD_TRANSPARENT);
-    const int left = BarTextLeft(HasField(item, FBIF_IMAGE), image.cx);
+    const Size image = ImageSize(item);
+    DrawImage(item, dc, kBarLeft, BarImageTop(client.bottom, image.height), ILD_TRANSPARENT);
+    const int left = BarTextLeft(HasField(item, FBIF_IMAGE), image.width);
     {
         ColourScope colours(dc);
         SetItemColours(dc, item);
         RECT text = {left, client.top, client.right, client.bottom};
         DrawTextW(dc, item.text, -1, &text, DT_VCENTER);
     }
-    DrawArrow(dc, ArrowPlace(left, TextSize(dc, item).cx, client.bottom));
+    DrawArrow(dc, ArrowPlace(left, TextSize(dc, item).width, client.bottom));
 }
 
 }  // namespace
@@ -91,7 +91,7 @@ void PaintBar(HWND hwnd) {
     if (funkyBar.current) DrawCurrentItem(paint.dc(), client, *funkyBar.current);
 }
 
-SIZE MeasureEntry(HWND hwnd, const FunkyBarItem& item) {
+Size MeasureEntry(HWND hwnd, const FunkyBarItem& item) {
     WindowDC dc(hwnd);
     return EntrySize(TextSize(dc.get(), item), ImageSize(item));
 }
@@ -106,7 +106,7 @@ void DrawEntry(HDC dc, const RECT& area, const FunkyBarItem* item, bool selected
     DrawImage(*item, dc, area.left + kEntryImageInset, area.top + kEntryImageInset, ILD_NORMAL);
     SetItemColours(dc, *item);
     RECT text = area;
-    text.left = EntryTextLeft(area.left, ImageSize(*item).cx);
+    text.left = EntryTextLeft(area.left, ImageSize(*item).width);
     DrawTextW(dc, item->text, -1, &text, DT_VCENTER);
 }
 

@@ -1,7 +1,7 @@
 // Where the parts of the bar and of a menu entry stand: numbers only, in pixels.
 #pragma once
 
-#include "platform/platform.h"
+#include "numbers/shapes.h"
 
 namespace kor {
 
@@ -21,7 +21,7 @@ constexpr int BarTextLeft(bool hasImage, int imageWidth) {
     return hasImage ? kBarLeft + imageWidth + kBarImageGap : kBarLeft;
 }
 
-constexpr POINT ArrowPlace(int textLeft, int textWidth, int clientBottom) {
+constexpr Point ArrowPlace(int textLeft, int textWidth, int clientBottom) {
     return {textLeft + textWidth + kArrowGap, clientBottom - kArrowAboveBottom};
 }
 
@@ -46,12 +46,12 @@ constexpr int EntryTextLeft(int entryLeft, int imageWidth) {
 
 // Of the image and the gaps beside it; a text taller than its image makes the entry as high as
 // itself.
-constexpr SIZE EntrySize(SIZE text, SIZE image) {
-    return {text.cx + image.cx + kEntryImageInset + kEntryImageGap,
-            text.cy > image.cy ? text.cy : image.cy + kEntryImageInset};
+constexpr Size EntrySize(Size text, Size image) {
+    return {text.width + image.width + kEntryImageInset + kEntryImageGap,
+            text.height > image.height ? text.height : image.height + kEntryImageInset};
 }
 
-static_assert(EntrySize({50, 15}, {16, 14}).cx == 72 && EntrySize({50, 15}, {16, 14}).cy == 15);
-static_assert(EntrySize({50, 15}, {16, 15}).cy == 17);
+static_assert(EntrySize({50, 15}, {16, 14}).width == 72 && EntrySize({50, 15}, {16, 14}).height == 15);
+static_assert(EntrySize({50, 15}, {16, 15}).height == 17);
 
 }  // namespace kor

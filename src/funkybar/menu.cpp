@@ -48,9 +48,9 @@ LRESULT OpenItemMenu(HWND hwnd) {
 LRESULT OnMeasureEntry(HWND hwnd, MEASUREITEMSTRUCT* entry) {
     if (!entry) return 0;
     const FunkyBarItem* item = ItemOfEntry(entry->itemData);
-    const SIZE size = item ? MeasureEntry(hwnd, *item) : SIZE{};
-    entry->itemWidth = static_cast<UINT>(size.cx);
-    entry->itemHeight = static_cast<UINT>(size.cy);
+    const Size size = item ? MeasureEntry(hwnd, *item) : Size{};
+    entry->itemWidth = static_cast<UINT>(size.width);
+    entry->itemHeight = static_cast<UINT>(size.height);
     return 1;
 }
 

@@ -10,6 +10,7 @@
 #include "grid/state.h"
 #include "grid/visible.h"
 #include "text/text_run.h"
+#include "text/zoomed_font.h"
 #include "zoom/zoom.h"
 
 namespace kor {

@@ -4,6 +4,7 @@
 #include "base/windows_helpers.h"
 #include "grid/notify.h"
 #include "grid/sizes.h"
+#include "grid/state.h"
 #include "grid/visible.h"
 #include "zoom/zoom.h"
 
@@ -69,7 +70,7 @@ void DrawGridLines(HDC dc, HPEN pen, const RECT& area) {
     DrawHorizontalLines(dc, area);
 }
 
-void InvertBlock(const GridSelection& block, Invalidate invalidate) {
+void InvertBlock(const CellBlock& block, Invalidate invalidate) {
     const VisibleSpan columns =
         SelectedSpan(ColumnAxis(), block.left, block.right, grid.firstVisibleColumn,
                      grid.visibleColumnCount, zoomLevel);

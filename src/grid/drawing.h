@@ -1,7 +1,8 @@
 // Drawing into the grid's off-screen image: the lines, the highlight and the redraw cycle.
 #pragma once
 
-#include "grid/state.h"
+#include "grid/block.h"
+#include "platform/platform.h"
 
 namespace kor {
 
@@ -19,7 +20,7 @@ enum class Invalidate { no, yes };
 
 // Inverts the visible part of a block in the image, and perhaps invalidates it. Since the highlight
 // is an inversion, each block that was drawn is taken away by the same call before anything moves.
-void InvertBlock(const GridSelection& block, Invalidate invalidate);
+void InvertBlock(const CellBlock& block, Invalidate invalidate);
 
 // The same for the selection.
 void InvertSelection(Invalidate invalidate);

@@ -8,6 +8,7 @@
 #include "grid/layout.h"
 #include "grid/notify.h"
 #include "grid/selection.h"
+#include "grid/state.h"
 
 namespace kor {
 

@@ -2,7 +2,7 @@
 // the parent and never reads it itself.
 #pragma once
 
-#include "grid/state.h"
+#include "platform/platform.h"
 
 namespace kor {
 

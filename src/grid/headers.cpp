@@ -7,6 +7,7 @@
 #include "base/runtime.h"
 #include "base/windows_helpers.h"
 #include "grid/sizes.h"
+#include "grid/state.h"
 #include "zoom/zoom.h"
 
 namespace kor {

@@ -2,7 +2,7 @@
 // columns, or rows, are visible as the strip needs items to fill its length.
 #pragma once
 
-#include "grid/state.h"
+#include "platform/platform.h"
 
 namespace kor {
 

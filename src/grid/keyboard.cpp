@@ -5,6 +5,7 @@
 #include "grid/notify.h"
 #include "grid/scrolling.h"
 #include "grid/selection.h"
+#include "grid/state.h"
 
 namespace kor {
 
@@ -21,20 +22,20 @@ Anchor ShiftAnchor() {
 // A selection that is none (page down can leave one behind the last row) leads back to A1.
 template <typename Move>
 void MoveSelection(Move move) {
-    const GridSelection block = grid.selection;
-    ShowSelection(IsValidRange(block) ? move(block) : GridSelection{0, 0, 0, 0});
+    const CellBlock block = grid.selection;
+    ShowSelection(IsValidRange(block) ? move(block) : CellBlock{0, 0, 0, 0});
 }
 
 bool IsBelowView() { return grid.selection.bottom >= grid.firstVisibleRow + grid.visibleRowCount; }
 
 void OnLeft() {
-    MoveSelection([](GridSelection block) { return MoveLeft(block, ShiftAnchor()); });
+    MoveSelection([](CellBlock block) { return MoveLeft(block, ShiftAnchor()); });
     if (grid.selection.left < grid.firstVisibleColumn) ScrollHorizontally(SB_LINEUP);
     NotifyCurrentCell();
 }
 
 void OnRight() {
-    MoveSelection([](GridSelection block) { return MoveRight(block, ShiftAnchor()); });
+    MoveSelection([](CellBlock block) { return MoveRight(block, ShiftAnchor()); });
     if (grid.selection.right >= grid.firstVisibleColumn + grid.visibleColumnCount) {
         ScrollHorizontally(SB_LINEDOWN);
     }
@@ -42,13 +43,13 @@ void OnRight() {
 }
 
 void OnUp() {
-    MoveSelection([](GridSelection block) { return MoveUp(block, ShiftAnchor()); });
+    MoveSelection([](CellBlock block) { return MoveUp(block, ShiftAnchor()); });
     if (grid.selection.top < grid.firstVisibleRow) ScrollVertically(SB_LINEUP);
     NotifyCurrentCell();
 }
 
 void OnDown() {
-    MoveSelection([](GridSelection block) { return MoveDown(block, ShiftAnchor()); });
+    MoveSelection([](CellBlock block) { return MoveDown(block, ShiftAnchor()); });
     if (IsBelowView()) ScrollVertically(SB_LINEDOWN);
     NotifyCurrentCell();
 }
@@ -58,14 +59,14 @@ void OnPageUp() {
         ScrollVertically(SB_PAGEUP);  // within the first page the cell stays, and nobody is told
         return;
     }
-    MoveSelection([](GridSelection block) { return MovePageUp(block, grid.visibleRowCount); });
+    MoveSelection([](CellBlock block) { return MovePageUp(block, grid.visibleRowCount); });
     if (IsBelowView()) ScrollVertically(SB_LINEDOWN);
     ScrollVertically(SB_PAGEUP);
     NotifyCurrentCell();
 }
 
 void OnPageDown() {
-    MoveSelection([](GridSelection block) { return MovePageDown(block, grid.visibleRowCount); });
+    MoveSelection([](CellBlock block) { return MovePageDown(block, grid.visibleRowCount); });
     if (IsBelowView()) ScrollVertically(SB_LINEDOWN);
     ScrollVertically(SB_PAGEDOWN);
     NotifyCurrentCell();

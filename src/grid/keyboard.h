@@ -1,7 +1,7 @@
 // The keyboard map of the grid's window.
 #pragma once
 
-#include "grid/state.h"
+#include "platform/platform.h"
 
 namespace kor {
 

@@ -6,6 +6,7 @@
 #include "base/windows_helpers.h"
 #include "grid/drawing.h"
 #include "grid/headers.h"
+#include "grid/state.h"
 #include "zoom/zoom.h"
 
 namespace kor {

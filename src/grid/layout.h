@@ -1,7 +1,7 @@
 // Where the grid's children stand, and laying them out again.
 #pragma once
 
-#include "grid/state.h"
+#include "platform/platform.h"
 
 namespace kor {
 

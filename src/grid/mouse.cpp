@@ -12,7 +12,8 @@
 #include "grid/notify.h"
 #include "grid/scrolling.h"
 #include "grid/selection.h"
-#include "grid/sizes.h"
+#include "grid/state.h"
+#include "grid/visible.h"
 
 namespace kor {
 
@@ -27,7 +28,7 @@ void FocusGridByMouse() {
     grid.focusByMouse = false;
 }
 
-void SetAnchor(GridCellPair cell) {
+void SetAnchor(Cell cell) {
     grid.anchorColumn = cell.column;
     grid.anchorRow = cell.row;
 }
@@ -40,7 +41,7 @@ void EndDrag(bool keepAnchor) {
     grid.lastMouseY = 0;
 }
 
-GridSelection BlockFromAnchor(GridCellPair hit) {
+CellBlock BlockFromAnchor(Cell hit) {
     return BlockBetween(grid.anchorColumn, grid.anchorRow, hit.column, hit.row);
 }
 
@@ -52,7 +53,7 @@ LRESULT OnGridButtonDown(WPARAM keys, int x, int y) {
     FocusGridByMouse();
     grid.isDragging = true;
     SetCapture(grid.hwndGrid);
-    const GridCellPair hit = CellFromPoint(x, y);
+    const Cell hit = CellFromPoint(x, y);
     grid.lastMouseX = x;
     grid.lastMouseY = y;
     // Whoever had the capture may have taken it back at once: then there is no drag.
@@ -75,8 +76,8 @@ LRESULT OnGridPointerMove(int x, int y) {
     grid.lastMouseX = x;
     grid.lastMouseY = std::max(y, 0);
     if (!IsAnchored()) return 0;
-    const GridSelection block = BlockFromAnchor(CellFromPoint(x, grid.lastMouseY));
-    if (IsSame(block, grid.selection)) return 0;
+    const CellBlock block = BlockFromAnchor(CellFromPoint(x, grid.lastMouseY));
+    if (block == grid.selection) return 0;
     ShowSelection(block);
     NotifySelecting();
     return 0;

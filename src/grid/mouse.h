@@ -1,7 +1,7 @@
 // Selecting with the left button or the stylus, and scrolling while it is held near an edge.
 #pragma once
 
-#include "grid/state.h"
+#include "platform/platform.h"
 
 namespace kor {
 

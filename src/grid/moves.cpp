@@ -1,7 +1,7 @@
 // Numbers wrap round below 0, as 16-bit numbers do, and are invalid then.
 #include "grid/moves.h"
 
-#include "grid/selection.h"
+#include <cstdint>
 
 namespace kor {
 
@@ -9,11 +9,11 @@ namespace {
 
 bool Extends(Anchor anchor) { return anchor.column != kNoAnchor && anchor.row != kNoAnchor; }
 
-WORD Word(int value) { return static_cast<WORD>(value); }
+uint16_t Word(int value) { return static_cast<uint16_t>(value); }
 
 }  // namespace
 
-GridSelection MoveLeft(GridSelection block, Anchor anchor) {
+CellBlock MoveLeft(CellBlock block, Anchor anchor) {
     if (!Extends(anchor)) {
         --block.left;
         block.right = block.left;
@@ -31,7 +31,7 @@ GridSelection MoveLeft(GridSelection block, Anchor anchor) {
     return block;
 }
 
-GridSelection MoveUp(GridSelection block, Anchor anchor) {
+CellBlock MoveUp(CellBlock block, Anchor anchor) {
     if (!Extends(anchor)) {
         --block.top;
         block.bottom = block.top;
@@ -50,7 +50,7 @@ GridSelection MoveUp(GridSelection block, Anchor anchor) {
     return block;
 }
 
-GridSelection MoveRight(GridSelection block, Anchor anchor) {
+CellBlock MoveRight(CellBlock block, Anchor anchor) {
     if (!Extends(anchor)) {
         ++block.left;
         block.right = block.left;
@@ -67,7 +67,7 @@ GridSelection MoveRight(GridSelection block, Anchor anchor) {
     return block;
 }
 
-GridSelection MoveDown(GridSelection block, Anchor anchor) {
+CellBlock MoveDown(CellBlock block, Anchor anchor) {
     if (!Extends(anchor)) {
         ++block.top;
         block.bottom = block.top;
@@ -84,7 +84,7 @@ GridSelection MoveDown(GridSelection block, Anchor anchor) {
     return block;
 }
 
-GridSelection MovePageUp(GridSelection block, int rows) {
+CellBlock MovePageUp(CellBlock block, int rows) {
     block.top = Word(block.top - rows);
     block.bottom = block.top;
     block.right = block.left;
@@ -92,7 +92,7 @@ GridSelection MovePageUp(GridSelection block, int rows) {
     return block;
 }
 
-GridSelection MovePageDown(GridSelection block, int rows) {
+CellBlock MovePageDown(CellBlock block, int rows) {
     block.top = Word(block.top + rows);
     block.bottom = block.top;
     block.right = block.left;

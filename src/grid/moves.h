@@ -4,23 +4,18 @@
 // each is a rule of its own.
 #pragma once
 
-#include "grid/state.h"
+#include "grid/block.h"
 
 namespace kor {
 
-// With the anchor of a Shift-extension; both -1 moves the single cell.
-struct Anchor {
-    int column;
-    int row;
-};
-
-GridSelection MoveLeft(GridSelection block, Anchor anchor);
-GridSelection MoveUp(GridSelection block, Anchor anchor);
-GridSelection MoveRight(GridSelection block, Anchor anchor);
-GridSelection MoveDown(GridSelection block, Anchor anchor);
+// With the anchor of a Shift-extension; without one the single cell moves.
+CellBlock MoveLeft(CellBlock block, Anchor anchor);
+CellBlock MoveUp(CellBlock block, Anchor anchor);
+CellBlock MoveRight(CellBlock block, Anchor anchor);
+CellBlock MoveDown(CellBlock block, Anchor anchor);
 
 // By a page of `rows` rows; the block becomes one cell.
-GridSelection MovePageUp(GridSelection block, int rows);
-GridSelection MovePageDown(GridSelection block, int rows);
+CellBlock MovePageUp(CellBlock block, int rows);
+CellBlock MovePageDown(CellBlock block, int rows);
 
 }  // namespace kor

@@ -1,6 +1,7 @@
 #include "grid/notify.h"
 
 #include "base/windows_helpers.h"
+#include "grid/state.h"
 #include "grid/visible.h"
 
 namespace kor {
@@ -23,7 +24,9 @@ LPARAM CurrentCellForEquation() { return WordPair(grid.selection.top, grid.selec
 
 void NotifyPaintCells() { NotifyWith(GRIDN_PAINTCELLS, VisibleRange()); }
 
-void NotifyCellClicked(GridCellPair cell) { NotifyWith(GRIDN_CELLCLICKED, cell); }
+void NotifyCellClicked(Cell cell) {
+    NotifyWith(GRIDN_CELLCLICKED, GridCellPair{cell.column, cell.row});
+}
 
 void NotifyCurrentCell() {
     NotifyWith(GRIDN_CURRENTCELL, GridCellPair{grid.selection.left, grid.selection.top});

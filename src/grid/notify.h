@@ -2,12 +2,12 @@
 // All are sent, and the parent may call back into the library before they return.
 #pragma once
 
-#include "grid/state.h"
+#include "grid/block.h"
 
 namespace kor {
 
 void NotifyPaintCells();  // the visible range
-void NotifyCellClicked(GridCellPair cell);
+void NotifyCellClicked(Cell cell);
 void NotifyCurrentCell();  // the selection's top left cell
 void NotifySelecting();
 void NotifySelectionDone();

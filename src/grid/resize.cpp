@@ -8,6 +8,7 @@
 #include "grid/headers.h"
 #include "grid/notify.h"
 #include "grid/sizes.h"
+#include "grid/state.h"
 #include "zoom/zoom.h"
 
 namespace kor {

@@ -1,7 +1,7 @@
 // What the grid does while and after a header border is dragged.
 #pragma once
 
-#include "grid/state.h"
+#include "platform/platform.h"
 
 namespace kor {
 

@@ -4,6 +4,7 @@
 
 #include "base/windows_helpers.h"
 #include "grid/headers.h"
+#include "grid/state.h"
 
 namespace kor {
 

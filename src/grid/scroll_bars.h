@@ -1,8 +1,6 @@
 // The two scroll bars: range, page and thumb follow the view and the host's data.
 #pragma once
 
-#include "grid/state.h"
-
 namespace kor {
 
 // After a scroll step, from the new first index and the visible count from before it. A hidden bar

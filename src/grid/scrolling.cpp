@@ -8,6 +8,7 @@
 #include "grid/headers.h"
 #include "grid/layout.h"
 #include "grid/scroll_bars.h"
+#include "grid/state.h"
 
 namespace kor {
 

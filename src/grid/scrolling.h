@@ -1,7 +1,7 @@
 // Scrolling by whole columns and rows.
 #pragma once
 
-#include "grid/state.h"
+#include "platform/platform.h"
 
 namespace kor {
 

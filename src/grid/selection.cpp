@@ -4,29 +4,20 @@
 
 #include "base/windows_helpers.h"
 #include "grid/drawing.h"
+#include "grid/state.h"
 
 namespace kor {
 
 namespace {
 
-constexpr GridSelection kFirstCell = {0, 0, 0, 0};
-constexpr GridSelection kWholeSheet = {0, kColumnLimit - 1, 0, kRowLimit - 1};
+constexpr CellBlock kFirstCell = {0, 0, 0, 0};
+constexpr CellBlock kWholeSheet = {0, kColumnLimit - 1, 0, kRowLimit - 1};
 
 void FocusGrid() {
     if (grid.hwndGrid) SetFocus(grid.hwndGrid);
 }
 
 }  // namespace
-
-bool IsSame(const GridSelection& a, const GridSelection& b) {
-    return a.left == b.left && a.right == b.right && a.top == b.top && a.bottom == b.bottom;
-}
-
-GridSelection BlockBetween(int columnA, int rowA, int columnB, int rowB) {
-    return {static_cast<WORD>(std::min(columnA, columnB)),
-            static_cast<WORD>(std::max(columnA, columnB)), static_cast<WORD>(std::min(rowA, rowB)),
-            static_cast<WORD>(std::max(rowA, rowB))};
-}
 
 bool IsAnchored() { return grid.anchorColumn != kNoAnchor && grid.anchorRow != kNoAnchor; }
 
@@ -37,20 +28,20 @@ void ClearAnchor() {
 
 bool HasCurrentCell() { return grid.firstVisibleColumn >= 0 && grid.firstVisibleRow >= 0; }
 
-void ShowSelection(const GridSelection& block) {
+void ShowSelection(const CellBlock& block) {
     InvertSelection(Invalidate::yes);
     grid.selection = block;
     InvertSelection(Invalidate::yes);
 }
 
 LRESULT OnHeaderClick(HWND header, int itemA, int itemB) {
-    GridSelection block = kWholeSheet;
+    CellBlock block = kWholeSheet;
     if (header == grid.hwndRowHeader) {
-        block.top = static_cast<WORD>(grid.firstVisibleRow + std::min(itemA, itemB));
-        block.bottom = static_cast<WORD>(grid.firstVisibleRow + std::max(itemA, itemB));
+        block.top = static_cast<uint16_t>(grid.firstVisibleRow + std::min(itemA, itemB));
+        block.bottom = static_cast<uint16_t>(grid.firstVisibleRow + std::max(itemA, itemB));
     } else if (header == grid.hwndColumnHeader) {
-        block.left = static_cast<WORD>(grid.firstVisibleColumn + std::min(itemA, itemB));
-        block.right = static_cast<WORD>(grid.firstVisibleColumn + std::max(itemA, itemB));
+        block.left = static_cast<uint16_t>(grid.firstVisibleColumn + std::min(itemA, itemB));
+        block.right = static_cast<uint16_t>(grid.firstVisibleColumn + std::max(itemA, itemB));
     } else {
         return 0;
     }
@@ -67,8 +58,8 @@ LRESULT OnHeaderClick(HWND header, int itemA, int itemB) {
 LRESULT SelectAll() {
     // One past the whole sheet: no selection is ever this one, so a second press on the corner
     // button selects everything once more.
-    constexpr GridSelection kUnselectable = {0, kColumnLimit, 0, kRowLimit};
-    if (IsSame(grid.selection, kUnselectable)) {
+    constexpr CellBlock kUnselectable = {0, kColumnLimit, 0, kRowLimit};
+    if (grid.selection == kUnselectable) {
         InvertSelection(Invalidate::yes);
         grid.selection = kFirstCell;
     } else {
@@ -85,14 +76,15 @@ LRESULT SelectAll() {
 using namespace kor;
 
 extern "C" DWORD KORCONTROLS_API SetSelectedRanged(DWORD columns, DWORD rows) {
-    const GridSelection block = {LOWORD(columns), HIWORD(columns), LOWORD(rows), HIWORD(rows)};
+    const CellBlock block = {LOWORD(columns), HIWORD(columns), LOWORD(rows), HIWORD(rows)};
     if (!IsValidRange(block)) return 0;
     ShowSelection(block);
     return 1;
 }
 
 extern "C" void KORCONTROLS_API GetSelectedRanged(GridSelection* selection) {
-    if (selection) *selection = grid.selection;
+    const CellBlock& block = grid.selection;
+    if (selection) *selection = {block.left, block.right, block.top, block.bottom};
 }
 
 extern "C" DWORD KORCONTROLS_API GetCurrentSelectedCell(GridCellPair* cell) {

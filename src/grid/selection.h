@@ -1,20 +1,10 @@
 // The selected block and its anchor.
 #pragma once
 
-#include "grid/state.h"
+#include "grid/block.h"
+#include "platform/platform.h"
 
 namespace kor {
-
-// Whether a block lies within the sheet and is not turned round.
-constexpr bool IsValidRange(const GridSelection& block) {
-    return block.left <= block.right && block.right < kColumnLimit && block.top <= block.bottom &&
-           block.bottom < kRowLimit;
-}
-
-bool IsSame(const GridSelection& a, const GridSelection& b);
-
-// The smallest block with both cells.
-GridSelection BlockBetween(int columnA, int rowA, int columnB, int rowB);
 
 bool IsAnchored();
 void ClearAnchor();
@@ -23,7 +13,7 @@ void ClearAnchor();
 bool HasCurrentCell();
 
 // Takes the highlight from the old block and gives it to the new one, on screen at the next paint.
-void ShowSelection(const GridSelection& block);
+void ShowSelection(const CellBlock& block);
 
 // HCN_ITEMCLICK: selects the whole columns or rows between two items of a header, which count from
 // the first visible one. The parent is not told, and the anchor stays.

@@ -6,6 +6,7 @@
 #include "base/local_heap.h"
 #include "base/runtime.h"
 #include "base/windows_helpers.h"
+#include "grid/state.h"
 #include "zoom/zoom.h"
 
 namespace kor {
@@ -87,16 +88,6 @@ void ForgetSizes() {
     grid.rowHeights = nullptr;
     grid.columnOverrideCount = 0;
     grid.rowOverrideCount = 0;
-}
-
-GridCellPair CellFromPoint(int x, int y) {
-    const RECT client = ClientRectOf(grid.hwndGrid);
-    if (x < client.left || y < client.top) return {0, 0};
-    const int column = IndexAt(ColumnAxis(), grid.firstVisibleColumn, grid.visibleColumnCount,
-                               grid.cellsLeft, std::min<int>(x, client.right), zoomLevel);
-    const int row = IndexAt(RowAxis(), grid.firstVisibleRow, grid.visibleRowCount, grid.cellsTop,
-                            std::min<int>(y, client.bottom), zoomLevel);
-    return {static_cast<WORD>(column), static_cast<WORD>(row)};
 }
 
 }  // namespace kor

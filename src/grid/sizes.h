@@ -1,7 +1,7 @@
 // The grid's own columns and rows: which sizes they have now, how those are kept and changed.
 #pragma once
 
-#include "grid/state.h"
+#include "grid/geometry.h"
 
 namespace kor {
 
@@ -24,8 +24,5 @@ bool StoreRowHeight(int row, uint16_t units);
 
 // Frees all stored sizes.
 void ForgetSizes();
-
-// The cell at a client position: `x` is read unsigned, so left of the window is far to the right.
-GridCellPair CellFromPoint(int x, int y);
 
 }  // namespace kor

@@ -5,14 +5,15 @@
 #include <korcontrols/grid.h>
 
 #include "base/records.h"
+#include "grid/block.h"
 #include "grid/geometry.h"
 #include "platform/platform.h"
 
 namespace kor {
 
-constexpr int kColumnLimit = KORGRID_COLUMNS;
-constexpr int kRowLimit = KORGRID_ROWS;
-constexpr int kNoAnchor = -1;
+static_assert(kColumnLimit == KORGRID_COLUMNS && kRowLimit == KORGRID_ROWS);
+// Notifications give the block to the parent by its address.
+static_assert(sizeof(CellBlock) == sizeof(GridSelection));
 constexpr int kNoResizeLine = -1;
 constexpr int kEditBufferBytes = 260;
 
@@ -47,7 +48,7 @@ struct GridState {
     SizeOverride* rowHeights = nullptr;
     uint32_t columnOverrideCount = 0;
     uint32_t rowOverrideCount = 0;
-    GridSelection selection = {0, 0, 0, 0};
+    CellBlock selection = {0, 0, 0, 0};
     int32_t anchorColumn = kNoAnchor;
     int32_t anchorRow = kNoAnchor;
     int32_t cellsLeft = 0;           // client x of the first visible column; set at load

@@ -1,7 +1,12 @@
 #include "grid/visible.h"
 
+#include <algorithm>
+
 #include "base/windows_helpers.h"
+#include "grid/geometry.h"
 #include "grid/sizes.h"
+#include "grid/state.h"
+#include "zoom/zoom.h"
 
 namespace kor {
 
@@ -38,6 +43,16 @@ RECT CellBox(int column, int row) {
     const int left = ColumnLeft(column);
     const int top = RowTop(row);
     return {left, top, left + ColumnWidth(column), top + RowHeight(row)};
+}
+
+Cell CellFromPoint(int x, int y) {
+    const RECT client = ClientRectOf(grid.hwndGrid);
+    if (x < client.left || y < client.top) return {0, 0};
+    const int column = IndexAt(ColumnAxis(), grid.firstVisibleColumn, grid.visibleColumnCount,
+                               grid.cellsLeft, std::min<int>(x, client.right), zoomLevel);
+    const int row = IndexAt(RowAxis(), grid.firstVisibleRow, grid.visibleRowCount, grid.cellsTop,
+                            std::min<int>(y, client.bottom), zoomLevel);
+    return {static_cast<uint16_t>(column), static_cast<uint16_t>(row)};
 }
 
 }  // namespace kor

@@ -1,7 +1,10 @@
 // Which cells are visible.
 #pragma once
 
-#include "grid/state.h"
+#include <korcontrols/grid.h>
+
+#include "grid/block.h"
+#include "platform/platform.h"
 
 namespace kor {
 
@@ -21,5 +24,8 @@ RECT CellBox(int column, int row);
 // Client x of a column, or y of a row, from the first visible one on.
 int ColumnLeft(int column);
 int RowTop(int row);
+
+// The cell at a client position: `x` is read unsigned, so left of the window is far to the right.
+Cell CellFromPoint(int x, int y);
 
 }  // namespace kor

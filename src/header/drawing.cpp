@@ -6,6 +6,7 @@
 #include "base/gdi_scopes.h"
 #include "base/windows_helpers.h"
 #include "text/text_run.h"
+#include "text/zoomed_font.h"
 #include "zoom/zoom.h"
 
 namespace kor {

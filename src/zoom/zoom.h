@@ -2,7 +2,7 @@
 // it, the strips only read it, and neither has to know the other for that.
 #pragma once
 
-#include "platform/platform.h"
+#include <cstdint>
 
 namespace kor {
 
@@ -29,9 +29,5 @@ constexpr int HeaderHeightAt(uint32_t zoom) {
 // Height of a font at a zoom: scaled, and always a character height (negative), which is what makes
 // the letters and not their line keep the proportion.
 int ZoomedFontHeight(int height, uint32_t zoom);
-
-// A new font: `font` at the current zoom, with its own proportions. The caller deletes it. Null
-// when `font` is null or cannot be read or made.
-HFONT CreateZoomedFont(HFONT font);
 
 }  // namespace kor
