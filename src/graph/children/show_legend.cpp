@@ -34,11 +34,16 @@ void ShowLegend(GraphRecord& graph, const RECT& place) {
     LoadStringW(moduleInstance, kLegendTitleString, title, kLegendTitleCapacity);
     RegisterLegendClass(graph.hInstance);
     const int width = place.right - place.left;
-    graph.hwndLegend = CreateWindowExW(
+    HWND legend = CreateWindowExW(
         0, KORLEGEND_CLASS, title, WS_CHILD | WS_CAPTION | WS_VSCROLL, place.left, place.top, width,
         place.bottom - place.top, graph.hwnd,
         reinterpret_cast<HMENU>(static_cast<INT_PTR>(KORLEGEND_ID)), graph.hInstance, nullptr);
-    if (!graph.hwndLegend) return;
+    if (!legend) return;
+    if (graph.hwndLegend) {  // shown inside a message that creating this one sent
+        DestroyWindow(legend);
+        return;
+    }
+    graph.hwndLegend = legend;
     POINT bottom = {0, SnappedHeight(graph.hwndLegend)};
     MapWindowPoints(graph.hwndLegend, graph.hwnd, &bottom, 1);
     MoveWindow(graph.hwndLegend, place.left, place.top, width, bottom.y - place.top, TRUE);
