@@ -128,7 +128,10 @@ void CheckSeries(const kor::GraphSeries* series, int place) {
         FailStorm("chart: series %d of %d points, extremes at %d and %d", place, series->pointCount,
                   series->minIndex, series->maxIndex);
     }
-    if (!IsRange(series->minValue, series->maxValue)) {
+    // A single value that becomes none leaves the other extreme as it was, even as the last number.
+    const bool hasNumbers = std::any_of(series->values, series->values + series->pointCount,
+                                        [](double value) { return std::isfinite(value); });
+    if (hasNumbers && !IsRange(series->minValue, series->maxValue)) {
         FailStorm("chart: series %d from %g to %g", place, series->minValue, series->maxValue);
     }
     if (series->livePointCount < 0 || series->livePointCount > std::max(series->pointCount, 3)) {

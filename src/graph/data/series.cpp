@@ -140,24 +140,17 @@ void FollowData(GraphRecord& graph) {
     if (graph.yAutoRange) AutoRange(graph, KORGRAPH_Y);
 }
 
-// Where a rescan begins; null where no value counts.
-const double* FirstFiniteValue(const GraphSeries& series) {
+// Where a rescan begins; 0 where no value counts.
+double FirstFiniteValue(const GraphSeries& series) {
     const double* begin = series.values;
     const double* end = begin + series.pointCount;
     const double* first = std::find_if(begin, end, IsFinite);
-    return first == end ? nullptr : first;
-}
-
-// What a series has whose values are all infinite or no numbers. The indexes stay.
-void ForgetExtremes(GraphSeries& series) {
-    series.minValue = series.maxValue = series.absSum = 0;
+    return first == end ? 0.0 : *first;
 }
 
 // The largest value anew. Its index moves only onto a larger value than the first one.
 void RescanMaximum(GraphSeries& series) {
-    const double* first = FirstFiniteValue(series);
-    if (!first) return ForgetExtremes(series);
-    series.maxValue = *first;
+    series.maxValue = FirstFiniteValue(series);
     series.absSum = 0;
     for (int i = 0; i < series.pointCount; ++i) {
         const double value = series.values[i];
@@ -171,9 +164,7 @@ void RescanMaximum(GraphSeries& series) {
 }
 
 void RescanMinimum(GraphSeries& series) {
-    const double* first = FirstFiniteValue(series);
-    if (!first) return ForgetExtremes(series);
-    series.minValue = *first;
+    series.minValue = FirstFiniteValue(series);
     series.absSum = 0;
     for (int i = 0; i < series.pointCount; ++i) {
         const double value = series.values[i];

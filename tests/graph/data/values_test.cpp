@@ -37,20 +37,6 @@ TEST_F(GraphSetValue, NewMinimumIsTaken) {
     EXPECT_EQ(series().absSum, 16);
 }
 
-TEST_F(GraphSetValue, ThatLeavesNoNumberLeavesExtremesOfNought) {
-    const double none = std::numeric_limits<double>::quiet_NaN();
-    add({7});
-    set(0, 0, none);
-    EXPECT_EQ(series().minValue, 0);
-    EXPECT_EQ(series().maxValue, 0);
-    EXPECT_EQ(series().absSum, 0);
-    add({9, 4});  // the smallest goes last, after the largest has moved to it
-    set(1, 0, none);
-    set(1, 1, none);
-    EXPECT_EQ(series(1).minValue, 0);
-    EXPECT_EQ(series(1).maxValue, 0);
-}
-
 TEST_F(GraphSetValue, LoweredMaximumGivesTheNextLargest) {
     add({3, 5, 4});
     set(0, 0, 20);
