@@ -3,7 +3,7 @@
 #include <cmath>
 #include <cstdlib>
 
-#include "graph/drawing/disc.h"
+#include "graph/shapes/disc.h"
 
 namespace bench {
 

@@ -1,6 +1,7 @@
 // Small helpers around windows and messages that hold on every platform.
 #pragma once
 
+#include "numbers/shapes.h"
 #include "platform/platform.h"
 
 namespace kor {
@@ -30,6 +31,10 @@ inline LRESULT PassOn(WNDPROC replaced, HWND hwnd, UINT message, WPARAM wParam, 
 inline void InvalidateArea(HWND hwnd, const RECT& area) {
     if (hwnd) InvalidateRect(hwnd, &area, FALSE);
 }
+
+// An array of points for the platform's calls.
+static_assert(sizeof(Point) == sizeof(POINT) && offsetof(Point, y) == offsetof(POINT, y));
+inline POINT* PlatformPoints(Point* points) { return reinterpret_cast<POINT*>(points); }
 
 // Two 16-bit words as one message parameter; what does not fit is cut off.
 constexpr LPARAM WordPair(int lowWord, int highWord) {

@@ -51,7 +51,8 @@ constexpr Size EntrySize(Size text, Size image) {
             text.height > image.height ? text.height : image.height + kEntryImageInset};
 }
 
-static_assert(EntrySize({50, 15}, {16, 14}).width == 72 && EntrySize({50, 15}, {16, 14}).height == 15);
+static_assert(EntrySize({50, 15}, {16, 14}).width == 72 &&
+              EntrySize({50, 15}, {16, 14}).height == 15);
 static_assert(EntrySize({50, 15}, {16, 15}).height == 17);
 
 }  // namespace kor

@@ -1,15 +1,13 @@
 #include "graph/hit_test.h"
 
-#include <cmath>
-
 #include "base/assert.h"
 #include "base/runtime.h"
 #include "graph/data/series.h"
-#include "graph/drawing/bars.h"
 #include "graph/drawing/pie.h"
-#include "graph/drawing/points.h"
 #include "graph/scale/number_format.h"
 #include "graph/scale/scale.h"
+#include "graph/shapes/bar_layout.h"
+#include "graph/shapes/points.h"
 
 namespace kor {
 
@@ -17,23 +15,16 @@ namespace {
 
 constexpr int kTolerance = 3;  // pixels each way
 constexpr int kSharePrecision = 2;
-constexpr double kDegreesPerRadian = 57.29577951308232;
 constexpr int kNoPoint = -1;
 
-// The angle is rounded to a double before it is compared, whatever the processor computes with.
-double Rounded(double value) {
-    volatile double stored = value;
-    return stored;
-}
-
-int FindLinePoint(const GraphRecord& graph, const GraphSeries& series, int x, int y) {
+int FindLinePoint(const ValueTrace& trace, Point at) {
     const PointRange range =
-        PointsBetween(graph, xPixel, series.pointCount, x - kTolerance, x + kTolerance);
+        PointsBetween(trace.x, trace.count, at.x - kTolerance, at.x + kTolerance);
     for (int i = range.first; i <= range.last; ++i) {
-        const double value = series.values[i - 1];
+        const double value = trace.values[i - 1];
         if (!IsFinite(value)) continue;
-        const int dx = xPixel(graph, i) - x;
-        const int dy = yPixel(graph, value) - y;
+        const int dx = PixelAt(trace.x, i) - at.x;
+        const int dy = PixelAt(trace.y, value) - at.y;
         if (dx >= -kTolerance && dx <= kTolerance && dy >= -kTolerance && dy <= kTolerance) {
             return i - 1;
         }
@@ -41,74 +32,22 @@ int FindLinePoint(const GraphRecord& graph, const GraphSeries& series, int x, in
     return kNoPoint;
 }
 
-int FindColumn(const GraphRecord& graph, const GraphSeries& series, int offset, int width, int x,
-               int y) {
-    const int zero = yPixel(graph, 0);
-    const PointRange range =
-        PointsBetween(graph, xPixel, series.pointCount, x - offset - width, x - offset);
-    for (int i = range.first; i <= range.last; ++i) {
-        const double value = series.values[i - 1];
-        const int left = xPixel(graph, i) + offset;
-        if (!IsFinite(value) || x < left || x > left + width) continue;
-        const int end = yPixel(graph, value);
-        const bool hit = value >= 0 ? end <= y && y <= zero : zero <= y && y <= end;
-        if (hit) return i - 1;
-    }
-    return kNoPoint;
-}
-
-int RowUpwards(const GraphRecord& graph, double pointNumber) { return -yPixel(graph, pointNumber); }
-
-int FindBar(const GraphRecord& graph, const GraphSeries& series, int offset, int height, int x,
-            int y) {
-    const int zero = xPixel(graph, 0);
-    const PointRange range =
-        PointsBetween(graph, RowUpwards, series.pointCount, -(y + offset + height), -(y + offset));
-    for (int i = range.first; i <= range.last; ++i) {
-        const double value = series.values[i - 1];
-        if (!IsFinite(value)) continue;
-        const int end = xPixel(graph, value);
-        const bool across = value > 0 ? zero <= x && x <= end : end <= x && x <= zero;
-        const int row = yPixel(graph, i);
-        if (across && row - offset - height <= y && y <= row - offset) return i - 1;
-    }
-    return kNoPoint;
-}
-
-int FindPoint(const GraphRecord& graph, int index, int x, int y) {
+int FindPoint(const GraphRecord& graph, int index, Point at) {
     const GraphSeries& series = *graph.series[index];
+    const Axis x = XAxis(graph);
+    const Axis y = YAxis(graph);
+    const auto findBar = [&](const BarAxes& axes, int thickness) {
+        const int zoomed = ZoomedThickness(graph, thickness);
+        const int offset = OffsetInGroup(index, graph.seriesCount, zoomed);
+        return FindBar(axes, series.values, series.pointCount, offset, zoomed, at);
+    };
     switch (graph.chartType) {
     case kLine:
-    case kArea: return FindLinePoint(graph, series, x, y);
-    case kColumn: {
-        const int width = ZoomedThickness(graph, graph.barWidth);
-        const int offset = OffsetInGroup(index, graph.seriesCount, width);
-        return FindColumn(graph, series, offset, width, x, y);
-    }
-    case kBar: {
-        const int height = ZoomedThickness(graph, graph.barHeight);
-        const int offset = OffsetInGroup(index, graph.seriesCount, height);
-        return FindBar(graph, series, offset, height, x, y);
-    }
+    case kArea: return FindLinePoint({x, y, series.values, series.pointCount}, at);
+    case kColumn: return findBar(AxesOfColumns(x, y), graph.barWidth);
+    case kBar: return findBar(AxesOfBars(x, y), graph.barHeight);
     default: return kNoPoint;
     }
-}
-
-int FindSlice(const GraphRecord& graph, const GraphSeries& series, int x, int y) {
-    const POINT centre = SurfaceCentre(graph);
-    const double dx = x - centre.x;
-    const double dy = centre.y - y;
-    const double distance = std::sqrt(dx * dx + dy * dy);
-    if (distance == 0 || TruncateToInt(distance) > LayoutPie(graph).radius) return kNoPoint;
-    double angle = Rounded(std::acos(dy / distance) * kDegreesPerRadian);
-    if (x > centre.x) angle = Rounded(360.0 - angle);
-    double end = 0;
-    for (int k = 0; k < series.pointCount; ++k) {
-        const double start = end;
-        end = Rounded(end + SliceShare(series, k) * 360.0);
-        if (start <= angle && angle < end) return k;
-    }
-    return kNoPoint;
 }
 
 void AppendNumber(wchar_t* text, double value, int precision) {
@@ -128,9 +67,12 @@ int HitTestGraphValue(const GraphRecord& graph, int x, int y, wchar_t* text) {
     memset(text, 0, kTipTextCapacity * sizeof(wchar_t));
     if (graph.chartType == kPie) {
         const GraphSeries* series = SeriesAt(graph, 0);
-        const int slice = HasSlices(series) ? FindSlice(graph, *series, x, y) : kNoPoint;
+        if (!HasSlices(series)) return 0;
+        const Slices slices = SlicesOf(*series);
+        const int slice =
+            FindSlice(slices, CentreOf(SurfaceOf(graph)), LayoutPie(graph).radius, {x, y});
         if (slice == kNoPoint) return 0;
-        AppendNumber(text, SliceShare(*series, slice) * 100.0, kSharePrecision);
+        AppendNumber(text, ShareOf(slices, slice) * 100.0, kSharePrecision);
         wcscat(text, L"%\r\n");
         AppendValue(text, series->values[slice]);
         KOR_ASSERT(wcslen(text) < kTipTextCapacity);  // two numbers and nine characters
@@ -138,7 +80,7 @@ int HitTestGraphValue(const GraphRecord& graph, int x, int y, wchar_t* text) {
     }
     for (int i = 0; i < graph.seriesCount; ++i) {
         if (!graph.series[i] || !graph.series[i]->values) continue;
-        const int point = FindPoint(graph, i, x, y);
+        const int point = FindPoint(graph, i, {x, y});
         if (point == kNoPoint) continue;
         AppendValue(text, graph.series[i]->values[point]);
         return 1;

@@ -1,4 +1,5 @@
-// Points, sizes and rectangles in pixels for what needs no window; those of the platform look alike.
+// Points, sizes and rectangles in pixels for what needs no window; those of the platform look
+// alike.
 #pragma once
 
 #include <cstdint>

@@ -2,7 +2,7 @@
 // all its points.
 #include "fuzz_chart.h"
 
-#include "graph/drawing/points.h"
+#include "graph/shapes/points.h"
 #include "graph/scale/number_format.h"
 
 #include <utility>

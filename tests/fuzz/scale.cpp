@@ -3,7 +3,8 @@
 #include "fuzz_chart.h"
 
 #include "graph/scale/number_format.h"
-#include "graph/scale/walks.h"
+#include "graph/scale/scale.h"
+#include "graph/scale/ticks.h"
 
 namespace korfuzz {
 namespace {
@@ -41,12 +42,12 @@ void CheckTicks(const kor::GraphRecord& graph) {
     int drawn = 0;
     EXPECT_THAT(graph.xTickStep > 0 && std::isfinite(graph.xTickStep));
     EXPECT_THAT(graph.yTickStep > 0 && std::isfinite(graph.yTickStep));
-    kor::WalkXTicks(graph, graph.xTickStep, 0, right, [&](double value, int column) {
+    kor::WalkAxisTicks(kor::XAxis(graph), graph.xTickStep, 0, right, [&](double value, int column) {
         EXPECT_THAT(std::isfinite(value) && column >= 0 && column <= right);
         EXPECT_THAT(++drawn < kMostDrawn);
     });
     drawn = 0;
-    kor::WalkYTicks(graph, graph.yTickStep, 0, bottom, [&](double value, int row) {
+    kor::WalkAxisTicks(kor::YAxis(graph), graph.yTickStep, 0, bottom, [&](double value, int row) {
         EXPECT_THAT(std::isfinite(value) && row >= 0 && row <= bottom);
         EXPECT_THAT(++drawn < kMostDrawn);
     });

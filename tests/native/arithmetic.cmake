@@ -5,12 +5,12 @@ set(KORCONTROLS_ROOT ${CMAKE_CURRENT_LIST_DIR}/../..)
 function(korcontrols_arithmetic name)
   set(src ${KORCONTROLS_ROOT}/src)
   add_library(${name} STATIC
-    ${src}/graph/drawing/disc.cpp
+    ${src}/graph/shapes/disc.cpp
     ${src}/graph/hit_test.cpp
     ${src}/graph/scale/number_format.cpp
     ${src}/graph/data/palette.cpp
     ${src}/graph/drawing/pie.cpp
-    ${src}/graph/drawing/points.cpp
+    ${src}/graph/shapes/points.cpp
     ${src}/graph/record.cpp
     ${src}/graph/scale/scale.cpp
     ${src}/graph/data/series.cpp

@@ -8,7 +8,7 @@
 #include "base/module.h"
 #include "base/windows_helpers.h"
 #include "graph/children/legend.h"
-#include "graph/scale/number_format.h"
+#include "numbers/truncate.h"
 
 namespace kor {
 

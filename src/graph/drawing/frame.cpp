@@ -5,7 +5,8 @@
 #include <algorithm>
 
 #include "base/gdi_scopes.h"
-#include "graph/scale/walks.h"
+#include "graph/scale/scale.h"
+#include "graph/scale/ticks.h"
 
 namespace kor {
 
@@ -90,12 +91,12 @@ void DrawGridLines(const GraphRecord& graph, HDC dc, const RECT* bounds) {
                                     surface.right - surface.left - graph.marginRight, plot.bottom};
     SelectScope pen(dc, graph.hpenGrid);
     if (HasOption(graph, KORGRAPH_HORIZONTALGRID)) {
-        WalkYTicks(graph, graph.yTickStepCopy, area.top, area.bottom,
-                   [&](double, int y) { DrawLine(dc, area.left, y, area.right, y); });
+        WalkAxisTicks(YAxis(graph), graph.yTickStepCopy, area.top, area.bottom,
+                      [&](double, int y) { DrawLine(dc, area.left, y, area.right, y); });
     }
     if (HasOption(graph, KORGRAPH_VERTICALGRID)) {
-        WalkXTicks(graph, graph.xTickStepCopy, area.left, area.right,
-                   [&](double, int x) { DrawLine(dc, x, area.top, x, area.bottom); });
+        WalkAxisTicks(XAxis(graph), graph.xTickStepCopy, area.left, area.right,
+                      [&](double, int x) { DrawLine(dc, x, area.top, x, area.bottom); });
     }
 }
 
@@ -111,8 +112,8 @@ void DrawXAxis(GraphRecord& graph, HDC dc) {
     if (!HasOption(graph, KORGRAPH_XTICKS)) return;
     SelectScope pen(dc, graph.hpenThin);
     const int half = graph.tickHalfLength;
-    WalkXTicks(graph, graph.xTickStep, plot.left, plot.right,
-               [&](double, int x) { DrawLine(dc, x, y - half, x, y + half); });
+    WalkAxisTicks(XAxis(graph), graph.xTickStep, plot.left, plot.right,
+                  [&](double, int x) { DrawLine(dc, x, y - half, x, y + half); });
 }
 
 void DrawYAxis(GraphRecord& graph, HDC dc) {
@@ -131,8 +132,8 @@ void DrawYAxis(GraphRecord& graph, HDC dc) {
     if (!HasOption(graph, KORGRAPH_YTICKS)) return;
     SelectScope pen(dc, graph.hpenThin);
     const int half = graph.tickHalfLength;
-    WalkYTicks(graph, graph.yTickStep, plot.top, plot.bottom,
-               [&](double, int y) { DrawLine(dc, x - half, y, x + half, y); });
+    WalkAxisTicks(YAxis(graph), graph.yTickStep, plot.top, plot.bottom,
+                  [&](double, int y) { DrawLine(dc, x - half, y, x + half, y); });
 }
 
 }  // namespace kor

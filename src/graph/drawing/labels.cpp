@@ -6,7 +6,9 @@
 #include "base/gdi_scopes.h"
 #include "graph/drawing/frame.h"
 #include "graph/scale/number_format.h"
-#include "graph/scale/walks.h"
+#include "graph/scale/scale.h"
+#include "graph/scale/ticks.h"
+#include "numbers/truncate.h"
 #include "text/text_run.h"
 
 namespace kor {
@@ -49,8 +51,8 @@ void DrawXCategories(const GraphRecord& graph, HDC dc, int top) {
     const RECT plot = PlotArea(graph);
     const int bottom = top + graph.xLabelHeight;
     ClipToArea(graph, dc, {plot.left + kClipInset, top, plot.right, bottom});
-    const CategoryRange range =
-        CategoriesBetween(graph, xValueAt(graph, plot.left - 1), xValueAt(graph, plot.right + 1));
+    const CategoryRange range = CategoriesBetween(graph, ValueAt(XAxis(graph), plot.left - 1),
+                                                  ValueAt(XAxis(graph), plot.right + 1));
     for (int i = range.first; i <= range.last; ++i) {
         const wchar_t* label = graph.categoryLabels[i - 1];
         const int x = xPixel(graph, i);
@@ -63,8 +65,8 @@ void DrawXCategories(const GraphRecord& graph, HDC dc, int top) {
 
 void DrawYCategories(const GraphRecord& graph, HDC dc, int left, int right) {
     const RECT plot = PlotArea(graph);
-    const CategoryRange range =
-        CategoriesBetween(graph, yValueAt(graph, plot.top - 1), yValueAt(graph, plot.bottom + 1));
+    const CategoryRange range = CategoriesBetween(graph, ValueAt(YAxis(graph), plot.top - 1),
+                                                  ValueAt(YAxis(graph), plot.bottom + 1));
     for (int i = range.first; i <= range.last; ++i) {
         const wchar_t* label = graph.categoryLabels[i - 1];
         const int y = yPixel(graph, i);
@@ -84,7 +86,7 @@ void DrawXAxisLabels(const GraphRecord& graph, HDC dc) {
         DrawXCategories(graph, dc, top);
         return;
     }
-    WalkXTicks(graph, graph.xTickStep, plot.left, plot.right, [&](double value, int x) {
+    WalkAxisTicks(XAxis(graph), graph.xTickStep, plot.left, plot.right, [&](double value, int x) {
         DrawNumber(graph, dc, value,
                    {x - graph.xTickHalfSpacing, top, x + graph.xTickHalfSpacing,
                     top + graph.xLabelHeight});
@@ -101,7 +103,7 @@ void DrawYAxisLabels(const GraphRecord& graph, HDC dc) {
         DrawYCategories(graph, dc, left, right);
         return;
     }
-    WalkYTicks(graph, graph.yTickStep, plot.top, plot.bottom, [&](double value, int y) {
+    WalkAxisTicks(YAxis(graph), graph.yTickStep, plot.top, plot.bottom, [&](double value, int y) {
         DrawNumber(graph, dc, value,
                    {left, y - graph.labelHalfHeight, right, y + graph.labelHalfHeight});
     });

@@ -3,7 +3,7 @@
 #include "base/gdi_scopes.h"
 #include "graph/drawing/area.h"
 #include "graph/drawing/frame.h"
-#include "graph/drawing/points.h"
+#include "graph/drawing/series_points.h"
 #include "graph/scale/scale.h"
 
 namespace kor {
@@ -17,7 +17,8 @@ void DrawLineSeries(const GraphRecord& graph, HDC dc, const GraphSeries& series)
     SelectScope selected(dc, pen.get());
     const RECT view = PlotClip(graph);
     SeriesPoints points;
-    if (!points.Make(graph, series, view.left - 1, view.right + 1, PointsOf::polyline, 0)) return;
+    if (!points.Make(TraceOf(graph, series), view.left - 1, view.right + 1, PointsOf::polyline, 0))
+        return;
     if (points.count() > 1) Polyline(dc, points.begin(), points.count());
     if (graph.chartType == kLine) DrawSeriesMarkers(graph, dc, series);
 }
@@ -30,7 +31,7 @@ void DrawAreaSeries(const GraphRecord& graph, HDC dc, const GraphSeries& series)
     constexpr int kBasePoint = 1;
     constexpr int kClosingPoint = 1;
     SeriesPoints points;
-    if (!points.Make(graph, series, view.left - 1, view.right + 1, PointsOf::polygon,
+    if (!points.Make(TraceOf(graph, series), view.left - 1, view.right + 1, PointsOf::polygon,
                      kBasePoint + kClosingPoint)) {
         return;
     }

@@ -9,9 +9,7 @@
 #include "base/runtime.h"
 #include "graph/drawing/frame.h"
 #include "graph/drawing/lines.h"
-#include "graph/drawing/points.h"
-#include "graph/scale/number_format.h"
-#include "graph/scale/scale.h"
+#include "graph/drawing/series_points.h"
 
 namespace kor {
 
@@ -187,28 +185,27 @@ private:
 
 // found(y) for each row that holds one of the points [number, end) of a column.
 template <typename Found>
-void ForEachNewRow(const GraphRecord& graph, const double* values, int number, int end,
-                   RowSet& rows, Found found) {
-    const PositionSummary summary = Summarise(values, number, end);
+void ForEachNewRow(const ValueTrace& trace, int number, int end, RowSet& rows, Found found) {
+    const PositionSummary summary = Summarise(trace.values, number, end);
     if (summary.first < 0) return;
-    rows.Begin(yPixel(graph, values[summary.highest]), yPixel(graph, values[summary.lowest]));
+    rows.Begin(PixelAt(trace.y, trace.values[summary.highest]),
+               PixelAt(trace.y, trace.values[summary.lowest]));
     for (int i = number; i < end && rows.MayGrow(); ++i) {
-        const double value = values[i - 1];
+        const double value = trace.values[i - 1];
         if (!IsFinite(value)) continue;
-        const int y = yPixel(graph, value);
+        const int y = PixelAt(trace.y, value);
         if (rows.Insert(y)) found(y);
     }
 }
 
-bool DrawUnited(const GraphRecord& graph, HDC dc, const GraphSeries& series, PointRange range,
-                const RECT& view) {
+bool DrawUnited(HDC dc, const ValueTrace& trace, PointRange range, const RECT& view) {
     const CircleRows* circle = LearnCircle(dc);
     if (!circle) return false;
     Coverage coverage(view);
     RowSet seen(view.top - kRadius, view.bottom - view.top + kSide);
     if (!coverage.IsMade() || !seen.IsMade()) return false;
-    for (PositionWalk walk(graph, xPixel, range); !walk.IsAtEnd(); walk.Next()) {
-        ForEachNewRow(graph, series.values, walk.number(), walk.end(), seen,
+    for (PositionWalk walk(trace.x, range); !walk.IsAtEnd(); walk.Next()) {
+        ForEachNewRow(trace, walk.number(), walk.end(), seen,
                       [&](int y) { coverage.AddCircle(*circle, walk.pixel(), y); });
     }
     coverage.ForEachRun([&](int x, int y, int width) { PatBlt(dc, x, y, width, 1, PATCOPY); });
@@ -224,13 +221,14 @@ void DrawSeriesMarkers(const GraphRecord& graph, HDC dc, const GraphSeries& seri
     LocalGdiObject<HBRUSH> brush(CreateSolidBrush(series.colour));
     SelectScope selected(dc, brush.get());
     const RECT view = PlotClip(graph);
+    const ValueTrace trace = TraceOf(graph, series);
     const PointRange range =
-        PointsBetween(graph, xPixel, series.pointCount, view.left - kRadius, view.right + kRadius);
+        PointsBetween(trace.x, trace.count, view.left - kRadius, view.right + kRadius);
     const bool many = range.last - range.first + 1 > kFewPoints;
-    if (many && IsRasterImage(dc) && DrawUnited(graph, dc, series, range, view)) return;
+    if (many && IsRasterImage(dc) && DrawUnited(dc, trace, range, view)) return;
     for (int i = range.first; i <= range.last; ++i) {
-        const double value = series.values[i - 1];
-        if (IsFinite(value)) DrawCircle(dc, xPixel(graph, i), yPixel(graph, value));
+        const double value = trace.values[i - 1];
+        if (IsFinite(value)) DrawCircle(dc, PixelAt(trace.x, i), PixelAt(trace.y, value));
     }
 }
 

@@ -3,7 +3,6 @@
 #include <korcontrols/graph.h>
 
 #include <algorithm>
-#include <cmath>
 #include <iterator>
 
 #include "base/assert.h"
@@ -12,54 +11,21 @@
 #include "graph/data/palette.h"
 #include "graph/data/series.h"
 #include "graph/drawing/frame.h"
-#include "graph/drawing/slice_walk.h"
-#include "graph/scale/number_format.h"
+#include "numbers/truncate.h"
 
 namespace kor {
 
 namespace {
 
-constexpr int kBoxGap = 4;
 constexpr int kLabelGap = 4;
-constexpr double kRadiansPerDegree = 0.017453292519943295;
 constexpr double kFullTurn = 360.0;
 
-void DrawRadius(HDC dc, POINT centre, int dx, int dy) {
-    const POINT ends[] = {centre, {centre.x + dx, centre.y + dy}};
+void DrawRadius(HDC dc, Point centre, int dx, int dy) {
+    const POINT ends[] = {{centre.x, centre.y}, {centre.x + dx, centre.y + dy}};
     Polyline(dc, ends, 2);
 }
 
-// The end of a radius, from the centre, in whole pixels.
-POINT RadiusEnd(int radius, double degrees) {
-    double dx = 0;
-    double dy = -radius;
-    RotateVector(dx, dy, degrees);
-    return {TruncateToInt(dx), TruncateToInt(dy)};
-}
-
-// Where one slice ends and the next one begins. The three functions of its angle cost much where
-// there is no floating-point unit, so both slices share them.
-struct Boundary {
-    SliceEdge edge;
-    POINT end;  // of its radius, from the centre
-};
-
-bool IsSamePoint(POINT a, POINT b) { return a.x == b.x && a.y == b.y; }
-
-Boundary BoundaryAt(int radius, double degrees) {
-    return {MakeSliceEdge(degrees), RadiusEnd(radius, degrees)};
-}
-
-// Rows that hold pixels of a slice, and some more: from the centre to its arc.
-RowRange RowsOfSlice(int radius, const Boundary& start, const Boundary& end) {
-    constexpr int kSpare = 2;
-    const int startRow = start.end.y;
-    const int endRow = end.end.y;
-    const bool reachesBottom = start.edge.degrees <= 180.0 && end.edge.degrees >= 180.0;
-    const int lowest = reachesBottom ? radius : std::max({startRow, endRow, 0});
-    return {std::max(std::min({startRow, endRow, 0}) - kSpare, -radius),
-            std::min(lowest + kSpare, radius)};
-}
+bool IsSamePoint(Point a, Point b) { return a.x == b.x && a.y == b.y; }
 
 // A pen for each colour of the slices, made when it is first asked for.
 class SlicePens {
@@ -99,7 +65,7 @@ public:
     void FillPieSlice(const Boundary& start, const Boundary& end, HPEN pen) const {
         SelectScope selected(dc_, pen);
         if (!halfWidths_ || !(end.edge.degrees > start.edge.degrees)) return;
-        const POINT centre = pie_.centre;
+        const Point centre = pie_.centre;
         const RowRange rows = RowsOfSlice(pie_.radius, start, end);
         KOR_ASSERT(rows.first >= -pie_.radius &&
                    rows.last <= pie_.radius);  // halfWidths_ ends there
@@ -119,15 +85,15 @@ private:
 // The radius where a slice begins is drawn when the slice is filled, as the fill may have covered
 // it. While slices are so thin that the next one begins at the same pixel, the last of them does
 // that for all: the number of lines depends on the radius, not on the slices.
-void DrawSlices(const GraphSeries& series, HDC dc, const PieLayout& pie) {
+void DrawSlices(const Slices& slices, HDC dc, const PieLayout& pie) {
     SlicePens pens;
     const DiscFiller disc(dc, pie);
     Boundary end = BoundaryAt(pie.radius, 0);
-    for (int k = 0; k < series.pointCount; ++k) {
+    for (int k = 0; k < slices.count; ++k) {
         const Boundary start = end;
-        end = BoundaryAt(pie.radius, start.edge.degrees + SliceShare(series, k) * kFullTurn);
+        end = BoundaryAt(pie.radius, start.edge.degrees + ShareOf(slices, k) * kFullTurn);
         disc.FillPieSlice(start, end, pens.Of(k));
-        const bool isLast = k == series.pointCount - 1;
+        const bool isLast = k == slices.count - 1;
         if (isLast || !IsSamePoint(start.end, end.end)) {
             DrawRadius(dc, pie.centre, start.end.x, start.end.y);
         }
@@ -141,7 +107,7 @@ struct LabelPlace {
 };
 
 // Outwards of the label's point, by the quarter it lies in.
-LabelPlace PlaceLabel(const GraphRecord& graph, POINT centre, POINT at) {
+LabelPlace PlaceLabel(const GraphRecord& graph, Point centre, Point at) {
     const int width = graph.tipWidth;
     const int height = graph.tipHeight;
     if (at.x < centre.x && at.y <= centre.y) {
@@ -165,7 +131,7 @@ public:
         : limit_(widths.stencil ? 1 : kChannelValues) {}
 
     // Whether to draw a percentage at a place. Places come in the order of their angles.
-    bool IsNeeded(POINT at, int percentage) {
+    bool IsNeeded(Point at, int percentage) {
         if (percentage < 0 || percentage > kWhole) return true;
         if (!isStarted_ || !IsSamePoint(at, at_)) {
             std::fill(std::begin(drawn_), std::end(drawn_), uint8_t{0});
@@ -183,21 +149,21 @@ private:
 
     int limit_;
     bool isStarted_ = false;
-    POINT at_ = {};
+    Point at_ = {};
     uint8_t drawn_[kWhole + 1] = {};  // of each percentage at this place
 };
 
-void DrawPercentages(const GraphRecord& graph, const GraphSeries& series, HDC dc, int radius) {
+void DrawPercentages(const GraphRecord& graph, const Slices& slices, HDC dc, int radius) {
     SelectScope font(dc, graph.hfontAxis);
-    const POINT centre = SurfaceCentre(graph);
+    const Point centre = CentreOf(SurfaceOf(graph));
     RepeatedLabels repeated(graph.numberWidths);
     double end = 0;
-    for (int k = 0; k < series.pointCount; ++k) {
+    for (int k = 0; k < slices.count; ++k) {
         const double start = end;
-        const double share = SliceShare(series, k);
+        const double share = ShareOf(slices, k);
         end += share * kFullTurn;
         const int percentage = TruncateToInt(share * 100.0 + 0.5);
-        const POINT offset = RadiusEnd(radius + kLabelGap, (start + end) * 0.5);
+        const Point offset = RadiusEnd(radius + kLabelGap, (start + end) * 0.5);
         if (!repeated.IsNeeded(offset, percentage)) continue;
         const LabelPlace place =
             PlaceLabel(graph, centre, {centre.x + offset.x, centre.y + offset.y});
@@ -216,43 +182,21 @@ POINT SurfaceCentre(const GraphRecord& graph) {
 }
 
 PieLayout LayoutPie(const GraphRecord& graph) {
-    const RECT& surface = graph.rcPlot;
     const bool titled = HasOption(graph, KORGRAPH_TITLE) && graph.title;
-    RECT box = {surface.left + graph.tipWidth + kBoxGap,
-                surface.top + graph.tipHeight + kBoxGap + (titled ? graph.marginTop : 0),
-                surface.right - graph.tipWidth - kBoxGap,
-                surface.bottom - graph.tipHeight - kBoxGap};
-    const int width = box.right - box.left;
-    const int height = box.bottom - box.top;
-    if (width <= height) {
-        const int middle = (box.top + box.bottom) / 2;
-        box.top = middle - width / 2;
-        box.bottom = middle + width / 2;
-    } else {
-        const int middle = (box.left + box.right) / 2;
-        box.left = middle - height / 2;
-        box.right = middle + height / 2;
-    }
-    const int radius = (box.bottom - box.top) / 2;
-    return {box, {box.left + (box.right - box.left) / 2, box.top + radius}, radius};
+    return LayoutPie(SurfaceOf(graph), {graph.tipWidth, graph.tipHeight},
+                     titled ? graph.marginTop : 0);
 }
 
 bool HasSlices(const GraphSeries* series) {
     return series && series->values && series->absSum > 0 && IsFinite(series->absSum);
 }
 
-double SliceShare(const GraphSeries& series, int slice) {
-    const double value = series.values[slice];
-    return IsFinite(value) ? std::fabs(value) / series.absSum : 0.0;
+Slices SlicesOf(const GraphSeries& series) {
+    return {series.values, series.pointCount, series.absSum};
 }
 
-void RotateVector(double& dx, double& dy, double degrees) {
-    const double angle = degrees * kRadiansPerDegree;
-    const double sine = std::sin(angle);
-    const double cosine = std::cos(angle);
-    const double turnedX = dx * cosine + dy * sine;
-    dy = -dx * sine + dy * cosine;
-    dx = turnedX;
+Rect SurfaceOf(const GraphRecord& graph) {
+    return {graph.rcPlot.left, graph.rcPlot.top, graph.rcPlot.right, graph.rcPlot.bottom};
 }
 
 void DrawPieChart(GraphRecord& graph, HDC dc) {
@@ -262,13 +206,13 @@ void DrawPieChart(GraphRecord& graph, HDC dc) {
     if (!series || !series->values) return;
     const PieLayout pie = LayoutPie(graph);
     DrawRadius(dc, pie.centre, 0, -pie.radius);
-    if (HasSlices(series)) DrawSlices(*series, dc, pie);
+    if (HasSlices(series)) DrawSlices(SlicesOf(*series), dc, pie);
     {
         SelectScope hollow(dc, GetStockObject(NULL_BRUSH));
         Ellipse(dc, pie.box.left, pie.box.top, pie.box.right, pie.box.bottom);
     }
     if (HasSlices(series) && HasOption(graph, KORGRAPH_PERCENTAGES)) {
-        DrawPercentages(graph, *series, dc, pie.radius);
+        DrawPercentages(graph, SlicesOf(*series), dc, pie.radius);
     }
     if (graph.hwnd) InvalidateRect(graph.hwnd, nullptr, FALSE);
 }

@@ -1,6 +1,7 @@
 #include "graph/scale/number_format.h"
 
-#include "base/runtime.h"
+#include <string.h>
+#include <wchar.h>
 
 namespace kor {
 
@@ -17,13 +18,6 @@ void ShortenExponent(wchar_t* text) {
 }
 
 }  // namespace
-
-int TruncateToInt(double value) {
-    if constexpr (!kHasFloatingPoint) return TruncateByBits(value, kPixelLimitBits);
-    if (value >= kPixelLimit) return kPixelLimit;
-    if (value <= -kPixelLimit) return -kPixelLimit;
-    return value == value ? static_cast<int>(value) : 0;
-}
 
 int FormatGraphNumber(double value, wchar_t* buffer, int precision) {
     if (!buffer) return 0;

@@ -4,9 +4,6 @@
 
 #include <algorithm>
 #include <cmath>
-#include <limits>
-
-#include "graph/scale/number_format.h"
 
 namespace kor {
 
@@ -15,63 +12,6 @@ namespace {
 constexpr double kXTickPixels = 50.0;
 constexpr double kYTickPixels = 25.0;
 
-// One axis' part of the mapping.
-struct AxisScale {
-    double centre;
-    double unitsPerPixelBase;
-    double unitsPerPixel;
-    double tickStep;  // may be 0
-    int barSize;
-};
-
-// A range as wide as numbers go has no width that is one; half of it has.
-double HalfRange(double low, double high) { return high * 0.5 - low * 0.5; }
-
-double TickStep(double range, double unitsPerPixelBase, double zoom, double tickPixels) {
-    double step;
-    if (range < 1.0) {
-        step = 1.0 / std::pow(10.0, std::ceil(std::log10(1.0 / std::fabs(range))));
-    } else {
-        step = std::fabs(std::ceil((1.0 / zoom) * tickPixels * unitsPerPixelBase));
-    }
-    return IsFinite(step) ? step : 1.0;
-}
-
-AxisScale ScaleAxis(double low, double high, int extent, const GraphRecord& graph,
-                    double tickPixels) {
-    const double range = high - low;
-    const int pixels = std::max(extent, 1);  // a window smaller than its margins
-    AxisScale scale;
-    if (IsFinite(range)) {
-        scale.centre = range * 0.5 + low;
-        scale.unitsPerPixelBase = std::fabs(range) / pixels;
-    } else {
-        scale.centre = high * 0.5 + low * 0.5;
-        scale.unitsPerPixelBase = std::fabs(HalfRange(low, high)) / pixels * 2.0;
-    }
-    if (!IsFinite(scale.centre)) scale.centre = 0.0;
-    if (!IsFinite(scale.unitsPerPixelBase) || scale.unitsPerPixelBase == 0.0) {
-        scale.unitsPerPixelBase = 1.0;
-    }
-    scale.unitsPerPixel = (1.0 / graph.zoom) * scale.unitsPerPixelBase;
-    if (!IsFinite(scale.unitsPerPixel)) {
-        scale.unitsPerPixel = std::numeric_limits<double>::max();
-    }
-    scale.barSize = graph.seriesCount > 0 ? TruncateToInt(pixels / range / graph.seriesCount) : 0;
-    scale.tickStep = TickStep(range, std::fabs(range) / pixels, graph.zoom, tickPixels);
-    return scale;
-}
-
-// Pixels from the centre to a value. `scale` is of the same mapping, or knows nothing.
-inline int PixelsFromCentre(double value, double centre, double unitsPerPixel,
-                            const PixelScale& scale) {
-    if constexpr (!kHasFloatingPoint) {
-        const int pixels = QuickPixels(scale, value);
-        if (pixels != kUnknownPixels) return pixels;
-    }
-    return TruncateToInt((value - centre) / unitsPerPixel);
-}
-
 // After any change of an axis' centre or units.
 void UpdateScale(PixelScale& scale, double centre, double unitsPerPixel) {
     if constexpr (!kHasFloatingPoint) scale = MakePixelScale(centre, unitsPerPixel);
@@ -79,15 +19,17 @@ void UpdateScale(PixelScale& scale, double centre, double unitsPerPixel) {
 
 }  // namespace
 
-int xPixel(const GraphRecord& graph, double x) {
-    return graph.xCentrePixel +
-           PixelsFromCentre(x, graph.xCentre, graph.xUnitsPerPixel, graph.xScale);
+Axis XAxis(const GraphRecord& graph) {
+    return {graph.xCentre, graph.xUnitsPerPixel, graph.xCentrePixel, 1, graph.xScale};
 }
 
-int yPixel(const GraphRecord& graph, double y) {
-    return graph.yCentrePixel -
-           PixelsFromCentre(y, graph.yCentre, graph.yUnitsPerPixel, graph.yScale);
+Axis YAxis(const GraphRecord& graph) {
+    return {graph.yCentre, graph.yUnitsPerPixel, graph.yCentrePixel, -1, graph.yScale};
 }
+
+int xPixel(const GraphRecord& graph, double x) { return PixelAt(XAxis(graph), x); }
+
+int yPixel(const GraphRecord& graph, double y) { return PixelAt(YAxis(graph), y); }
 
 void MoveXCentre(GraphRecord& graph, double by) {
     graph.xCentre += by;
@@ -103,7 +45,8 @@ void RescaleX(GraphRecord& graph) {
     if (!graph.hwnd) return;
     const RECT plot = PlotArea(graph);
     const int width = plot.right - plot.left;
-    const AxisScale scale = ScaleAxis(graph.xMin, graph.xMax, width, graph, kXTickPixels);
+    const AxisScale scale =
+        ScaleAxis(graph.xMin, graph.xMax, width, graph.zoom, graph.seriesCount, kXTickPixels);
     graph.barWidth = scale.barSize;
     graph.xCentre = scale.centre;
     graph.xUnitsPerPixelBase = scale.unitsPerPixelBase;
@@ -120,7 +63,8 @@ void RescaleY(GraphRecord& graph) {
     if (!graph.hwnd) return;
     const RECT plot = PlotArea(graph);
     const int height = plot.bottom - plot.top;
-    const AxisScale scale = ScaleAxis(graph.yMin, graph.yMax, height, graph, kYTickPixels);
+    const AxisScale scale =
+        ScaleAxis(graph.yMin, graph.yMax, height, graph.zoom, graph.seriesCount, kYTickPixels);
     graph.barHeight = scale.barSize;
     graph.yCentre = scale.centre;
     graph.yUnitsPerPixelBase = scale.unitsPerPixelBase;

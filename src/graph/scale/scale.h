@@ -1,12 +1,16 @@
-// Data values to pixels: one linear mapping per axis, centred on the plot area and scaled by the
-// zoom.
+// The axes of a chart: what its record says of them, and what changes them.
 #pragma once
 
 #include "graph/record.h"
+#include "graph/scale/axis.h"
 
 namespace kor {
 
-// Image column of an x value, image row of a y value. Monotone, whatever the value.
+// The two mappings as they are now, to columns and rows of the image.
+Axis XAxis(const GraphRecord& graph);
+Axis YAxis(const GraphRecord& graph);
+
+// The same for a single value. Monotone, whatever the value.
 int xPixel(const GraphRecord& graph, double x);
 int yPixel(const GraphRecord& graph, double y);
 

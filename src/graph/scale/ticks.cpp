@@ -3,8 +3,6 @@
 #include <algorithm>
 #include <cmath>
 
-#include "graph/scale/number_format.h"
-
 namespace kor {
 
 namespace {

@@ -1,6 +1,8 @@
 // Where ticks, grid lines and number labels stand on an axis: at the multiples of a step, as two
-// walks from 0 outwards would find them. No DC.
+// walks from 0 outwards would find them. Numbers only.
 #pragma once
+
+#include "graph/scale/axis.h"
 
 namespace kor {
 
@@ -36,6 +38,20 @@ void WalkTicks(TickRange range, int lowEdge, int highEdge, ToPixel toPixel, Draw
         const int pixel = toPixel(k);
         if (IsDrawnForward(pixel, lowEdge, highEdge)) draw(k, pixel);
     }
+}
+
+// draw(value, pixel) for the multiples of `step` between two pixels of an axis, lowEdge <=
+// highEdge. Where pixels grow against the values, the walk below 0 runs towards the higher pixels.
+template <typename Draw>
+void WalkAxisTicks(const Axis& axis, double step, int lowEdge, int highEdge, Draw draw) {
+    const TickRange range =
+        TicksBetween(ValueAt(axis, lowEdge - 1), ValueAt(axis, highEdge + 1), step);
+    const Axis upwards = axis.sign > 0 ? axis : Reversed(axis);
+    const int low = axis.sign > 0 ? lowEdge : -highEdge;
+    const int high = axis.sign > 0 ? highEdge : -lowEdge;
+    WalkTicks(
+        range, low, high, [&](double k) { return PixelAt(upwards, k * step); },
+        [&](double k, int pixel) { draw(k * step, axis.sign > 0 ? pixel : -pixel); });
 }
 
 }  // namespace kor

@@ -4,7 +4,7 @@
 // and a slice is what lies between the places of its two angles. The column of a boundary belongs
 // to the slice on its right, and the circle's own point on the right to none, as spans leave out
 // their last pixel.
-#include "graph/drawing/disc.h"
+#include "graph/shapes/disc.h"
 
 #include <algorithm>
 #include <cmath>

@@ -1,21 +1,18 @@
-#include "graph/drawing/points.h"
+#include "graph/shapes/points.h"
 
 #include <algorithm>
 
 #include "base/assert.h"
-#include "base/local_text.h"
-#include "graph/scale/number_format.h"
-#include "graph/scale/scale.h"
 
 namespace kor {
 
 namespace {
 
 // The first number in [low, high) whose position is at least `pixel`; high when there is none.
-int FirstAtOrPast(const GraphRecord& graph, AlongAxis along, int low, int high, int pixel) {
+int FirstAtOrPast(const Axis& along, int low, int high, int pixel) {
     while (low < high) {
         const int middle = low + (high - low) / 2;
-        if (along(graph, middle) >= pixel) {
+        if (PixelAt(along, middle) >= pixel) {
             high = middle;
         } else {
             low = middle + 1;
@@ -24,29 +21,28 @@ int FirstAtOrPast(const GraphRecord& graph, AlongAxis along, int low, int high, 
     return low;
 }
 
-// Values that are no numbers have no point: the line goes on to the next value that is one, even
-// far outside the view, and ends at the last.
-PointRange WithNumbersAtEnds(const GraphSeries& series, PointRange range) {
-    const double* values = series.values;
+// NaNs and infinities have no point: the line goes on to the next finite value, even far outside
+// the view, and ends at the last.
+PointRange WithNumbersAtEnds(const ValueTrace& trace, PointRange range) {
+    const double* values = trace.values;
     while (range.first > 1 && !IsFinite(values[range.first - 1])) --range.first;
-    while (range.last < series.pointCount && !IsFinite(values[range.last - 1])) ++range.last;
+    while (range.last < trace.count && !IsFinite(values[range.last - 1])) ++range.last;
     while (range.last >= range.first && !IsFinite(values[range.last - 1])) --range.last;
     return range;
 }
 
 }  // namespace
 
-PointRange PointsBetween(const GraphRecord& graph, AlongAxis along, int count, int lowPixel,
-                         int highPixel) {
-    const int first = FirstAtOrPast(graph, along, 1, count + 1, lowPixel);
-    const int past = FirstAtOrPast(graph, along, first, count + 1, highPixel + 1);
+PointRange PointsBetween(const Axis& along, int count, int lowPixel, int highPixel) {
+    const int first = FirstAtOrPast(along, 1, count + 1, lowPixel);
+    const int past = FirstAtOrPast(along, first, count + 1, highPixel + 1);
     return {std::max(first - 1, 1), std::min(past, count)};
 }
 
-PositionWalk::PositionWalk(const GraphRecord& graph, AlongAxis along, PointRange range)
-    : graph_(graph), along_(along), range_(range), number_(range.first), end_(range.first) {
+PositionWalk::PositionWalk(const Axis& along, PointRange range)
+    : along_(along), range_(range), number_(range.first), end_(range.first) {
     if (IsAtEnd()) return;
-    pixel_ = along(graph, number_);
+    pixel_ = PixelAt(along_, number_);
     FindEnd(number_ + 1);
 }
 
@@ -72,7 +68,7 @@ void PositionWalk::FindEnd(int expected) {
 
 // Narrows the place of the end by a point between the two that are known.
 void PositionWalk::Try(int number) {
-    const int pixel = along_(graph_, number);
+    const int pixel = PixelAt(along_, number);
     if (pixel == pixel_) {
         low_ = number;
     } else {
@@ -104,75 +100,94 @@ PositionSummary Summarise(const double* values, int number, int end) {
     return found;
 }
 
-SeriesPoints::~SeriesPoints() { FreeLocal(points_); }
+namespace {
 
-void SeriesPoints::Append(const GraphRecord& graph, const GraphSeries& series, int column,
-                          int index) {
-    KOR_ASSERT(count_ < capacity_);
-    points_[spare_ + count_++] = {column, yPixel(graph, series.values[index])};
-}
+// Appends to an array that has room for all.
+class PointWriter {
+public:
+    PointWriter(const ValueTrace& trace, Point* points, int capacity)
+        : trace_(trace), points_(points), capacity_(capacity) {}
+
+    int count() const { return count_; }
+
+    void AppendPosition(int column, int number, int end);
+    void AppendLastPosition(int column, int number, int end);
+
+private:
+    void Append(int column, int index) {
+        KOR_ASSERT(count_ < capacity_);
+        points_[count_++] = {column, PixelAt(trace_.y, trace_.values[index])};
+    }
+
+    const ValueTrace& trace_;
+    Point* points_;
+    int capacity_;
+    int count_ = 0;
+};
 
 // The first and the last point, and between them each extreme that lies beyond both. Those are all
 // different points, even where values tie: so at most four, and never more than there are.
-void SeriesPoints::AppendPosition(const GraphRecord& graph, const GraphSeries& series, int column,
-                                  int number, int end) {
-    const PositionSummary found = Summarise(series.values, number, end);
+void PointWriter::AppendPosition(int column, int number, int end) {
+    const PositionSummary found = Summarise(trace_.values, number, end);
     if (found.first < 0) return;
-    const auto valueOf = [&](int index) { return ComparableOf(series.values[index]); };
+    const auto valueOf = [&](int index) { return ComparableOf(trace_.values[index]); };
     const Comparable first = valueOf(found.first);
     const Comparable last = valueOf(found.last);
     const bool reachesLower = valueOf(found.lowest) < std::min(first, last);
     const bool reachesHigher = valueOf(found.highest) > std::max(first, last);
     // Either way over both extremes has the same pixels; this is the shorter one.
     const bool highestFirst = first > last;
-    Append(graph, series, column, found.first);
-    if (reachesHigher && highestFirst) Append(graph, series, column, found.highest);
-    if (reachesLower) Append(graph, series, column, found.lowest);
-    if (reachesHigher && !highestFirst) Append(graph, series, column, found.highest);
-    if (found.last != found.first) Append(graph, series, column, found.last);
+    Append(column, found.first);
+    if (reachesHigher && highestFirst) Append(column, found.highest);
+    if (reachesLower) Append(column, found.lowest);
+    if (reachesHigher && !highestFirst) Append(column, found.highest);
+    if (found.last != found.first) Append(column, found.last);
 }
 
-// Point end - 1 is there. The polyline's last pixel is that of its last points, as many as share
-// it: a line that ends there leaves it out, but one that has gone over it before has drawn it. So
-// what comes before them is summarised by itself.
-void SeriesPoints::AppendLastPosition(const GraphRecord& graph, const GraphSeries& series,
-                                      int column, int number, int end) {
-    const double* values = series.values;
+// Requires that point end - 1 is finite. Polyline omits its final pixel unless an earlier segment
+// has drawn it, so the run of points that share that pixel is appended separately from the rest of
+// the column.
+void PointWriter::AppendLastPosition(int column, int number, int end) {
+    const double* values = trace_.values;
     const int last = end - 1;
-    const int row = yPixel(graph, values[last - 1]);
+    const int row = PixelAt(trace_.y, values[last - 1]);
     int first = last;
     for (int i = last - 1; i >= number; --i) {
         if (!IsFinite(values[i - 1])) continue;
-        if (yPixel(graph, values[i - 1]) != row) break;
+        if (PixelAt(trace_.y, values[i - 1]) != row) break;
         first = i;
     }
-    AppendPosition(graph, series, column, number, first);
-    if (first != last) Append(graph, series, column, first - 1);
-    Append(graph, series, column, last - 1);
+    AppendPosition(column, number, first);
+    if (first != last) Append(column, first - 1);
+    Append(column, last - 1);
 }
 
-bool SeriesPoints::Make(const GraphRecord& graph, const GraphSeries& series, int left, int right,
-                        PointsOf shape, int spare) {
+}  // namespace
+
+PointRange RangeInView(const ValueTrace& trace, int left, int right) {
+    return WithNumbersAtEnds(trace, PointsBetween(trace.x, trace.count, left, right));
+}
+
+int PointCapacity(PointRange range, int left, int right) {
     constexpr int kPointsPerPosition = 4;  // see AppendPosition
     constexpr int kPointsAtTheEnd = 2;     // those that AppendLastPosition appends itself
-    const PointRange range =
-        WithNumbersAtEnds(series, PointsBetween(graph, xPixel, series.pointCount, left, right));
     const int all = std::max(range.last - range.first + 1, 0);
     // Positions with values: those from `left` to `right`, and one on either side.
     const int positions = std::max(right - left, 0) + 1 + 2;
-    capacity_ = std::min(all, positions * kPointsPerPosition + kPointsAtTheEnd);
-    points_ = static_cast<POINT*>(
-        LocalAlloc(LMEM_FIXED, static_cast<SIZE_T>(capacity_ + 2 * spare) * sizeof(POINT)));
-    if (!points_) return false;
-    spare_ = spare;
-    for (PositionWalk walk(graph, xPixel, range); !walk.IsAtEnd(); walk.Next()) {
+    return std::min(all, positions * kPointsPerPosition + kPointsAtTheEnd);
+}
+
+int FillPoints(const ValueTrace& trace, PointRange range, PointsOf shape, Point* points,
+               int capacity) {
+    PointWriter writer(trace, points, capacity);
+    for (PositionWalk walk(trace.x, range); !walk.IsAtEnd(); walk.Next()) {
         if (shape == PointsOf::polyline && walk.end() > range.last) {
-            AppendLastPosition(graph, series, walk.pixel(), walk.number(), walk.end());
+            writer.AppendLastPosition(walk.pixel(), walk.number(), walk.end());
         } else {
-            AppendPosition(graph, series, walk.pixel(), walk.number(), walk.end());
+            writer.AppendPosition(walk.pixel(), walk.number(), walk.end());
         }
     }
-    return true;
+    return writer.count();
 }
 
 }  // namespace kor

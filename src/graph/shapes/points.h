@@ -1,9 +1,10 @@
 // A series as the points that its picture needs. A picture has only so many pixels, so of the
-// points that share a pixel position along the axis four say all: the first, the lowest, the
-// highest and the last. Values that are no numbers, or infinite, have no point. No DC.
+// points in one pixel column only four matter: the first, the lowest, the highest and the last.
+// NaNs and infinities have no point. Numbers only.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/scale/axis.h"
+#include "numbers/shapes.h"
 
 namespace kor {
 
@@ -13,18 +14,14 @@ struct PointRange {
     int last;
 };
 
-// Position of point number i along the axis that counts the points; never falls as i grows.
-using AlongAxis = int (*)(const GraphRecord& graph, double pointNumber);
-
-// The points of `count` whose positions lie between two pixels, and one more on each side.
-// Positions that fall as numbers grow (bar charts) are given negated.
-PointRange PointsBetween(const GraphRecord& graph, AlongAxis along, int count, int lowPixel,
-                         int highPixel);
+// The points of `count` whose positions lie between two pixels of the axis that counts the points,
+// and one more on each side. Pixels grow with the numbers; for rows give the axis reversed.
+PointRange PointsBetween(const Axis& along, int count, int lowPixel, int highPixel);
 
 // The points of a range that share a position, one position after the other.
 class PositionWalk {
 public:
-    PositionWalk(const GraphRecord& graph, AlongAxis along, PointRange range);
+    PositionWalk(const Axis& along, PointRange range);
 
     bool IsAtEnd() const { return number_ > range_.last; }
     void Next();
@@ -37,8 +34,7 @@ private:
     void FindEnd(int expected);
     void Try(int number);
 
-    const GraphRecord& graph_;
-    AlongAxis along_;
+    Axis along_;
     PointRange range_;
     int pixel_ = 0;
     int number_;
@@ -62,33 +58,23 @@ PositionSummary Summarise(const double* values, int number, int end);
 // there before; a polygon is closed.
 enum class PointsOf { polyline, polygon };
 
-// The points of a line or an area in image pixels, in order. Owns its array.
-class SeriesPoints {
-public:
-    SeriesPoints() = default;
-    ~SeriesPoints();
-    SeriesPoints(const SeriesPoints&) = delete;
-    SeriesPoints& operator=(const SeriesPoints&) = delete;
-
-    // Makes the points of a series for the view between two columns, with `spare` places before and
-    // after them; false without memory.
-    bool Make(const GraphRecord& graph, const GraphSeries& series, int left, int right,
-              PointsOf shape, int spare);
-
-    POINT* begin() { return points_ + spare_; }
-    int count() const { return count_; }
-
-private:
-    void Append(const GraphRecord& graph, const GraphSeries& series, int column, int index);
-    void AppendPosition(const GraphRecord& graph, const GraphSeries& series, int column, int number,
-                        int end);
-    void AppendLastPosition(const GraphRecord& graph, const GraphSeries& series, int column,
-                            int number, int end);
-
-    POINT* points_ = nullptr;
-    int capacity_ = 0;  // without the spare places
-    int spare_ = 0;
-    int count_ = 0;
+// Values against their numbers, from 1. Owns nothing.
+struct ValueTrace {
+    Axis x;
+    Axis y;
+    const double* values;
+    int count;
 };
+
+// The points for a view between two columns: from the one before the view to the one behind it, the
+// ends being finite.
+PointRange RangeInView(const ValueTrace& trace, int left, int right);
+
+// The most points that FillPoints makes of the range.
+int PointCapacity(PointRange range, int left, int right);
+
+// Writes the points of a line or an area in image pixels, in order, and returns how many.
+int FillPoints(const ValueTrace& trace, PointRange range, PointsOf shape, Point* points,
+               int capacity);
 
 }  // namespace kor

@@ -3,7 +3,7 @@
 
 #include <algorithm>
 
-#include "graph/drawing/disc.h"
+#include "graph/shapes/disc.h"
 
 namespace kor {
 

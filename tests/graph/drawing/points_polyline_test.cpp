@@ -2,7 +2,7 @@
 // its points, the missing last pixel included.
 #include "graph/number_graph.h"
 
-#include "graph/drawing/points.h"
+#include "graph/shapes/points.h"
 #include "support/bitmap_canvas.h"
 
 #include <cmath>

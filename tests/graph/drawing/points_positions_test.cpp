@@ -1,7 +1,7 @@
 // Points by the pixel that they share.
 #include "graph/number_graph.h"
 
-#include "graph/drawing/points.h"
+#include "graph/shapes/points.h"
 #include "graph/scale/scale.h"
 
 #include <random>

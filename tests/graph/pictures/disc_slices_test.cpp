@@ -1,5 +1,5 @@
 // The pixels of a pie's slices, by number alone.
-#include "graph/drawing/disc.h"
+#include "graph/shapes/disc.h"
 
 #include "graph/drawing/pie.h"
 

@@ -1,5 +1,5 @@
 // Slices on consecutive rows, by whole numbers, against each row for itself, in floating point.
-#include "graph/drawing/slice_walk.h"
+#include "graph/shapes/slice_walk.h"
 
 #include <gtest/gtest.h>
 
