@@ -3,7 +3,6 @@
 #include "base/assert.h"
 #include "base/runtime.h"
 #include "graph/data/series.h"
-#include "graph/drawing/pie.h"
 #include "graph/scale/number_format.h"
 #include "graph/scale/scale.h"
 #include "graph/shapes/bar_layout.h"

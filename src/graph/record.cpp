@@ -80,6 +80,10 @@ RECT PlotArea(const GraphRecord& graph) {
             graph.rcPlot.right - graph.marginRight, graph.rcPlot.bottom - graph.marginBottom};
 }
 
+Rect SurfaceOf(const GraphRecord& graph) {
+    return {graph.rcPlot.left, graph.rcPlot.top, graph.rcPlot.right, graph.rcPlot.bottom};
+}
+
 bool HasOption(const GraphRecord& graph, uint32_t option) { return (graph.options & option) != 0; }
 
 }  // namespace kor

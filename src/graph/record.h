@@ -6,6 +6,7 @@
 
 #include "base/records.h"
 #include "numbers/pixel_scale.h"
+#include "numbers/shapes.h"
 #include "platform/platform.h"
 #include "text/number_run.h"
 
@@ -143,6 +144,9 @@ void ResetGraphRanges(GraphRecord& graph);
 
 // Whether a KORGRAPH_ option bit is set.
 bool HasOption(const GraphRecord& graph, uint32_t option);
+
+// The whole image, or page.
+Rect SurfaceOf(const GraphRecord& graph);
 
 // The plot area: the image less its margins, ends exclusive as of a RECT.
 RECT PlotArea(const GraphRecord& graph);

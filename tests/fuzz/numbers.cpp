@@ -2,6 +2,7 @@
 #include "fuzz_input.h"
 
 #include "graph/scale/number_format.h"
+#include "numbers/truncate.h"
 
 #include <memory>
 #include <string>

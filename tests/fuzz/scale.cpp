@@ -2,9 +2,9 @@
 // are numbers, few, and in view.
 #include "fuzz_chart.h"
 
-#include "graph/scale/number_format.h"
 #include "graph/scale/scale.h"
 #include "graph/scale/ticks.h"
+#include "numbers/truncate.h"
 
 namespace korfuzz {
 namespace {

@@ -2,7 +2,6 @@
 #include "fuzz_chart.h"
 
 #include "graph/hit_test.h"
-#include "graph/scale/number_format.h"
 
 #include <memory>
 

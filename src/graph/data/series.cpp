@@ -6,7 +6,6 @@
 #include "base/local_text.h"
 #include "base/records.h"
 #include "graph/data/palette.h"
-#include "graph/scale/number_format.h"
 #include "graph/scale/scale.h"
 
 namespace kor {
@@ -280,6 +279,14 @@ COLORREF SeriesColour(const GraphRecord& graph, int index) {
 const wchar_t* SeriesName(const GraphRecord& graph, int index) {
     const GraphSeries* series = SeriesAt(graph, index);
     return series ? series->name : nullptr;
+}
+
+bool HasSlices(const GraphSeries* series) {
+    return series && series->values && series->absSum > 0 && IsFinite(series->absSum);
+}
+
+Slices SlicesOf(const GraphSeries& series) {
+    return {series.values, series.pointCount, series.absSum};
 }
 
 }  // namespace kor

@@ -4,6 +4,7 @@
 #include <korcontrols/graph.h>
 
 #include "graph/record.h"
+#include "graph/shapes/pie_layout.h"
 
 namespace kor {
 
@@ -28,6 +29,12 @@ GraphSeries* SeriesAt(const GraphRecord& graph, int index);
 
 // Colour of a series, or of a slice while the chart is a pie; 0 for a bad index.
 COLORREF SeriesColour(const GraphRecord& graph, int index);
+
+// Whether the series makes a pie: it has values, and they are not all 0.
+bool HasSlices(const GraphSeries* series);
+
+// The slices of a series that has some.
+Slices SlicesOf(const GraphSeries& series);
 
 // Name of a series; null without one and for a bad index.
 const wchar_t* SeriesName(const GraphRecord& graph, int index);

@@ -11,6 +11,8 @@
 #include "graph/data/palette.h"
 #include "graph/data/series.h"
 #include "graph/drawing/frame.h"
+#include "graph/scale/scale.h"
+#include "graph/shapes/pie_layout.h"
 #include "numbers/truncate.h"
 
 namespace kor {
@@ -179,24 +181,6 @@ void DrawPercentages(const GraphRecord& graph, const Slices& slices, HDC dc, int
 POINT SurfaceCentre(const GraphRecord& graph) {
     const RECT& surface = graph.rcPlot;
     return {(surface.left + surface.right) >> 1, (surface.top + surface.bottom) >> 1};
-}
-
-PieLayout LayoutPie(const GraphRecord& graph) {
-    const bool titled = HasOption(graph, KORGRAPH_TITLE) && graph.title;
-    return LayoutPie(SurfaceOf(graph), {graph.tipWidth, graph.tipHeight},
-                     titled ? graph.marginTop : 0);
-}
-
-bool HasSlices(const GraphSeries* series) {
-    return series && series->values && series->absSum > 0 && IsFinite(series->absSum);
-}
-
-Slices SlicesOf(const GraphSeries& series) {
-    return {series.values, series.pointCount, series.absSum};
-}
-
-Rect SurfaceOf(const GraphRecord& graph) {
-    return {graph.rcPlot.left, graph.rcPlot.top, graph.rcPlot.right, graph.rcPlot.bottom};
 }
 
 void DrawPieChart(GraphRecord& graph, HDC dc) {

@@ -136,4 +136,10 @@ int ZoomedThickness(const GraphRecord& graph, int thickness) {
     return graph.zoom >= 1.0 ? thickness : TruncateToInt(thickness * graph.zoom);
 }
 
+PieLayout LayoutPie(const GraphRecord& graph) {
+    const bool titled = HasOption(graph, KORGRAPH_TITLE) && graph.title;
+    return LayoutPie(SurfaceOf(graph), {graph.tipWidth, graph.tipHeight},
+                     titled ? graph.marginTop : 0);
+}
+
 }  // namespace kor

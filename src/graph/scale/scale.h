@@ -1,8 +1,9 @@
-// The axes of a chart: what its record says of them, and what changes them.
+// Where a chart's data stands on its surface, as its record says, and what changes that.
 #pragma once
 
 #include "graph/record.h"
 #include "graph/scale/axis.h"
+#include "graph/shapes/pie_layout.h"
 
 namespace kor {
 
@@ -13,6 +14,8 @@ Axis YAxis(const GraphRecord& graph);
 // The same for a single value. Monotone, whatever the value.
 int xPixel(const GraphRecord& graph, double x);
 int yPixel(const GraphRecord& graph, double y);
+
+PieLayout LayoutPie(const GraphRecord& graph);
 
 // Compute an axis' mapping, tick step and bar size from its range, the zoom and the plot area.
 void RescaleX(GraphRecord& graph);

@@ -2,7 +2,7 @@
 // its points, the missing last pixel included.
 #include "graph/number_graph.h"
 
-#include "graph/shapes/points.h"
+#include "graph/drawing/series_points.h"
 #include "support/bitmap_canvas.h"
 
 #include <cmath>
@@ -62,7 +62,7 @@ TEST_F(GraphPolyline, OfTheNeededPointsIsThatOfAllPoints) {
         const kor::GraphSeries& series = add(values);
         const std::vector<POINT> all = allPoints(values);
         kor::SeriesPoints needed;
-        ASSERT_TRUE(needed.Make(graph, series, 15, 215, kor::PointsOf::polyline, 0));
+        ASSERT_TRUE(needed.Make(kor::TraceOf(graph, series), 15, 215, kor::PointsOf::polyline, 0));
         const auto expected = canvas.Draw(all.data(), static_cast<int>(all.size()));
         ASSERT_EQ(canvas.Draw(needed.begin(), needed.count()), expected) << "round " << round;
         if (all.empty()) continue;
@@ -79,7 +79,7 @@ TEST_F(GraphPolyline, RunsOnBeyondTheViewPastValuesThatAreNone) {
     const kor::GraphSeries& series = add({2, none, none, 4, 5, 6, none, none, 9, 1});
     showX(3.5, 6.5);
     kor::SeriesPoints needed;
-    ASSERT_TRUE(needed.Make(graph, series, 15, 215, kor::PointsOf::polyline, 0));
+    ASSERT_TRUE(needed.Make(kor::TraceOf(graph, series), 15, 215, kor::PointsOf::polyline, 0));
     ASSERT_EQ(needed.count(), 5);
     EXPECT_EQ(needed.begin()[0].x, kor::xPixel(graph, 1));
     EXPECT_EQ(needed.begin()[0].y, kor::yPixel(graph, 2));
@@ -92,7 +92,7 @@ TEST_F(GraphPolyline, NeedsFewPointsWhereManyShareAColumn) {
     for (double& value : values) value = random() % 10;
     showX(0, 100001);
     kor::SeriesPoints needed;
-    ASSERT_TRUE(needed.Make(graph, add(values), 15, 215, kor::PointsOf::polyline, 0));
+    ASSERT_TRUE(needed.Make(kor::TraceOf(graph, add(values)), 15, 215, kor::PointsOf::polyline, 0));
     EXPECT_LE(needed.count(), 4 * 202 + 2);
 }
 

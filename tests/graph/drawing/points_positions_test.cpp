@@ -1,8 +1,8 @@
 // Points by the pixel that they share.
 #include "graph/number_graph.h"
 
-#include "graph/shapes/points.h"
 #include "graph/scale/scale.h"
+#include "graph/shapes/points.h"
 
 #include <random>
 
@@ -20,7 +20,7 @@ using Positions = std::vector<Position>;
 
 Positions Walked(const kor::GraphRecord& graph, kor::PointRange range) {
     Positions found;
-    for (kor::PositionWalk walk(graph, kor::xPixel, range); !walk.IsAtEnd(); walk.Next()) {
+    for (kor::PositionWalk walk(kor::XAxis(graph), range); !walk.IsAtEnd(); walk.Next()) {
         found.push_back({walk.pixel(), walk.number(), walk.end()});
     }
     return found;

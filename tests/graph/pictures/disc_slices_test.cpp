@@ -1,7 +1,7 @@
 // The pixels of a pie's slices, by number alone.
 #include "graph/shapes/disc.h"
 
-#include "graph/drawing/pie.h"
+#include "graph/shapes/pie_layout.h"
 
 #include <gtest/gtest.h>
 

@@ -1,7 +1,7 @@
 // Data values to pixels.
 #include "graph/number_graph.h"
 
-#include "graph/scale/number_format.h"
+#include "graph/scale/scale.h"
 
 #include <cfloat>
 #include <limits>

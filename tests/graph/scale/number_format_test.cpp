@@ -1,5 +1,6 @@
 // Numbers as the chart writes them.
 #include "graph/scale/number_format.h"
+#include "numbers/truncate.h"
 
 #include <gtest/gtest.h>
 
