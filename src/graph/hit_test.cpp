@@ -7,6 +7,7 @@
 #include "graph/scale/scale.h"
 #include "graph/shapes/bar_layout.h"
 #include "graph/shapes/points.h"
+#include "numbers/comparable.h"
 
 namespace kor {
 

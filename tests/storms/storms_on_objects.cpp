@@ -126,7 +126,8 @@ ExpectedGrid DescribeGrid(const RECT& client) {
     expected.rowHeaderWidth = grid.rowHeaderWidth;
     expected.headersHidden = grid.headersHidden;
     expected.linesHidden = grid.gridLinesHidden;
-    expected.selection = grid.selection;
+    const kor::CellBlock& block = grid.selection;
+    expected.selection = {block.left, block.right, block.top, block.bottom};
     return expected;
 }
 

@@ -7,6 +7,7 @@
 #include "base/records.h"
 #include "graph/data/palette.h"
 #include "graph/scale/scale.h"
+#include "numbers/comparable.h"
 
 namespace kor {
 

@@ -10,6 +10,7 @@
 #include "graph/drawing/frame.h"
 #include "graph/scale/scale.h"
 #include "graph/shapes/bar_layout.h"
+#include "numbers/comparable.h"
 
 namespace kor {
 

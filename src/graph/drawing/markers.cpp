@@ -10,6 +10,7 @@
 #include "graph/drawing/frame.h"
 #include "graph/drawing/lines.h"
 #include "graph/drawing/series_points.h"
+#include "numbers/comparable.h"
 
 namespace kor {
 

@@ -4,6 +4,9 @@
 #include <cmath>
 #include <limits>
 
+#include "numbers/comparable.h"
+#include "numbers/truncate.h"
+
 namespace kor {
 
 namespace {
@@ -22,6 +25,27 @@ double TickStep(double range, double unitsPerPixelBase, double zoom, double tick
 }
 
 }  // namespace
+
+int PixelAt(const Axis& axis, double value) {
+    int pixels = kUnknownPixels;
+    if constexpr (!kHasFloatingPoint) pixels = QuickPixels(axis.quick, value);
+    if (pixels == kUnknownPixels) {
+        pixels = TruncateToInt((value - axis.centre) / axis.unitsPerPixel);
+    }
+    return axis.sign > 0 ? axis.centrePixel + pixels : axis.centrePixel - pixels;
+}
+
+double ValueAt(const Axis& axis, int pixel) {
+    const int pixels = pixel - axis.centrePixel;
+    return axis.centre + (axis.sign > 0 ? pixels : -pixels) * axis.unitsPerPixel;
+}
+
+Axis Reversed(const Axis& axis) {
+    Axis reversed = axis;
+    reversed.centrePixel = -axis.centrePixel;
+    reversed.sign = -axis.sign;
+    return reversed;
+}
 
 AxisScale ScaleAxis(double low, double high, int extent, double zoom, int seriesCount,
                     double tickPixels) {

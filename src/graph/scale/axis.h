@@ -4,9 +4,7 @@
 
 #include <cstdint>
 
-#include "numbers/comparable.h"
 #include "numbers/pixel_scale.h"
-#include "numbers/truncate.h"
 
 namespace kor {
 
@@ -20,28 +18,13 @@ struct Axis {
 };
 
 // The pixel of a value. Monotone, whatever the value.
-inline int PixelAt(const Axis& axis, double value) {
-    int pixels = kUnknownPixels;
-    if constexpr (!kHasFloatingPoint) pixels = QuickPixels(axis.quick, value);
-    if (pixels == kUnknownPixels) {
-        pixels = TruncateToInt((value - axis.centre) / axis.unitsPerPixel);
-    }
-    return axis.sign > 0 ? axis.centrePixel + pixels : axis.centrePixel - pixels;
-}
+int PixelAt(const Axis& axis, double value);
 
 // The value at a pixel's centre.
-inline double ValueAt(const Axis& axis, int pixel) {
-    const int pixels = pixel - axis.centrePixel;
-    return axis.centre + (axis.sign > 0 ? pixels : -pixels) * axis.unitsPerPixel;
-}
+double ValueAt(const Axis& axis, int pixel);
 
 // The axis with all pixels negated: on a reversed y axis pixels grow with the values.
-inline Axis Reversed(const Axis& axis) {
-    Axis reversed = axis;
-    reversed.centrePixel = -axis.centrePixel;
-    reversed.sign = -axis.sign;
-    return reversed;
-}
+Axis Reversed(const Axis& axis);
 
 // What follows from a range of values, an extent in pixels and the zoom.
 struct AxisScale {

@@ -5,6 +5,8 @@
 #include <algorithm>
 #include <cmath>
 
+#include "numbers/truncate.h"
+
 namespace kor {
 
 namespace {

@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <cmath>
 
+#include "numbers/comparable.h"
+
 namespace kor {
 
 namespace {

@@ -1,5 +1,7 @@
 #include "graph/shapes/bar_layout.h"
 
+#include "numbers/comparable.h"
+
 namespace kor {
 
 int FindBar(const BarAxes& axes, const double* values, int count, int offset, int thickness,

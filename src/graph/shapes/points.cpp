@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "base/assert.h"
+#include "numbers/comparable.h"
 
 namespace kor {
 
