@@ -123,6 +123,7 @@ struct GraphRecord {
     PrintState printing;
     bool paintMissed;  // WM_PAINT came while the record stood for a page
     bool sizeMissed;   // WM_SIZE likewise
+    bool isMakingLegend;
     RecordLife life;
 };
 

@@ -29,21 +29,18 @@ int SnappedHeight(HWND legend) {
 }  // namespace
 
 void ShowLegend(GraphRecord& graph, const RECT& place) {
-    if (graph.hwndLegend) return;
+    if (graph.hwndLegend || graph.isMakingLegend) return;
     wchar_t title[kLegendTitleCapacity] = {};
     LoadStringW(moduleInstance, kLegendTitleString, title, kLegendTitleCapacity);
     RegisterLegendClass(graph.hInstance);
     const int width = place.right - place.left;
-    HWND legend = CreateWindowExW(
+    graph.isMakingLegend = true;  // creating it sends messages, and a host may ask for one in them
+    graph.hwndLegend = CreateWindowExW(
         0, KORLEGEND_CLASS, title, WS_CHILD | WS_CAPTION | WS_VSCROLL, place.left, place.top, width,
         place.bottom - place.top, graph.hwnd,
         reinterpret_cast<HMENU>(static_cast<INT_PTR>(KORLEGEND_ID)), graph.hInstance, nullptr);
-    if (!legend) return;
-    if (graph.hwndLegend) {  // shown inside a message that creating this one sent
-        DestroyWindow(legend);
-        return;
-    }
-    graph.hwndLegend = legend;
+    graph.isMakingLegend = false;
+    if (!graph.hwndLegend) return;
     POINT bottom = {0, SnappedHeight(graph.hwndLegend)};
     MapWindowPoints(graph.hwndLegend, graph.hwnd, &bottom, 1);
     MoveWindow(graph.hwndLegend, place.left, place.top, width, bottom.y - place.top, TRUE);
