@@ -191,8 +191,11 @@ void WindowWords<kind>::wild(Stage& stage, const Arguments& a) {
     // A number that is nearly a DC or a region is followed by the system itself.
     const bool hasDrawing =
         message == WM_PAINT || message == WM_ERASEBKGND || message == WM_NCPAINT;
+    // A size that no screen has takes as long to draw as it has pixels.
+    constexpr int32_t kScreenSizes = 0x07FF07FF;
+    const int32_t number = message == WM_SIZE ? a[3] & kScreenSizes : a[3];
     stage.send(window, message, hasDrawing ? 0 : WideWord(a[2]),
-               hasPointer ? 0 : static_cast<LPARAM>(a[3]));
+               hasPointer ? 0 : static_cast<LPARAM>(number));
 }
 
 template struct WindowWords<kStrip>;
