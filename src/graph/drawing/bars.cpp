@@ -107,23 +107,21 @@ void DrawBars(const GraphRecord& graph, HDC dc, const BarLayout& layout) {
 }  // namespace
 
 void DrawColumnChart(GraphRecord& graph, HDC dc) {
-    DrawInFrame(graph, dc, [&] {
-        const RECT view = PlotClip(graph);
-        const int thickness = ZoomedThickness(graph, graph.barWidth);
-        DrawBars(
-            graph, dc,
-            {AxesOfColumns(XAxis(graph), YAxis(graph)), view, view.left, view.right, thickness});
-    });
+    BeginFrame(graph, dc);
+    const RECT view = PlotClip(graph);
+    const int thickness = ZoomedThickness(graph, graph.barWidth);
+    DrawBars(graph, dc,
+             {AxesOfColumns(XAxis(graph), YAxis(graph)), view, view.left, view.right, thickness});
+    EndFrame(graph, dc);
 }
 
 void DrawBarChart(GraphRecord& graph, HDC dc) {
-    DrawInFrame(graph, dc, [&] {
-        const RECT view = PlotClip(graph);
-        const int thickness = ZoomedThickness(graph, graph.barHeight);
-        DrawBars(
-            graph, dc,
-            {AxesOfBars(XAxis(graph), YAxis(graph)), view, -view.bottom, -view.top, thickness});
-    });
+    BeginFrame(graph, dc);
+    const RECT view = PlotClip(graph);
+    const int thickness = ZoomedThickness(graph, graph.barHeight);
+    DrawBars(graph, dc,
+             {AxesOfBars(XAxis(graph), YAxis(graph)), view, -view.bottom, -view.top, thickness});
+    EndFrame(graph, dc);
 }
 
 }  // namespace kor

@@ -91,12 +91,12 @@ void DrawGridLines(const GraphRecord& graph, HDC dc, const RECT* bounds) {
                                     surface.right - surface.left - graph.marginRight, plot.bottom};
     SelectScope pen(dc, graph.hpenGrid);
     if (HasOption(graph, KORGRAPH_HORIZONTALGRID)) {
-        WalkAxisTicks(YAxis(graph), graph.yTickStepCopy, area.top, area.bottom,
-                      [&](double, int y) { DrawLine(dc, area.left, y, area.right, y); });
+        TickWalk tick(YAxis(graph), graph.yTickStepCopy, area.top, area.bottom);
+        while (tick.Next()) DrawLine(dc, area.left, tick.pixel(), area.right, tick.pixel());
     }
     if (HasOption(graph, KORGRAPH_VERTICALGRID)) {
-        WalkAxisTicks(XAxis(graph), graph.xTickStepCopy, area.left, area.right,
-                      [&](double, int x) { DrawLine(dc, x, area.top, x, area.bottom); });
+        TickWalk tick(XAxis(graph), graph.xTickStepCopy, area.left, area.right);
+        while (tick.Next()) DrawLine(dc, tick.pixel(), area.top, tick.pixel(), area.bottom);
     }
 }
 
@@ -112,8 +112,8 @@ void DrawXAxis(GraphRecord& graph, HDC dc) {
     if (!HasOption(graph, KORGRAPH_XTICKS)) return;
     SelectScope pen(dc, graph.hpenThin);
     const int half = graph.tickHalfLength;
-    WalkAxisTicks(XAxis(graph), graph.xTickStep, plot.left, plot.right,
-                  [&](double, int x) { DrawLine(dc, x, y - half, x, y + half); });
+    TickWalk tick(XAxis(graph), graph.xTickStep, plot.left, plot.right);
+    while (tick.Next()) DrawLine(dc, tick.pixel(), y - half, tick.pixel(), y + half);
 }
 
 void DrawYAxis(GraphRecord& graph, HDC dc) {
@@ -132,8 +132,26 @@ void DrawYAxis(GraphRecord& graph, HDC dc) {
     if (!HasOption(graph, KORGRAPH_YTICKS)) return;
     SelectScope pen(dc, graph.hpenThin);
     const int half = graph.tickHalfLength;
-    WalkAxisTicks(YAxis(graph), graph.yTickStep, plot.top, plot.bottom,
-                  [&](double, int y) { DrawLine(dc, x - half, y, x + half, y); });
+    TickWalk tick(YAxis(graph), graph.yTickStep, plot.top, plot.bottom);
+    while (tick.Next()) DrawLine(dc, x - half, tick.pixel(), x + half, tick.pixel());
+}
+
+void BeginFrame(const GraphRecord& graph, HDC dc) {
+    FillBackground(graph, dc);
+    DrawGraphTitle(graph, dc);
+    DrawGridLines(graph, dc, nullptr);
+    ClipToPlot(graph, dc);
+}
+
+void EndFrame(GraphRecord& graph, HDC dc) {
+    ClipToSurface(graph, dc);
+    DrawXAxis(graph, dc);
+    DrawYAxis(graph, dc);
+    DrawXAxisLabels(graph, dc);
+    DrawYAxisLabels(graph, dc);
+    DrawXAxisTitle(graph, dc);
+    DrawYAxisTitle(graph, dc);
+    if (graph.hwnd) InvalidateRect(graph.hwnd, nullptr, FALSE);
 }
 
 }  // namespace kor

@@ -33,23 +33,9 @@ void ClipToSurface(const GraphRecord& graph, HDC dc);
 // changed places; a region's never do.
 RECT PlotClip(const GraphRecord& graph);
 
-// Background, title and grid lines, then the series inside the plot's clip, then all that lies over
-// them; the window shows it at its next paint.
-template <typename DrawSeries>
-void DrawInFrame(GraphRecord& graph, HDC dc, DrawSeries drawSeries) {
-    FillBackground(graph, dc);
-    DrawGraphTitle(graph, dc);
-    DrawGridLines(graph, dc, nullptr);
-    ClipToPlot(graph, dc);
-    drawSeries();
-    ClipToSurface(graph, dc);
-    DrawXAxis(graph, dc);
-    DrawYAxis(graph, dc);
-    DrawXAxisLabels(graph, dc);
-    DrawYAxisLabels(graph, dc);
-    DrawXAxisTitle(graph, dc);
-    DrawYAxisTitle(graph, dc);
-    if (graph.hwnd) InvalidateRect(graph.hwnd, nullptr, FALSE);
-}
+// Before the series: background, title and grid lines, and the clip of the plot area. After them: all
+// that lies over them; the window shows it at its next paint.
+void BeginFrame(const GraphRecord& graph, HDC dc);
+void EndFrame(GraphRecord& graph, HDC dc);
 
 }  // namespace kor

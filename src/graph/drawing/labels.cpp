@@ -86,11 +86,12 @@ void DrawXAxisLabels(const GraphRecord& graph, HDC dc) {
         DrawXCategories(graph, dc, top);
         return;
     }
-    WalkAxisTicks(XAxis(graph), graph.xTickStep, plot.left, plot.right, [&](double value, int x) {
-        DrawNumber(graph, dc, value,
-                   {x - graph.xTickHalfSpacing, top, x + graph.xTickHalfSpacing,
-                    top + graph.xLabelHeight});
-    });
+    TickWalk tick(XAxis(graph), graph.xTickStep, plot.left, plot.right);
+    while (tick.Next()) {
+        DrawNumber(graph, dc, tick.value(),
+                   {tick.pixel() - graph.xTickHalfSpacing, top,
+                    tick.pixel() + graph.xTickHalfSpacing, top + graph.xLabelHeight});
+    }
 }
 
 void DrawYAxisLabels(const GraphRecord& graph, HDC dc) {
@@ -103,10 +104,12 @@ void DrawYAxisLabels(const GraphRecord& graph, HDC dc) {
         DrawYCategories(graph, dc, left, right);
         return;
     }
-    WalkAxisTicks(YAxis(graph), graph.yTickStep, plot.top, plot.bottom, [&](double value, int y) {
-        DrawNumber(graph, dc, value,
-                   {left, y - graph.labelHalfHeight, right, y + graph.labelHalfHeight});
-    });
+    TickWalk tick(YAxis(graph), graph.yTickStep, plot.top, plot.bottom);
+    while (tick.Next()) {
+        DrawNumber(graph, dc, tick.value(),
+                   {left, tick.pixel() - graph.labelHalfHeight, right,
+                    tick.pixel() + graph.labelHalfHeight});
+    }
 }
 
 void DrawGraphTitle(const GraphRecord& graph, HDC dc) {

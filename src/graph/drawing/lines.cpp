@@ -47,20 +47,20 @@ void DrawAreaSeries(const GraphRecord& graph, HDC dc, const GraphSeries& series)
 }  // namespace
 
 void DrawLineChart(GraphRecord& graph, HDC dc) {
-    DrawInFrame(graph, dc, [&] {
-        for (int i = 0; i < graph.seriesCount; ++i) {
-            if (HasValues(graph.series[i])) DrawLineSeries(graph, dc, *graph.series[i]);
-        }
-    });
+    BeginFrame(graph, dc);
+    for (int i = 0; i < graph.seriesCount; ++i) {
+        if (HasValues(graph.series[i])) DrawLineSeries(graph, dc, *graph.series[i]);
+    }
+    EndFrame(graph, dc);
 }
 
 // The first series lies on top.
 void DrawAreaChart(GraphRecord& graph, HDC dc) {
-    DrawInFrame(graph, dc, [&] {
-        for (int i = graph.seriesCount - 1; i >= 0; --i) {
-            if (HasValues(graph.series[i])) DrawAreaSeries(graph, dc, *graph.series[i]);
-        }
-    });
+    BeginFrame(graph, dc);
+    for (int i = graph.seriesCount - 1; i >= 0; --i) {
+        if (HasValues(graph.series[i])) DrawAreaSeries(graph, dc, *graph.series[i]);
+    }
+    EndFrame(graph, dc);
 }
 
 }  // namespace kor

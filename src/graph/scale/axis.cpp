@@ -28,7 +28,7 @@ double TickStep(double range, double unitsPerPixelBase, double zoom, double tick
 
 int PixelAt(const Axis& axis, double value) {
     int pixels = kUnknownPixels;
-    if constexpr (!kHasFloatingPoint) pixels = QuickPixels(axis.quick, value);
+    if constexpr (!kHasFloatingPoint) pixels = QuickPixels(*axis.quick, value);
     if (pixels == kUnknownPixels) {
         pixels = TruncateToInt((value - axis.centre) / axis.unitsPerPixel);
     }

@@ -14,7 +14,7 @@ struct Axis {
     double unitsPerPixel;  // above 0, finite
     int32_t centrePixel;
     int32_t sign;
-    PixelScale quick;  // of the same mapping, for processors without floating point
+    const PixelScale* quick;  // of the same mapping, for processors without floating point
 };
 
 // The pixel of a value. Monotone, whatever the value.

@@ -22,11 +22,11 @@ void UpdateScale(PixelScale& scale, double centre, double unitsPerPixel) {
 }  // namespace
 
 Axis XAxis(const GraphRecord& graph) {
-    return {graph.xCentre, graph.xUnitsPerPixel, graph.xCentrePixel, 1, graph.xScale};
+    return {graph.xCentre, graph.xUnitsPerPixel, graph.xCentrePixel, 1, &graph.xScale};
 }
 
 Axis YAxis(const GraphRecord& graph) {
-    return {graph.yCentre, graph.yUnitsPerPixel, graph.yCentrePixel, -1, graph.yScale};
+    return {graph.yCentre, graph.yUnitsPerPixel, graph.yCentrePixel, -1, &graph.yScale};
 }
 
 int xPixel(const GraphRecord& graph, double x) { return PixelAt(XAxis(graph), x); }
