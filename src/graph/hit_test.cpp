@@ -2,9 +2,9 @@
 
 #include "base/assert.h"
 #include "base/runtime.h"
+#include "graph/data/axes.h"
 #include "graph/data/series.h"
 #include "graph/scale/number_format.h"
-#include "graph/scale/scale.h"
 #include "graph/shapes/bar_layout.h"
 #include "graph/shapes/points.h"
 #include "numbers/comparable.h"

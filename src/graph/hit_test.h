@@ -1,7 +1,7 @@
 // Which data point lies under the pointer, and what the tooltip says of it.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 #include "platform/number_text.h"
 
 namespace kor {

@@ -2,9 +2,9 @@
 
 #include <korcontrols/tooltip.h>
 
+#include "graph/data/axes.h"
 #include "graph/drawing/redraw.h"
 #include "graph/hit_test.h"
-#include "graph/scale/scale.h"
 
 namespace kor {
 

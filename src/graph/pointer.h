@@ -1,7 +1,7 @@
 // A press on the chart: it shows the value under it, or pans by an arrow.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 
 namespace kor {
 

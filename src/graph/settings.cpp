@@ -3,10 +3,10 @@
 #include <utility>
 
 #include "base/local_text.h"
+#include "graph/data/axes.h"
 #include "graph/data/choices.h"
 #include "graph/drawing/layout.h"
 #include "graph/drawing/redraw.h"
-#include "graph/scale/scale.h"
 
 namespace kor {
 
@@ -14,8 +14,7 @@ namespace {
 
 void LayOutAndRescale(GraphRecord& graph) {
     LayoutGraphMargins(graph, graph.hdcMem);
-    RescaleX(graph);
-    RescaleY(graph);
+    Rescale(graph);
 }
 
 // Categories run along y in a bar chart, along x in all others.

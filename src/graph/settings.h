@@ -1,7 +1,7 @@
 // What the host sets of a chart besides its data: titles, type, options, zoom, colour.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 
 namespace kor {
 

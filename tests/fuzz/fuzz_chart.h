@@ -3,9 +3,9 @@
 
 #include "fuzz_input.h"
 
+#include "graph/data/axes.h"
+#include "graph/data/record.h"
 #include "graph/data/series.h"
-#include "graph/record.h"
-#include "graph/scale/scale.h"
 
 namespace korfuzz {
 

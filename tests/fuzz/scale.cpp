@@ -2,7 +2,7 @@
 // are numbers, few, and in view.
 #include "fuzz_chart.h"
 
-#include "graph/scale/scale.h"
+#include "graph/data/axes.h"
 #include "graph/scale/ticks.h"
 #include "numbers/truncate.h"
 

@@ -5,9 +5,9 @@
 // one y unit; x value 5 stands in column 115, y value 5 in row 65.
 #pragma once
 
+#include "graph/data/axes.h"
+#include "graph/data/record.h"
 #include "graph/data/series.h"
-#include "graph/record.h"
-#include "graph/scale/scale.h"
 
 #include <gtest/gtest.h>
 

@@ -24,8 +24,8 @@ function(korcontrols_arithmetic name)
     ${src}/graph/data/palette.cpp
     ${src}/graph/data/series.cpp
     ${src}/graph/hit_test.cpp
-    ${src}/graph/record.cpp
-    ${src}/graph/scale/scale.cpp)
+    ${src}/graph/data/record.cpp
+    ${src}/graph/data/axes.cpp)
   target_include_directories(${name} PUBLIC
     ${KORCONTROLS_ROOT}/tests/native/include ${KORCONTROLS_ROOT}/include)
   target_link_libraries(${name} PUBLIC ${name}_rules)

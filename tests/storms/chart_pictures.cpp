@@ -1,7 +1,7 @@
 #include "storms/pictures.h"
 
+#include "graph/data/record.h"
 #include "graph/pictures/chart_pair.h"
-#include "graph/record.h"
 #include "literal_chart/literal_chart.h"
 #include "storms/failure.h"
 #include "storms/stage.h"

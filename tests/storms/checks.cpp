@@ -1,6 +1,6 @@
 #include "storms/checks.h"
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 #include "storms/failure.h"
 #include "storms/library.h"
 

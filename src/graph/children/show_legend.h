@@ -1,7 +1,7 @@
 // The chart's side of its legend.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 
 namespace kor {
 

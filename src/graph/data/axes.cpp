@@ -1,4 +1,4 @@
-#include "graph/scale/scale.h"
+#include "graph/data/axes.h"
 
 #include <korcontrols/graph.h>
 
@@ -77,6 +77,11 @@ void RescaleY(GraphRecord& graph) {
     graph.yTickStepCopy = graph.yTickStep;
 }
 
+void Rescale(GraphRecord& graph) {
+    RescaleX(graph);
+    RescaleY(graph);
+}
+
 void AutoRange(GraphRecord& graph, int axis) {
     const bool isBar = graph.chartType == kBar;
     const bool ofPoints = (axis == KORGRAPH_X) != isBar;  // the axis that counts the points
@@ -130,8 +135,7 @@ void SetRange(GraphRecord& graph, int axis, double low, double high) {
 
 void SetZoomFactor(GraphRecord& graph, double factor) {
     graph.zoom = std::fabs(factor);
-    RescaleX(graph);
-    RescaleY(graph);
+    Rescale(graph);
 }
 
 int ZoomedThickness(const GraphRecord& graph, int thickness) {

@@ -1,7 +1,7 @@
 // Where a chart's data stands on its surface, as its record says, and what changes that.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 #include "graph/scale/axis.h"
 #include "graph/shapes/pie_layout.h"
 
@@ -17,9 +17,11 @@ int yPixel(const GraphRecord& graph, double y);
 
 PieLayout LayoutPie(const GraphRecord& graph);
 
-// Compute an axis' mapping, tick step and bar size from its range, the zoom and the plot area.
+// Compute an axis' mapping, tick step and bar size from its range, the zoom and the plot area; nothing
+// without a window.
 void RescaleX(GraphRecord& graph);
 void RescaleY(GraphRecord& graph);
+void Rescale(GraphRecord& graph);  // both
 
 // Move the data value at the plot's centre, and the mapping with it.
 void MoveXCentre(GraphRecord& graph, double by);

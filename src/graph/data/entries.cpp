@@ -1,8 +1,8 @@
 #include "graph/data/entries.h"
 
 #include "graph/data/palette.h"
+#include "graph/data/record.h"
 #include "graph/data/series.h"
-#include "graph/record.h"
 
 namespace kor {
 

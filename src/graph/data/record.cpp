@@ -1,4 +1,4 @@
-#include "graph/record.h"
+#include "graph/data/record.h"
 
 #include <korcontrols/graph.h>
 

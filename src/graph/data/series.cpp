@@ -5,8 +5,8 @@
 
 #include "base/local_text.h"
 #include "base/records.h"
+#include "graph/data/axes.h"
 #include "graph/data/palette.h"
-#include "graph/scale/scale.h"
 #include "numbers/comparable.h"
 
 namespace kor {

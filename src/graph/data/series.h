@@ -3,7 +3,7 @@
 
 #include <korcontrols/graph.h>
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 #include "graph/shapes/pie_layout.h"
 
 namespace kor {

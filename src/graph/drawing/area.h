@@ -1,7 +1,7 @@
 // The polygon between a series and its zero line.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 
 namespace kor {
 

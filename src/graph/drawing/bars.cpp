@@ -7,8 +7,8 @@
 
 #include "base/gdi_scopes.h"
 #include "base/windows_helpers.h"
+#include "graph/data/axes.h"
 #include "graph/drawing/frame.h"
-#include "graph/scale/scale.h"
 #include "graph/shapes/bar_layout.h"
 #include "numbers/comparable.h"
 

@@ -1,7 +1,7 @@
 // Column and bar charts.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 
 namespace kor {
 

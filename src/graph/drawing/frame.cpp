@@ -5,7 +5,7 @@
 #include <algorithm>
 
 #include "base/gdi_scopes.h"
-#include "graph/scale/scale.h"
+#include "graph/data/axes.h"
 #include "graph/scale/ticks.h"
 
 namespace kor {

@@ -3,7 +3,7 @@
 // selected.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 
 namespace kor {
 
@@ -33,8 +33,8 @@ void ClipToSurface(const GraphRecord& graph, HDC dc);
 // changed places; a region's never do.
 RECT PlotClip(const GraphRecord& graph);
 
-// Before the series: background, title and grid lines, and the clip of the plot area. After them: all
-// that lies over them; the window shows it at its next paint.
+// Before the series: background, title and grid lines, and the clip of the plot area. After them:
+// all that lies over them; the window shows it at its next paint.
 void BeginFrame(const GraphRecord& graph, HDC dc);
 void EndFrame(GraphRecord& graph, HDC dc);
 

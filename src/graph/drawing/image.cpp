@@ -1,14 +1,14 @@
-#include "graph/image.h"
+#include "graph/drawing/image.h"
 
 #include <korcontrols/graph.h>
 
 #include <algorithm>
 
 #include "base/gdi_scopes.h"
+#include "graph/data/axes.h"
 #include "graph/drawing/frame.h"
+#include "graph/drawing/live.h"
 #include "graph/drawing/redraw.h"
-#include "graph/live.h"
-#include "graph/scale/scale.h"
 
 namespace kor {
 
@@ -39,8 +39,7 @@ void ResizeImage(GraphRecord& graph, int width, int height) {
     ReplaceBitmap(graph, width, height);
     graph.rcPlot = {0, 0, width, height};
     ClipToSurface(graph, graph.hdcMem);
-    RescaleX(graph);
-    RescaleY(graph);
+    Rescale(graph);
     RedrawGraph(graph);
 }
 

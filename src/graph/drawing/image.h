@@ -1,7 +1,7 @@
 // The off-screen image: made in the window's size, copied to the window.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 
 namespace kor {
 

@@ -4,9 +4,9 @@
 #include <algorithm>
 
 #include "base/gdi_scopes.h"
+#include "graph/data/axes.h"
 #include "graph/drawing/frame.h"
 #include "graph/scale/number_format.h"
-#include "graph/scale/scale.h"
 #include "graph/scale/ticks.h"
 #include "numbers/truncate.h"
 #include "text/text_run.h"

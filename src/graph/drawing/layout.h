@@ -1,7 +1,7 @@
 // Fonts and margins: how much room titles and labels take around the plot area.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 
 namespace kor {
 

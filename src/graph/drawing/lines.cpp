@@ -1,10 +1,10 @@
 #include "graph/drawing/lines.h"
 
 #include "base/gdi_scopes.h"
+#include "graph/data/axes.h"
 #include "graph/drawing/area.h"
 #include "graph/drawing/frame.h"
 #include "graph/drawing/series_points.h"
-#include "graph/scale/scale.h"
 
 namespace kor {
 

@@ -1,7 +1,7 @@
 // Line and area charts, and the markers of a line.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 
 namespace kor {
 

@@ -1,13 +1,13 @@
-#include "graph/live.h"
+#include "graph/drawing/live.h"
 
 #include <algorithm>
 
 #include "base/gdi_scopes.h"
 #include "base/windows_helpers.h"
+#include "graph/data/axes.h"
 #include "graph/data/series.h"
 #include "graph/drawing/frame.h"
 #include "graph/scale/number_format.h"
-#include "graph/scale/scale.h"
 
 namespace kor {
 

@@ -8,10 +8,10 @@
 #include "base/assert.h"
 #include "base/gdi_scopes.h"
 #include "base/local_text.h"
+#include "graph/data/axes.h"
 #include "graph/data/palette.h"
 #include "graph/data/series.h"
 #include "graph/drawing/frame.h"
-#include "graph/scale/scale.h"
 #include "graph/shapes/pie_layout.h"
 #include "numbers/truncate.h"
 

@@ -1,7 +1,7 @@
 // Pie charts.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 
 namespace kor {
 

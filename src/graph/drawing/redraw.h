@@ -1,7 +1,7 @@
 // Drawing the whole chart into its off-screen image.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 
 namespace kor {
 

@@ -1,6 +1,6 @@
 #include "graph/drawing/series_points.h"
 
-#include "graph/scale/scale.h"
+#include "graph/data/axes.h"
 
 namespace kor {
 

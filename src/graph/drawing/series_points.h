@@ -3,7 +3,7 @@
 
 #include "base/local_text.h"
 #include "base/windows_helpers.h"
-#include "graph/record.h"
+#include "graph/data/record.h"
 #include "graph/shapes/points.h"
 
 namespace kor {

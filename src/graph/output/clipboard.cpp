@@ -5,7 +5,7 @@
 #include "base/runtime.h"
 #include "base/windows_helpers.h"
 #include "graph/data/palette.h"
-#include "graph/image.h"
+#include "graph/drawing/image.h"
 #include "platform/clipboard.h"
 
 namespace kor {

@@ -1,7 +1,7 @@
 // The chart's image for other programs.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 
 namespace kor {
 

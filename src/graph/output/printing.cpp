@@ -5,12 +5,12 @@
 #include "graph/output/printing.h"
 
 #include "base/windows_helpers.h"
+#include "graph/data/axes.h"
 #include "graph/drawing/frame.h"
+#include "graph/drawing/image.h"
 #include "graph/drawing/layout.h"
 #include "graph/drawing/redraw.h"
-#include "graph/image.h"
 #include "graph/output/printing_calls.h"
-#include "graph/scale/scale.h"
 
 namespace kor {
 
@@ -25,8 +25,7 @@ void BecomePage(GraphRecord& graph, HDC printer) {
     SetBkMode(printer, TRANSPARENT);  // as the off-screen image has it
     CreateGraphFonts(graph, printer);
     LayoutGraphMargins(graph, printer);
-    RescaleX(graph);
-    RescaleY(graph);
+    Rescale(graph);
 }
 
 // Everything is as it was for the screen, whatever a layout or a scaling would give by now: a

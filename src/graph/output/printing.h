@@ -1,7 +1,7 @@
 // A chart on paper.
 #pragma once
 
-#include "graph/record.h"
+#include "graph/data/record.h"
 
 namespace kor {
 

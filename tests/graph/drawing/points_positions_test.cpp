@@ -1,7 +1,7 @@
 // Points by the pixel that they share.
 #include "graph/number_graph.h"
 
-#include "graph/scale/scale.h"
+#include "graph/data/axes.h"
 #include "graph/shapes/points.h"
 
 #include <random>

@@ -6,8 +6,8 @@
 //   EndPage                     EndDoc                    DeleteDC
 #pragma once
 
+#include "graph/data/record.h"
 #include "graph/graph_fixture.h"
-#include "graph/record.h"
 #include "platform/print_dialog.h"
 
 #include <optional>

@@ -1,7 +1,7 @@
 // Data values to pixels.
 #include "graph/number_graph.h"
 
-#include "graph/scale/scale.h"
+#include "graph/data/axes.h"
 
 #include <cfloat>
 #include <limits>
