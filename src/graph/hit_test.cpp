@@ -32,20 +32,22 @@ int FindLinePoint(const ValueTrace& trace, Point at) {
     return kNoPoint;
 }
 
+int FindBarPoint(const GraphRecord& graph, const ValueTrace& trace, int index, Point at) {
+    const bool upright = graph.chartType == kColumn;
+    const BarAxes axes = upright ? AxesOfColumns(trace.x, trace.y) : AxesOfBars(trace.x, trace.y);
+    const int thickness = ZoomedThickness(graph, upright ? graph.barWidth : graph.barHeight);
+    return FindBar(axes, trace.values, trace.count,
+                   OffsetInGroup(index, graph.seriesCount, thickness), thickness, at);
+}
+
 int FindPoint(const GraphRecord& graph, int index, Point at) {
     const GraphSeries& series = *graph.series[index];
-    const Axis x = XAxis(graph);
-    const Axis y = YAxis(graph);
-    const auto findBar = [&](const BarAxes& axes, int thickness) {
-        const int zoomed = ZoomedThickness(graph, thickness);
-        const int offset = OffsetInGroup(index, graph.seriesCount, zoomed);
-        return FindBar(axes, series.values, series.pointCount, offset, zoomed, at);
-    };
+    const ValueTrace trace = {XAxis(graph), YAxis(graph), series.values, series.pointCount};
     switch (graph.chartType) {
     case kLine:
-    case kArea: return FindLinePoint({x, y, series.values, series.pointCount}, at);
-    case kColumn: return findBar(AxesOfColumns(x, y), graph.barWidth);
-    case kBar: return findBar(AxesOfBars(x, y), graph.barHeight);
+    case kArea: return FindLinePoint(trace, at);
+    case kColumn:
+    case kBar: return FindBarPoint(graph, trace, index, at);
     default: return kNoPoint;
     }
 }

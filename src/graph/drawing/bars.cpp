@@ -96,32 +96,28 @@ void DrawBarSeries(HDC dc, const GraphSeries& series, const BarLayout& layout, i
 }
 
 // A series without values keeps its place in the groups.
-void DrawBars(const GraphRecord& graph, HDC dc, const BarLayout& layout) {
+void DrawBarsInFrame(GraphRecord& graph, HDC dc, const BarAxes& axes, int thickness) {
+    BeginFrame(graph, dc);
+    const RECT view = PlotClip(graph);
+    const BarLayout layout = {axes, view, axes.upright ? view.left : -view.bottom,
+                              axes.upright ? view.right : -view.top,
+                              ZoomedThickness(graph, thickness)};
     for (int i = 0; i < graph.seriesCount; ++i) {
         const GraphSeries* series = graph.series[i];
         if (!series || !series->values) continue;
         DrawBarSeries(dc, *series, layout, OffsetInGroup(i, graph.seriesCount, layout.thickness));
     }
+    EndFrame(graph, dc);
 }
 
 }  // namespace
 
 void DrawColumnChart(GraphRecord& graph, HDC dc) {
-    BeginFrame(graph, dc);
-    const RECT view = PlotClip(graph);
-    const int thickness = ZoomedThickness(graph, graph.barWidth);
-    DrawBars(graph, dc,
-             {AxesOfColumns(XAxis(graph), YAxis(graph)), view, view.left, view.right, thickness});
-    EndFrame(graph, dc);
+    DrawBarsInFrame(graph, dc, AxesOfColumns(XAxis(graph), YAxis(graph)), graph.barWidth);
 }
 
 void DrawBarChart(GraphRecord& graph, HDC dc) {
-    BeginFrame(graph, dc);
-    const RECT view = PlotClip(graph);
-    const int thickness = ZoomedThickness(graph, graph.barHeight);
-    DrawBars(graph, dc,
-             {AxesOfBars(XAxis(graph), YAxis(graph)), view, -view.bottom, -view.top, thickness});
-    EndFrame(graph, dc);
+    DrawBarsInFrame(graph, dc, AxesOfBars(XAxis(graph), YAxis(graph)), graph.barHeight);
 }
 
 }  // namespace kor
