@@ -3,7 +3,7 @@
 #include <cmath>
 #include <cstdlib>
 
-#include "graph/graph_disc.h"
+#include "graph/shapes/disc.h"
 
 namespace bench {
 

@@ -3,7 +3,7 @@
 // program that draws every point of the chart can do with less.
 #pragma once
 
-#include "graph/pictures/literal_chart.h"
+#include "literal_chart/literal_chart.h"
 
 #include <string>
 #include <vector>

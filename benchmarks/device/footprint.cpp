@@ -1,5 +1,5 @@
 // device_footprint: what the device's library takes, counted by the stand-in that interprets it. A
-// line for each figure, its fields separated by tabs, which scripts/footprint.py makes tables of:
+// line for each figure, its fields separated by tabs, which tools/footprint.py makes tables of:
 //
 //   creation     name; heap bytes and GDI objects while it lives; what is left of both
 //   interaction  name; points or 0; instructions; those in the arithmetic helpers; calls of the

@@ -170,5 +170,5 @@ def beside_data(note, folder):
 
 
 def source_of(data_file):
-    """src/CMakeFiles/X.dir/grid/grid_mouse.cpp.gcda is of src/grid/grid_mouse.cpp."""
+    """src/CMakeFiles/X.dir/grid/mouse.cpp.gcda is of src/grid/mouse.cpp."""
     return "src/" + data_file.split(".dir/")[1].rsplit(".", 1)[0]

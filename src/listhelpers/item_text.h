@@ -1,8 +1,8 @@
 // Texts on their way into the platform's controls.
 #pragma once
 
+#include "base/runtime.h"
 #include "platform/platform.h"
-#include "platform/runtime.h"
 
 #include <commctrl.h>
 

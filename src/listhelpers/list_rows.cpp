@@ -3,8 +3,8 @@
 
 #include <new>
 
+#include "base/windows_helpers.h"
 #include "listhelpers/item_text.h"
-#include "platform/windows_helpers.h"
 
 namespace kor {
 

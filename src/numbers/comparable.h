@@ -5,7 +5,7 @@
 #include <type_traits>
 
 #include "numbers/double_bits.h"
-#include "platform/processor.h"
+#include "numbers/processor.h"
 
 namespace kor {
 

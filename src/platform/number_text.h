@@ -1,8 +1,6 @@
 // Numbers as text, by the platform's own runtime.
 #pragma once
 
-#include "platform/platform.h"
-
 namespace kor {
 
 // Room for a number in "%G" form with up to 17 digits, whatever the platform's exponent looks like.

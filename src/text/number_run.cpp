@@ -2,8 +2,8 @@
 
 #include <algorithm>
 
-#include "platform/assert.h"
-#include "platform/runtime.h"
+#include "base/assert.h"
+#include "base/runtime.h"
 #include "text/scratch_bitmap.h"
 #include "text/text_run.h"
 

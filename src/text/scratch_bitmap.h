@@ -3,7 +3,7 @@
 
 #include <cstdint>
 
-#include "platform/gdi_scopes.h"
+#include "base/gdi_scopes.h"
 
 namespace kor {
 

@@ -13,12 +13,4 @@ int ZoomedFontHeight(int height, uint32_t zoom) {
     return truncated > 0 ? -truncated : truncated;
 }
 
-HFONT CreateZoomedFont(HFONT font) {
-    LOGFONTW description = {};
-    if (!font || !GetObjectW(font, sizeof description, &description)) return nullptr;
-    description.lfHeight = ZoomedFontHeight(description.lfHeight, zoomLevel);
-    description.lfWidth = 0;
-    return CreateFontIndirectW(&description);
-}
-
 }  // namespace kor

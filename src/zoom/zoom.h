@@ -2,7 +2,7 @@
 // it, the strips only read it, and neither has to know the other for that.
 #pragma once
 
-#include "platform/platform.h"
+#include <cstdint>
 
 namespace kor {
 
@@ -11,7 +11,8 @@ extern uint32_t zoomLevel;
 
 constexpr uint32_t kZoomWhole = 4;
 
-// From here on letters may be larger than a window. Nobody reads them, but it must not take seconds.
+// From here on letters may be larger than a window. Nobody reads them, but it must not take
+// seconds.
 constexpr uint32_t kZoomHuge = 100 * kZoomWhole;
 
 // Pixels of a size in units (pixels at 100 %); cut to 16 bits.
@@ -28,9 +29,5 @@ constexpr int HeaderHeightAt(uint32_t zoom) {
 // Height of a font at a zoom: scaled, and always a character height (negative), which is what makes
 // the letters and not their line keep the proportion.
 int ZoomedFontHeight(int height, uint32_t zoom);
-
-// A new font: `font` at the current zoom, with its own proportions. The caller deletes it. Null
-// when `font` is null or cannot be read or made.
-HFONT CreateZoomedFont(HFONT font);
 
 }  // namespace kor

@@ -5,15 +5,18 @@
 
 import pathlib
 import shutil
+import sys
 
 import pytest
 
-from clipboard import Clipboard
-from desktop import ROOT, Desktop
-from probe import Probe
-from workbook_app import Workbook, windows_path
+sys.path.insert(0, str(pathlib.Path(__file__).resolve().parents[2] / "tools" / "desktop"))
 
-DATA = ROOT / "examples" / "workbook" / "data"
+from clipboard import Clipboard  # noqa: E402
+from desktop import ROOT, Desktop  # noqa: E402
+from probe import Probe  # noqa: E402
+from workbook_app import Workbook, windows_path  # noqa: E402
+
+DATA = ROOT / "apps" / "workbook" / "data"
 FAILURES = ROOT / "build" / "e2e-failures"
 
 

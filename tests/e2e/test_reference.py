@@ -8,12 +8,12 @@ import pytest
 from desktop import ROOT
 
 HEADERS = sorted((ROOT / "include" / "korcontrols").glob("*.h"))
-WORKBOOK = ROOT / "examples" / "workbook"
+WORKBOOK = ROOT / "apps" / "workbook"
 MESSAGE = r"(?:GRIDM|GRIDN|HCM|HCN|GM|GN|TIPM|FBM|FBN)_\w+"
 
 
 def exports():
-    lines = (ROOT / "src" / "korcontrols.def").read_text().splitlines()
+    lines = (ROOT / "src" / "library" / "korcontrols.def").read_text().splitlines()
     return {line.split()[0] for line in lines if re.match(r"\s+\w+\s+@\d+", line)}
 
 

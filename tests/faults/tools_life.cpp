@@ -5,7 +5,7 @@
 #include "faults/printing_stand_in.h"
 #include "faults/scenarios.h"
 #include "faults/sheet_user.h"
-#include "graph/sheet_driver.h"
+#include "graph/tools/sheet_driver.h"
 
 #include "support/input.h"
 

@@ -3,9 +3,9 @@
 
 #include "fuzz_input.h"
 
-#include "graph/graph_record.h"
-#include "graph/graph_scale.h"
-#include "graph/graph_series.h"
+#include "graph/data/axes.h"
+#include "graph/data/record.h"
+#include "graph/data/series.h"
 
 namespace korfuzz {
 

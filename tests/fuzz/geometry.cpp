@@ -1,8 +1,8 @@
 // Sizes and positions of the grid's columns and rows against the definitions, one by one.
 #include "fuzz_input.h"
 
-#include "grid/grid_geometry.h"
-#include "grid/grid_state.h"
+#include "grid/geometry.h"
+#include "grid/state.h"
 #include "zoom/zoom.h"
 
 namespace korfuzz {

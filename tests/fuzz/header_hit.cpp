@@ -1,7 +1,7 @@
 // Items and borders under a position of a header strip, against the definition, border by border.
 #include "fuzz_input.h"
 
-#include "header/header_hit_test.h"
+#include "header/hit_test.h"
 
 namespace korfuzz {
 namespace {

@@ -1,7 +1,8 @@
 // Numbers to text and back, and doubles by their bits.
 #include "fuzz_input.h"
 
-#include "graph/graph_numbers.h"
+#include "graph/scale/number_format.h"
+#include "numbers/truncate.h"
 
 #include <memory>
 #include <string>

@@ -2,8 +2,9 @@
 // are numbers, few, and in view.
 #include "fuzz_chart.h"
 
-#include "graph/graph_numbers.h"
-#include "graph/graph_walks.h"
+#include "graph/data/axes.h"
+#include "graph/scale/ticks.h"
+#include "numbers/truncate.h"
 
 namespace korfuzz {
 namespace {
@@ -41,15 +42,15 @@ void CheckTicks(const kor::GraphRecord& graph) {
     int drawn = 0;
     EXPECT_THAT(graph.xTickStep > 0 && std::isfinite(graph.xTickStep));
     EXPECT_THAT(graph.yTickStep > 0 && std::isfinite(graph.yTickStep));
-    kor::WalkXTicks(graph, graph.xTickStep, 0, right, [&](double value, int column) {
-        EXPECT_THAT(std::isfinite(value) && column >= 0 && column <= right);
+    for (kor::TickWalk tick(kor::XAxis(graph), graph.xTickStep, 0, right); tick.Next();) {
+        EXPECT_THAT(std::isfinite(tick.value()) && tick.pixel() >= 0 && tick.pixel() <= right);
         EXPECT_THAT(++drawn < kMostDrawn);
-    });
+    }
     drawn = 0;
-    kor::WalkYTicks(graph, graph.yTickStep, 0, bottom, [&](double value, int row) {
-        EXPECT_THAT(std::isfinite(value) && row >= 0 && row <= bottom);
+    for (kor::TickWalk tick(kor::YAxis(graph), graph.yTickStep, 0, bottom); tick.Next();) {
+        EXPECT_THAT(std::isfinite(tick.value()) && tick.pixel() >= 0 && tick.pixel() <= bottom);
         EXPECT_THAT(++drawn < kMostDrawn);
-    });
+    }
 }
 
 // Any step between any values: multiples that can be counted.

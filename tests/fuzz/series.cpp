@@ -1,8 +1,7 @@
 // A chart's data by any sequence of messages, against a plain model; and what lies under a pixel.
 #include "fuzz_chart.h"
 
-#include "graph/graph_hit_test.h"
-#include "graph/graph_numbers.h"
+#include "graph/hit_test.h"
 
 #include <memory>
 

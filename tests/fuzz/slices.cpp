@@ -2,7 +2,7 @@
 // each row for itself.
 #include "fuzz_input.h"
 
-#include "graph/graph_slice_walk.h"
+#include "graph/shapes/slice_walk.h"
 
 #include <map>
 

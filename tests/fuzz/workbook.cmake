@@ -1,6 +1,6 @@
 # The workbook's engine: files, formulas, numbers, the clipboard's text, edits. All of it but its
 # way to the system's files.
-set(workbook_folder ${CMAKE_CURRENT_LIST_DIR}/../../examples/workbook)
+set(workbook_folder ${CMAKE_CURRENT_LIST_DIR}/../../apps/workbook)
 file(GLOB workbook_engine CONFIGURE_DEPENDS ${workbook_folder}/model/*.cpp)
 list(FILTER workbook_engine EXCLUDE REGEX "/(file_io|file_nature|new_file)\\.cpp$")
 add_library(workbook_engine STATIC ${workbook_engine} ${workbook_folder}/tab_text.cpp)

@@ -1,6 +1,6 @@
 #include "graph/number_graph.h"
 
-#include "graph/graph_hit_test.h"
+#include "graph/hit_test.h"
 
 namespace kortest {
 namespace {

@@ -5,9 +5,9 @@
 // one y unit; x value 5 stands in column 115, y value 5 in row 65.
 #pragma once
 
-#include "graph/graph_record.h"
-#include "graph/graph_scale.h"
-#include "graph/graph_series.h"
+#include "graph/data/axes.h"
+#include "graph/data/record.h"
+#include "graph/data/series.h"
 
 #include <gtest/gtest.h>
 

@@ -12,7 +12,7 @@ def run(command, folder, **options):
 def compile_command(build, source, output):
     """How the library's sources are compiled, for another source. Dependencies are not recorded."""
     database = json.loads(run(["ninja", "-t", "compdb"], build, check=True).stdout)
-    entry = next(e for e in database if e["file"].endswith("/src/core/version.cpp"))
+    entry = next(e for e in database if e["file"].endswith("/src/library/version.cpp"))
     arguments = shlex.split(entry["command"])
     for option in ("-MF", "-MT", "-o", "-c"):
         at = arguments.index(option)

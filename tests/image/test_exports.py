@@ -1,4 +1,4 @@
-"""The library exports what src/korcontrols.def says."""
+"""The library exports what src/library/korcontrols.def says."""
 
 import pytest
 
@@ -7,7 +7,7 @@ from definitions import read_exports
 
 @pytest.fixture(scope="module")
 def promised(source):
-    return read_exports(source / "src" / "korcontrols.def")
+    return read_exports(source / "src" / "library" / "korcontrols.def")
 
 
 def test_names_and_ordinals_are_the_promised_ones(library, promised):

@@ -1,4 +1,4 @@
-"""Everything in res/korcontrols.rc is in the library."""
+"""Everything in src/library/korcontrols.rc is in the library."""
 
 import re
 import struct
@@ -11,7 +11,7 @@ BITMAP_FILE_HEADER = 14  # bytes before the picture in a .bmp file, absent in a 
 
 @pytest.fixture(scope="module")
 def script(source):
-    return re.sub(r"//[^\n]*", "", (source / "res" / "korcontrols.rc").read_text())
+    return re.sub(r"//[^\n]*", "", (source / "src" / "library" / "korcontrols.rc").read_text())
 
 
 @pytest.fixture(scope="module")
@@ -34,7 +34,7 @@ def test_kinds_and_numbers_are_those_of_the_script(script, resources):
 
 def test_bitmaps_are_the_files(script, resources, source):
     for number, name in re.findall(r'^(\d+)\s+BITMAP\s+"([^"]+)"', script, re.MULTILINE):
-        file = (source / "res" / name).read_bytes()
+        file = (source / "src" / "library" / name).read_bytes()
         data = resources[BITMAP, int(number)]
         assert data[:len(file) - BITMAP_FILE_HEADER] == file[BITMAP_FILE_HEADER:], name
 

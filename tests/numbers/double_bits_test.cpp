@@ -1,8 +1,8 @@
 // Arithmetic by bits against the same in floating point.
 #include "numbers/double_bits.h"
 
-#include "graph/graph_numbers.h"
 #include "numbers/special_doubles.h"
+#include "numbers/truncate.h"
 
 #include <gtest/gtest.h>
 

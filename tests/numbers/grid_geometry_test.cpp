@@ -1,4 +1,4 @@
-#include "grid/grid_geometry.h"
+#include "grid/geometry.h"
 
 #include <gtest/gtest.h>
 

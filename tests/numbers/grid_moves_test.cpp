@@ -1,55 +1,52 @@
 // The rules of the arrow and page keys, none of which mirrors another.
-#include "grid/grid_moves.h"
+#include "grid/moves.h"
 
 #include <gtest/gtest.h>
 
 #include <ostream>
 
-bool operator==(const GridSelection& a, const GridSelection& b) {
-    return a.left == b.left && a.right == b.right && a.top == b.top && a.bottom == b.bottom;
-}
+namespace kor {
 
-void PrintTo(const GridSelection& block, std::ostream* stream) {
+void PrintTo(const CellBlock& block, std::ostream* stream) {
     *stream << "columns " << block.left << "-" << block.right << " rows " << block.top << "-"
             << block.bottom;
 }
 
-namespace kor {
 namespace {
 
 constexpr Anchor kNone{-1, -1};
 
-constexpr GridSelection Block(int left, int right, int top, int bottom) {
-    return {static_cast<WORD>(left), static_cast<WORD>(right), static_cast<WORD>(top),
-            static_cast<WORD>(bottom)};
+constexpr CellBlock Block(int left, int right, int top, int bottom) {
+    return {static_cast<uint16_t>(left), static_cast<uint16_t>(right), static_cast<uint16_t>(top),
+            static_cast<uint16_t>(bottom)};
 }
-constexpr GridSelection Cell(int column, int row) { return Block(column, column, row, row); }
+constexpr CellBlock OneCell(int column, int row) { return Block(column, column, row, row); }
 
 TEST(GridMoves, MoveASingleCell) {
-    EXPECT_EQ(MoveLeft(Cell(5, 7), kNone), Cell(4, 7));
-    EXPECT_EQ(MoveUp(Cell(5, 7), kNone), Cell(5, 6));
-    EXPECT_EQ(MoveRight(Cell(5, 7), kNone), Cell(6, 7));
-    EXPECT_EQ(MoveDown(Cell(5, 7), kNone), Cell(5, 8));
+    EXPECT_EQ(MoveLeft(OneCell(5, 7), kNone), OneCell(4, 7));
+    EXPECT_EQ(MoveUp(OneCell(5, 7), kNone), OneCell(5, 6));
+    EXPECT_EQ(MoveRight(OneCell(5, 7), kNone), OneCell(6, 7));
+    EXPECT_EQ(MoveDown(OneCell(5, 7), kNone), OneCell(5, 8));
 }
 
 TEST(GridMoves, MakeACellOfABlock) {
-    const GridSelection block = Block(5, 8, 7, 9);
-    EXPECT_EQ(MoveLeft(block, kNone), Cell(4, 7));
-    EXPECT_EQ(MoveUp(block, kNone), Cell(5, 6));
-    EXPECT_EQ(MoveRight(block, kNone), Cell(6, 7));
-    EXPECT_EQ(MoveDown(block, kNone), Cell(5, 8));
+    const CellBlock block = Block(5, 8, 7, 9);
+    EXPECT_EQ(MoveLeft(block, kNone), OneCell(4, 7));
+    EXPECT_EQ(MoveUp(block, kNone), OneCell(5, 6));
+    EXPECT_EQ(MoveRight(block, kNone), OneCell(6, 7));
+    EXPECT_EQ(MoveDown(block, kNone), OneCell(5, 8));
 }
 
 TEST(GridMoves, StopAtTheSheetsEdges) {
-    EXPECT_EQ(MoveLeft(Cell(0, 7), kNone), Cell(0, 7));
-    EXPECT_EQ(MoveUp(Cell(5, 0), kNone), Cell(5, 0));
-    EXPECT_EQ(MoveRight(Cell(255, 7), kNone), Cell(255, 7));
-    EXPECT_EQ(MoveDown(Cell(5, 16383), kNone), Cell(5, 16383));
+    EXPECT_EQ(MoveLeft(OneCell(0, 7), kNone), OneCell(0, 7));
+    EXPECT_EQ(MoveUp(OneCell(5, 0), kNone), OneCell(5, 0));
+    EXPECT_EQ(MoveRight(OneCell(255, 7), kNone), OneCell(255, 7));
+    EXPECT_EQ(MoveDown(OneCell(5, 16383), kNone), OneCell(5, 16383));
 }
 
 TEST(GridMoves, NeedBothHalvesOfAnAnchor) {
-    EXPECT_EQ(MoveRight(Cell(5, 7), (Anchor{5, -1})), Cell(6, 7));
-    EXPECT_EQ(MoveRight(Cell(5, 7), (Anchor{-1, 7})), Cell(6, 7));
+    EXPECT_EQ(MoveRight(OneCell(5, 7), (Anchor{5, -1})), OneCell(6, 7));
+    EXPECT_EQ(MoveRight(OneCell(5, 7), (Anchor{-1, 7})), OneCell(6, 7));
 }
 
 TEST(GridMovesLeft, ExtendFromAnAnchorAtTheRightEdge) {
@@ -100,15 +97,15 @@ TEST(GridMovesDown, ShrinkTowardsAnyOtherAnchor) {
 }
 
 TEST(GridPages, MoveOneCellByAPage) {
-    EXPECT_EQ(MovePageDown(Block(5, 8, 7, 9), 20), Cell(5, 27));
-    EXPECT_EQ(MovePageUp(Block(5, 8, 27, 29), 20), Cell(5, 7));
+    EXPECT_EQ(MovePageDown(Block(5, 8, 7, 9), 20), OneCell(5, 27));
+    EXPECT_EQ(MovePageUp(Block(5, 8, 27, 29), 20), OneCell(5, 7));
 }
 
 TEST(GridPages, StopAtTheTopAndRunPastTheBottom) {
-    EXPECT_EQ(MovePageUp(Cell(5, 7), 20), Cell(5, 0));
-    EXPECT_EQ(MovePageDown(Cell(5, 16370), 20), Cell(5, 16384));
-    EXPECT_EQ(MovePageDown(Cell(5, 16363), 20), Cell(5, 16383));
-    EXPECT_EQ(MovePageDown(Cell(5, 16364), 20), Cell(5, 16384));
+    EXPECT_EQ(MovePageUp(OneCell(5, 7), 20), OneCell(5, 0));
+    EXPECT_EQ(MovePageDown(OneCell(5, 16370), 20), OneCell(5, 16384));
+    EXPECT_EQ(MovePageDown(OneCell(5, 16363), 20), OneCell(5, 16383));
+    EXPECT_EQ(MovePageDown(OneCell(5, 16364), 20), OneCell(5, 16384));
 }
 
 }  // namespace

@@ -1,4 +1,4 @@
-#include "header/header_hit_test.h"
+#include "header/hit_test.h"
 
 #include <gtest/gtest.h>
 

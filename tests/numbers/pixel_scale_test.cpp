@@ -1,8 +1,8 @@
 // The mapping of values to pixels by whole numbers against the same in floating point.
 #include "numbers/pixel_scale.h"
 
-#include "graph/graph_numbers.h"
 #include "numbers/special_doubles.h"
+#include "numbers/truncate.h"
 
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+#include "text/zoomed_font.h"
 #include "zoom/zoom.h"
 
 #include <gtest/gtest.h>

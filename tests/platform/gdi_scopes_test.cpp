@@ -1,5 +1,5 @@
 // Scopes of drawing, where the system refuses what they ask for.
-#include "platform/gdi_scopes.h"
+#include "base/gdi_scopes.h"
 
 #include <gtest/gtest.h>
 

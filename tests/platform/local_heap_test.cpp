@@ -1,5 +1,5 @@
 // Arrays on the local heap: their bytes are counted before they are asked for.
-#include "platform/local_heap.h"
+#include "base/local_heap.h"
 
 #include <gtest/gtest.h>
 

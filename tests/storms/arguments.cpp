@@ -12,10 +12,11 @@ namespace kortest {
 namespace {
 
 int Extreme(RandomSource& random) {
-    return random.anyOf({0,          1,          -1,      2,       -2,      127,        128,
-                         255,        256,        32767,   32768,   65535,   65536,      16383,
-                         16384,      0x7FFFFFFF, -0x7FFFFFFF, static_cast<int>(0x80000000u),
-                         0x7FFFFFFE, 0x40000000, 1000000, -100000});
+    return random.anyOf(
+        {0,          1,          -1,      2,          -2,          127,
+         128,        255,        256,     32767,      32768,       65535,
+         65536,      16383,      16384,   0x7FFFFFFF, -0x7FFFFFFF, static_cast<int>(0x80000000u),
+         0x7FFFFFFE, 0x40000000, 1000000, -100000});
 }
 
 int Wild(RandomSource& random) {
@@ -43,7 +44,8 @@ int Column(RandomSource& random) {
 int Row(RandomSource& random) {
     if (random.oneIn(30)) return Wild(random);
     if (random.oneIn(3)) return random.from(16370, 16390);
-    return random.oneIn(3) ? random.anyOf({985, 995, 1000, 9985, 9995, 10000}) : random.from(-1, 20);
+    return random.oneIn(3) ? random.anyOf({985, 995, 1000, 9985, 9995, 10000})
+                           : random.from(-1, 20);
 }
 
 int ZoomLevel(RandomSource& random) {
@@ -72,41 +74,109 @@ int Real(RandomSource& random) {
 }
 
 // Numbers of the system's own that carry no pointer, and the library's own numbers that do not.
-constexpr UINT kMessages[] = {
-    WM_NULL,           WM_MOVE,          WM_SIZE,           WM_ACTIVATE,      WM_SETFOCUS,
-    WM_KILLFOCUS,      WM_ENABLE,        WM_SETREDRAW,      WM_PAINT,         WM_ERASEBKGND,
-    WM_SHOWWINDOW,     WM_CANCELMODE,    WM_CAPTURECHANGED, WM_NCPAINT,       WM_NCHITTEST,
-    WM_GETDLGCODE,     WM_KEYDOWN,       WM_KEYUP,          WM_CHAR,          WM_SYSCHAR,
-    WM_TIMER,          WM_HSCROLL,       WM_VSCROLL,        WM_MOUSEMOVE,     WM_LBUTTONDOWN,
-    WM_LBUTTONUP,      WM_LBUTTONDBLCLK, WM_RBUTTONDOWN,    WM_RBUTTONUP,     WM_MOUSEWHEEL,
-    WM_CREATE,         WM_SYSCOLORCHANGE, WM_FONTCHANGE,    WM_QUERYNEWPALETTE, WM_MENUCHAR,
-    WM_GETTEXTLENGTH,  WM_COMMAND,       WM_USER,           WM_USER + 6003,   WM_USER + 9999,
-    GRIDM_REDRAW,      GM_SETTYPE,       GM_AUTORANGE,      GM_SETZOOM,       GM_TOGGLEOPTIONS,
-    GM_SETDATAMODE,    GM_SETBKCOLOR,    HCM_DELETEITEM,    HCM_SETITEMSTATE, HCM_GETITEMCOUNT,
-    HCM_GETITEMSIZE,   HCN_ITEMCLICK,    HCN_ITEMRESIZING,  HCN_ITEMRESIZED,  0x8000,
-    0xC123,            0xFFFF};
+constexpr UINT kMessages[] = {WM_NULL,
+                              WM_MOVE,
+                              WM_SIZE,
+                              WM_ACTIVATE,
+                              WM_SETFOCUS,
+                              WM_KILLFOCUS,
+                              WM_ENABLE,
+                              WM_SETREDRAW,
+                              WM_PAINT,
+                              WM_ERASEBKGND,
+                              WM_SHOWWINDOW,
+                              WM_CANCELMODE,
+                              WM_CAPTURECHANGED,
+                              WM_NCPAINT,
+                              WM_NCHITTEST,
+                              WM_GETDLGCODE,
+                              WM_KEYDOWN,
+                              WM_KEYUP,
+                              WM_CHAR,
+                              WM_SYSCHAR,
+                              WM_TIMER,
+                              WM_HSCROLL,
+                              WM_VSCROLL,
+                              WM_MOUSEMOVE,
+                              WM_LBUTTONDOWN,
+                              WM_LBUTTONUP,
+                              WM_LBUTTONDBLCLK,
+                              WM_RBUTTONDOWN,
+                              WM_RBUTTONUP,
+                              WM_MOUSEWHEEL,
+                              WM_CREATE,
+                              WM_SYSCOLORCHANGE,
+                              WM_FONTCHANGE,
+                              WM_QUERYNEWPALETTE,
+                              WM_MENUCHAR,
+                              WM_GETTEXTLENGTH,
+                              WM_COMMAND,
+                              WM_USER,
+                              WM_USER + 6003,
+                              WM_USER + 9999,
+                              GRIDM_REDRAW,
+                              GM_SETTYPE,
+                              GM_AUTORANGE,
+                              GM_SETZOOM,
+                              GM_TOGGLEOPTIONS,
+                              GM_SETDATAMODE,
+                              GM_SETBKCOLOR,
+                              HCM_DELETEITEM,
+                              HCM_SETITEMSTATE,
+                              HCM_GETITEMCOUNT,
+                              HCM_GETITEMSIZE,
+                              HCN_ITEMCLICK,
+                              HCN_ITEMRESIZING,
+                              HCN_ITEMRESIZED,
+                              0x8000,
+                              0xC123,
+                              0xFFFF};
 
-constexpr UINT kHostMessages[] = {
-    WM_PARENTNOTIFY, WM_COMMAND,        WM_SIZE,      WM_WINDOWPOSCHANGED, WM_WINDOWPOSCHANGING,
-    WM_SETFOCUS,     WM_KILLFOCUS,      WM_KEYDOWN,   WM_CAPTURECHANGED,   WM_ERASEBKGND,
-    WM_PAINT,        GRIDN_EQUATIONENTERED, GRIDN_EQUATIONEMPTY, HCN_ITEMCLICK, HCN_ITEMRESIZING,
-    HCN_ITEMRESIZED, WM_ENABLE,         WM_SHOWWINDOW, WM_DESTROY,         WM_CANCELMODE,
-    WM_ENTERIDLE,    WM_ENTERIDLE};
+constexpr UINT kHostMessages[] = {WM_PARENTNOTIFY,
+                                  WM_COMMAND,
+                                  WM_SIZE,
+                                  WM_WINDOWPOSCHANGED,
+                                  WM_WINDOWPOSCHANGING,
+                                  WM_SETFOCUS,
+                                  WM_KILLFOCUS,
+                                  WM_KEYDOWN,
+                                  WM_CAPTURECHANGED,
+                                  WM_ERASEBKGND,
+                                  WM_PAINT,
+                                  GRIDN_EQUATIONENTERED,
+                                  GRIDN_EQUATIONEMPTY,
+                                  HCN_ITEMCLICK,
+                                  HCN_ITEMRESIZING,
+                                  HCN_ITEMRESIZED,
+                                  WM_ENABLE,
+                                  WM_SHOWWINDOW,
+                                  WM_DESTROY,
+                                  WM_CANCELMODE,
+                                  WM_ENTERIDLE,
+                                  WM_ENTERIDLE};
 
-constexpr UINT kCodes[] = {0, GRIDN_PAINTCELLS, GRIDN_PAINTCELLS, GRIDN_CELLCLICKED,
-                           GRIDN_COLUMNRESIZED, GRIDN_ROWRESIZED, GRIDN_CURRENTCELL,
-                           GRIDN_SELECTING, GRIDN_SELECTIONDONE, GRIDN_EDITFOCUS,
-                           GRIDN_EDITKILLFOCUS, 0};
+constexpr UINT kCodes[] = {0,
+                           GRIDN_PAINTCELLS,
+                           GRIDN_PAINTCELLS,
+                           GRIDN_CELLCLICKED,
+                           GRIDN_COLUMNRESIZED,
+                           GRIDN_ROWRESIZED,
+                           GRIDN_CURRENTCELL,
+                           GRIDN_SELECTING,
+                           GRIDN_SELECTIONDONE,
+                           GRIDN_EDITFOCUS,
+                           GRIDN_EDITKILLFOCUS,
+                           0};
 
 constexpr UINT kControlMessages[] = {
-    WM_NCCREATE,       WM_NCCALCSIZE,     WM_CREATE,     WM_SIZE,         WM_WINDOWPOSCHANGING,
-    WM_WINDOWPOSCHANGED, WM_PAINT,        WM_NCPAINT,    WM_ERASEBKGND,   WM_SETFOCUS,
-    WM_KILLFOCUS,      WM_CAPTURECHANGED, WM_SHOWWINDOW, WM_PARENTNOTIFY, WM_CTLCOLOREDIT,
-    WM_CTLCOLORBTN,    WM_COMMAND,        WM_DESTROY,    WM_NCDESTROY,    WM_STYLECHANGED,
-    WM_MEASUREITEM,    WM_DRAWITEM,       WM_CANCELMODE, WM_ENABLE,       WM_HSCROLL,
-    WM_VSCROLL,        WM_SETTEXT,        WM_SETFONT,    HCM_INSERTITEM,  HCM_DELETEITEM,
-    HCM_SETITEM,       HCM_GETITEMCOUNT,  HCN_ITEMCLICK, HCN_ITEMRESIZING, HCN_ITEMRESIZED,
-    WM_KEYDOWN,        WM_NCHITTEST,      WM_MOVE,       GRIDM_REDRAW,    WM_LBUTTONUP};
+    WM_NCCREATE,         WM_NCCALCSIZE,     WM_CREATE,     WM_SIZE,          WM_WINDOWPOSCHANGING,
+    WM_WINDOWPOSCHANGED, WM_PAINT,          WM_NCPAINT,    WM_ERASEBKGND,    WM_SETFOCUS,
+    WM_KILLFOCUS,        WM_CAPTURECHANGED, WM_SHOWWINDOW, WM_PARENTNOTIFY,  WM_CTLCOLOREDIT,
+    WM_CTLCOLORBTN,      WM_COMMAND,        WM_DESTROY,    WM_NCDESTROY,     WM_STYLECHANGED,
+    WM_MEASUREITEM,      WM_DRAWITEM,       WM_CANCELMODE, WM_ENABLE,        WM_HSCROLL,
+    WM_VSCROLL,          WM_SETTEXT,        WM_SETFONT,    HCM_INSERTITEM,   HCM_DELETEITEM,
+    HCM_SETITEM,         HCM_GETITEMCOUNT,  HCN_ITEMCLICK, HCN_ITEMRESIZING, HCN_ITEMRESIZED,
+    WM_KEYDOWN,          WM_NCHITTEST,      WM_MOVE,       GRIDM_REDRAW,     WM_LBUTTONUP};
 
 constexpr int kHostEvents = static_cast<int>(std::size(kHostMessages));
 constexpr int kCodeEvents = static_cast<int>(std::size(kCodes));
@@ -207,13 +277,13 @@ std::vector<double> SeriesOf(int kind, int count) {
     for (int i = 0; i < count; ++i) {
         double value = 0;
         switch (kind) {
-        case 0: value = i % 3 == 1 ? 1 : 5; break;              // ties
-        case 1: value = 7; break;                               // constant
-        case 2: value = i; break;                               // sorted
-        case 3: value = -2.5 * i; break;                        // sorted, falling
-        case 4: value = i % 2 ? 40 : -40; break;                // zig-zag
-        case 5: value = i / 4 * 3; break;                       // steps
-        case 6: value = RealOf(random.below(24)); break;        // special numbers
+        case 0: value = i % 3 == 1 ? 1 : 5; break;               // ties
+        case 1: value = 7; break;                                // constant
+        case 2: value = i; break;                                // sorted
+        case 3: value = -2.5 * i; break;                         // sorted, falling
+        case 4: value = i % 2 ? 40 : -40; break;                 // zig-zag
+        case 5: value = i / 4 * 3; break;                        // steps
+        case 6: value = RealOf(random.below(24)); break;         // special numbers
         case 7: value = random.oneIn(4) ? RealOf(2) : i; break;  // gaps of NaN
         case 8: value = 0; break;
         case 9: value = random.from(0, 3); break;  // many ties
@@ -225,7 +295,9 @@ std::vector<double> SeriesOf(int kind, int count) {
     return values;
 }
 
-UINT MessageOf(int number) { return kMessages[static_cast<unsigned>(number) % std::size(kMessages)]; }
+UINT MessageOf(int number) {
+    return kMessages[static_cast<unsigned>(number) % std::size(kMessages)];
+}
 
 Event EventOf(int number) {
     if (number < kHostEvents) return {Event::kHost, kHostMessages[number], 0};

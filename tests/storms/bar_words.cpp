@@ -88,16 +88,11 @@ void Entry(Stage& stage, const Arguments& a) {
 }
 
 constexpr Word kWords[] = {
-    KORTEST_WINDOW_WORDS(kBar, "bar."),
-    {"bar.insert", 90, "sniti", Insert},
-    {"bar.append", 60, "sti", Append},
-    {"bar.get", 60, "snii", Get},
-    {"bar.delete", 50, "si", Delete},
-    {"bar.delete_all", 12, "s", DeleteAll},
-    {"bar.current", 70, "si", Current},
-    {"bar.images", 6, "sb", SetImages},
-    {"bar.nulls", 6, "s", Nulls},
-    {"bar.entry", 20, "snn", Entry},
+    KORTEST_WINDOW_WORDS(kBar, "bar."), {"bar.insert", 90, "sniti", Insert},
+    {"bar.append", 60, "sti", Append},  {"bar.get", 60, "snii", Get},
+    {"bar.delete", 50, "si", Delete},   {"bar.delete_all", 12, "s", DeleteAll},
+    {"bar.current", 70, "si", Current}, {"bar.images", 6, "sb", SetImages},
+    {"bar.nulls", 6, "s", Nulls},       {"bar.entry", 20, "snn", Entry},
 };
 
 }  // namespace

@@ -1,8 +1,8 @@
 #include "storms/pictures.h"
 
-#include "graph/graph_record.h"
+#include "graph/data/record.h"
 #include "graph/pictures/chart_pair.h"
-#include "graph/pictures/literal_chart.h"
+#include "literal_chart/literal_chart.h"
 #include "storms/failure.h"
 #include "storms/stage.h"
 

@@ -20,9 +20,10 @@ void Notify(Stage& stage, HWND chart, UINT code, LPARAM argument) {
 // A pointer is handed over with as many values as the count says, or with a count below 1.
 struct HandedSeries {
     HandedSeries(int kind, int count, int index)
-        : values(SeriesOf(kind, std::clamp(count, 0, kMostTotal))),
-          data{static_cast<LONG>(std::min(count, kMostTotal)), TextOf(kind + count), values.data(),
-               index} {
+        : values(SeriesOf(kind, std::clamp(count, 0, kMostTotal))), data{static_cast<LONG>(std::min(
+                                                                             count, kMostTotal)),
+                                                                         TextOf(kind + count),
+                                                                         values.data(), index} {
         if (values.empty()) data.values = nullptr;
     }
     std::vector<double> values;
@@ -124,9 +125,10 @@ void Redraw(Stage& stage, const Arguments& a) { Notify(stage, Chart(stage, a[0])
 
 // Null where a pointer is needed, in every message that has one.
 void Nulls(Stage& stage, const Arguments& a) {
-    static constexpr UINT kMessages[] = {GM_ADDSERIES,      GM_GETTITLE, GM_GETXTITLE, GM_GETYTITLE,
-                                         GM_SETCATEGORIES,  GM_GETTYPE,  GM_SETRANGE,  GM_GETOPTIONS,
-                                         GM_GETSERIESCOLOR, GM_GETZOOM,  GM_GETRANGE,  GM_SHOWLEGEND};
+    static constexpr UINT kMessages[] = {GM_ADDSERIES, GM_GETTITLE,      GM_GETXTITLE,
+                                         GM_GETYTITLE, GM_SETCATEGORIES, GM_GETTYPE,
+                                         GM_SETRANGE,  GM_GETOPTIONS,    GM_GETSERIESCOLOR,
+                                         GM_GETZOOM,   GM_GETRANGE,      GM_SHOWLEGEND};
     HWND chart = Chart(stage, a[0]);
     for (const UINT message : kMessages) stage.send(chart, message, 0, 0);
     Notify(stage, chart, GN_SETVALUE, 0);
@@ -264,10 +266,8 @@ void TipPaint(Stage& stage, const Arguments& a) {
 }
 
 constexpr Word kTipWords[] = {
-    KORTEST_WINDOW_WORDS(kTip, "tip."),
-    {"tip.request", 120, "stxxx", TipShow},
-    {"tip.hide", 60, "s", TipHide},
-    {"tip.null", 10, "s", TipNull},
+    KORTEST_WINDOW_WORDS(kTip, "tip."),    {"tip.request", 120, "stxxx", TipShow},
+    {"tip.hide", 60, "s", TipHide},        {"tip.null", 10, "s", TipNull},
     {"tip.paint_into", 40, "s", TipPaint},
 };
 

@@ -1,6 +1,6 @@
 #include "storms/checks.h"
 
-#include "graph/graph_record.h"
+#include "graph/data/record.h"
 #include "storms/failure.h"
 #include "storms/library.h"
 
@@ -12,7 +12,8 @@ namespace {
 
 constexpr int kCheckedItems = 6;
 
-// ---- Strips ----------------------------------------------------------------------------------------
+// ---- Strips
+// ----------------------------------------------------------------------------------------
 
 LRESULT ItemSize(HWND strip, int index) {
     return SendMessageW(strip, HCM_GETITEMSIZE, static_cast<WPARAM>(index), 0);
@@ -23,15 +24,16 @@ void CheckStrip(HWND strip) {
     if (count < 0) FailStorm("strip: count %d", count);
     for (int i = 0; i < std::min(count, kCheckedItems); ++i) {
         const LRESULT size = ItemSize(strip, i);
-        if (size < 0 || size > 65535) FailStorm("strip: item %d of %d, size %ld", i, count,
-                                                static_cast<long>(size));
+        if (size < 0 || size > 65535)
+            FailStorm("strip: item %d of %d, size %ld", i, count, static_cast<long>(size));
     }
     if (ItemSize(strip, count) < 0) FailStorm("strip: no spare place behind %d items", count);
     if (ItemSize(strip, count + 1) != -1) FailStorm("strip: an item behind the spare place");
     if (ItemSize(strip, -1) != -1) FailStorm("strip: an item before the first");
 }
 
-// ---- The grid --------------------------------------------------------------------------------------
+// ---- The grid
+// --------------------------------------------------------------------------------------
 
 constexpr bool IsOrdered(const GridSelection& block) {
     return block.left <= block.right && block.top <= block.bottom;
@@ -46,8 +48,8 @@ void CheckVisibleRange(const GridVisibleRange& range) {
         FailStorm("grid: range %u-%u, %u-%u of %lu columns and %lu rows", range.firstColumn,
                   range.endColumn, range.firstRow, range.endRow, columns, rows);
     }
-    const bool isShown = columns && rows && range.firstColumn < KORGRID_COLUMNS &&
-                         range.firstRow < KORGRID_ROWS;
+    const bool isShown =
+        columns && rows && range.firstColumn < KORGRID_COLUMNS && range.firstRow < KORGRID_ROWS;
     if (isShown && !IsIndexVisible(KORGRID_CELL(range.firstColumn, range.firstRow))) {
         FailStorm("grid: the first visible cell is not visible");
     }
@@ -108,7 +110,8 @@ void CheckGrid(Stage& stage) {
     if (grid && stage.isLive(grid) && !stage.hasMixedGrids) CheckGridStrips(stage, grid);
 }
 
-// ---- Charts ----------------------------------------------------------------------------------------
+// ---- Charts
+// ----------------------------------------------------------------------------------------
 
 constexpr bool IsPartOf(int index, int count) { return index >= 0 && index < count; }
 
@@ -131,8 +134,7 @@ void CheckSeries(const kor::GraphSeries* series, int place) {
     if (hasNumbers && !IsRange(series->minValue, series->maxValue)) {
         FailStorm("chart: series %d from %g to %g", place, series->minValue, series->maxValue);
     }
-    if (series->livePointCount < 0 ||
-        series->livePointCount > std::max(series->pointCount, 3)) {
+    if (series->livePointCount < 0 || series->livePointCount > std::max(series->pointCount, 3)) {
         FailStorm("chart: series %d of %d points, %d of them live", place, series->pointCount,
                   series->livePointCount);
     }
@@ -166,7 +168,8 @@ void CheckChart(HWND window) {
     if (legend && graph->hwndLegend != legend) FailStorm("chart: another legend");
 }
 
-// ---- The function bar ------------------------------------------------------------------------------
+// ---- The function bar
+// ------------------------------------------------------------------------------
 
 void CheckBar(HWND bar) {
     const LONG count = KorFunkyBar_GetCount(bar);
@@ -200,7 +203,8 @@ void CheckStage(Stage& stage) {
     CheckWindows(stage, kBar, CheckBar);
 }
 
-// ---- Notifications ---------------------------------------------------------------------------------
+// ---- Notifications
+// ---------------------------------------------------------------------------------
 
 namespace {
 
@@ -235,8 +239,8 @@ void CheckPainting(const Stage& stage, const GridVisibleRange& told) {
 void CheckToldSelection(const GridSelection& told) {
     GridSelection selection = {};
     GetSelectedRanged(&selection);
-    if (told.left != selection.left || told.right != selection.right ||
-        told.top != selection.top || told.bottom != selection.bottom) {
+    if (told.left != selection.left || told.right != selection.right || told.top != selection.top ||
+        told.bottom != selection.bottom) {
         FailStorm("grid: tells another selection than it has");
     }
 }
@@ -259,8 +263,8 @@ void CheckNotification(Stage& stage, UINT message, WPARAM wParam, LPARAM lParam)
         CheckToldSelection(*reinterpret_cast<const GridSelection*>(lParam));
         break;
     case GRIDN_EDITKILLFOCUS:
-        if (lParam != 0 && lParam != 1) FailStorm("grid: the focus goes in manner %ld",
-                                                  static_cast<long>(lParam));
+        if (lParam != 0 && lParam != 1)
+            FailStorm("grid: the focus goes in manner %ld", static_cast<long>(lParam));
         break;
     default: break;
     }

@@ -15,7 +15,8 @@ Stage* waiting = nullptr;  // whose dialog or job it is
 bool isPrinterChosen = false;
 int pages = 0;
 
-// ---- Printing --------------------------------------------------------------------------------------
+// ---- Printing
+// --------------------------------------------------------------------------------------
 
 decltype(&GetProcAddress) realGetProcAddress = nullptr;
 
@@ -56,7 +57,8 @@ FARPROC WINAPI FindPrinting(HMODULE module, LPCSTR name) {
     return realGetProcAddress(module, name);
 }
 
-// ---- The sheet -------------------------------------------------------------------------------------
+// ---- The sheet
+// -------------------------------------------------------------------------------------
 
 const wchar_t* typedText = nullptr;
 bool isSheetAccepted = false;

@@ -37,9 +37,9 @@ std::string LastOperations() {
 std::string PlaceOf(const void* address) {
     HMODULE module = nullptr;
     char path[MAX_PATH] = "?";
-    GetModuleHandleExA(
-        GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS | GET_MODULE_HANDLE_EX_FLAG_UNCHANGED_REFCOUNT,
-        static_cast<LPCSTR>(address), &module);
+    GetModuleHandleExA(GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS |
+                           GET_MODULE_HANDLE_EX_FLAG_UNCHANGED_REFCOUNT,
+                       static_cast<LPCSTR>(address), &module);
     if (module) GetModuleFileNameA(module, path, MAX_PATH);
     const std::string name = path;
     std::ostringstream text;

@@ -64,16 +64,11 @@ void DragBorder(Stage& stage, const Arguments& a) {
 }
 
 constexpr Word kWords[] = {
-    KORTEST_WINDOW_WORDS(kStrip, "strip."),
-    {"strip.insert", 80, "sitz", Insert},
-    {"strip.append", 80, "stz", Append},
-    {"strip.delete", 90, "si", Delete},
-    {"strip.set", 80, "sitz", Set},
-    {"strip.state", 60, "sin", SetState},
-    {"strip.get", 50, "si", Get},
-    {"strip.null", 10, "sii", Null},
-    {"strip.clear", 4, "s", Clear},
-    {"strip.drag_border", 60, "sixb", DragBorder},
+    KORTEST_WINDOW_WORDS(kStrip, "strip."), {"strip.insert", 80, "sitz", Insert},
+    {"strip.append", 80, "stz", Append},    {"strip.delete", 90, "si", Delete},
+    {"strip.set", 80, "sitz", Set},         {"strip.state", 60, "sin", SetState},
+    {"strip.get", 50, "si", Get},           {"strip.null", 10, "sii", Null},
+    {"strip.clear", 4, "s", Clear},         {"strip.drag_border", 60, "sixb", DragBorder},
 };
 
 }  // namespace

@@ -71,12 +71,12 @@ void* MakeCounter(void* target) {
     if (!begin) return target;
     uint8_t* end = begin;
 #ifdef _WIN64
-    end = Put(end, {0x48, 0xB8}, &callsLeft);                       // mov rax, &callsLeft
-    end = Put(end, {0xFF, 0x08, 0x78}, static_cast<uint8_t>(12));   // dec [rax]; js used up
-    end = Put(end, {0x48, 0xB8}, target);                           // mov rax, target
-    end = Put(end, {0xFF}, static_cast<uint8_t>(0xE0));             // jmp rax
-    end = Put(end, {0x48, 0xB8}, &OnUsedUp);                        // used up: mov rax, OnUsedUp
-    Put(end, {0xFF}, static_cast<uint8_t>(0xE0));                   // jmp rax
+    end = Put(end, {0x48, 0xB8}, &callsLeft);                      // mov rax, &callsLeft
+    end = Put(end, {0xFF, 0x08, 0x78}, static_cast<uint8_t>(12));  // dec [rax]; js used up
+    end = Put(end, {0x48, 0xB8}, target);                          // mov rax, target
+    end = Put(end, {0xFF}, static_cast<uint8_t>(0xE0));            // jmp rax
+    end = Put(end, {0x48, 0xB8}, &OnUsedUp);                       // used up: mov rax, OnUsedUp
+    Put(end, {0xFF}, static_cast<uint8_t>(0xE0));                  // jmp rax
 #else
     end = Put(end, {0xFF, 0x0D}, &callsLeft);         // dec [callsLeft]
     end = Put(end, {0x78}, static_cast<uint8_t>(7));  // js used up

@@ -10,7 +10,8 @@ namespace kortest {
 
 class Stage;
 
-// ---- What differs between the storm on the DLL and the one linked with the library's objects ------
+// ---- What differs between the storm on the DLL and the one linked with the library's objects
+// ------
 
 // Whose import table the library's calls go through.
 HMODULE StormModule();
@@ -24,7 +25,8 @@ void CheckRecords(Stage& stage);
 // Draws again what is on the stage with plain calls, and compares.
 void ComparePictures(Stage& stage);
 
-// ---- Imports ----------------------------------------------------------------------------------------
+// ---- Imports
+// ----------------------------------------------------------------------------------------
 
 // Puts `function` into the import table's slot of this name. The former value, null when the module
 // does not import it.
@@ -34,7 +36,8 @@ void* ReplaceImport(const char* name, void* function);
 void CountImportCalls();
 void AllowImportCalls(int32_t calls);
 
-// ---- Heap -------------------------------------------------------------------------------------------
+// ---- Heap
+// -------------------------------------------------------------------------------------------
 
 // Gives the library blocks that end at a page without access. Blocks that were freed stay without
 // access until many others have been freed after them.
@@ -50,7 +53,8 @@ int BlocksMade();
 // Frees a block that the library gave away.
 void ReleaseLibraryBlock(void* block);
 
-// ---- Drawing objects --------------------------------------------------------------------------------
+// ---- Drawing objects
+// --------------------------------------------------------------------------------
 
 // Follows what is made and given back.
 void FollowHandles();

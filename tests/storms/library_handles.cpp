@@ -108,7 +108,8 @@ void FollowHandles() {
 HandleCounts LiveHandles() {
     HandleCounts counts{};
     if (!isFollowing) return counts;
-    for (const auto& [handle, kind] : objects) ++(kind == Made::font ? counts.fonts : counts.objects);
+    for (const auto& [handle, kind] : objects)
+        ++(kind == Made::font ? counts.fonts : counts.objects);
     for (const auto& [handle, times] : contexts) counts.contexts += times;
     counts.menus = static_cast<int>(menus.size());
     counts.paintings = paintings;

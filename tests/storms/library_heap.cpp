@@ -77,11 +77,12 @@ bool ExplainAccess(const void* address, bool isWrite, const void* instruction) {
     if (!IsInArena(address)) return false;
     const Block* block = Find(address);
     HMODULE module = nullptr;
-    GetModuleHandleExA(
-        GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS | GET_MODULE_HANDLE_EX_FLAG_UNCHANGED_REFCOUNT,
-        static_cast<LPCSTR>(instruction), &module);
+    GetModuleHandleExA(GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS |
+                           GET_MODULE_HANDLE_EX_FLAG_UNCHANGED_REFCOUNT,
+                       static_cast<LPCSTR>(instruction), &module);
     std::ostringstream kind;
-    kind << (block && block->isLive ? "overrun" : "use after free") << (isWrite ? ", write" : ", read")
+    kind << (block && block->isLive ? "overrun" : "use after free")
+         << (isWrite ? ", write" : ", read")
          << (module == StormModule() ? ", instruction at library + 0x" : ", instruction at 0x")
          << std::hex
          << reinterpret_cast<ULONG_PTR>(instruction) -
@@ -115,8 +116,8 @@ void* Allocate(size_t size, bool isZeroed, Family family) {
     std::memset(pages, kAround, static_cast<size_t>(begin - pages));
     std::memset(begin + size, kAround, room - size);
     std::memset(begin, isZeroed ? 0 : kFresh, size);
-    blocks[PageNumber(pages)] = {pages, begin,  size,   pageBytes,
-                                family, true, ++made, progress.step};
+    blocks[PageNumber(pages)] = {pages,  begin, size,   pageBytes,
+                                 family, true,  ++made, progress.step};
     ++live;
     return begin;
 }
@@ -158,7 +159,8 @@ void* Resize(void* pointer, size_t size, bool isZeroed, Family family) {
     return fresh;
 }
 
-// ---- What stands in the library's import table ---------------------------------------------------
+// ---- What stands in the library's import table
+// ---------------------------------------------------
 
 decltype(&LocalAlloc) realLocalAlloc;
 decltype(&LocalReAlloc) realLocalReAlloc;

@@ -109,8 +109,8 @@ bool VocabularyOf(const std::string& control, Vocabulary& vocabulary) {
     static constexpr struct {
         const char* name;
         void (*add)(Vocabulary& vocabulary);
-    } kControls[] = {{"header", AddHeaderWords}, {"grid", AddGridWords},
-                     {"chart", AddChartWords},   {"legend", AddLegendWords},
+    } kControls[] = {{"header", AddHeaderWords},   {"grid", AddGridWords},
+                     {"chart", AddChartWords},     {"legend", AddLegendWords},
                      {"tooltip", AddToolTipWords}, {"bar", AddBarWords},
                      {"lists", AddListWords}};
     bool isKnown = false;

@@ -12,9 +12,10 @@ namespace kortest {
 namespace {
 
 int Usage() {
-    std::fprintf(stderr,
-                 "storms --control header|grid|chart|legend|tooltip|bar|lists|all --seed S --steps N "
-                 "[--heap guarded|plain] [--replay FILE] [--record FILE]\n");
+    std::fprintf(
+        stderr,
+        "storms --control header|grid|chart|legend|tooltip|bar|lists|all --seed S --steps N "
+        "[--heap guarded|plain] [--replay FILE] [--record FILE]\n");
     return 2;
 }
 

@@ -24,9 +24,9 @@ Stage* stage = nullptr;
 constexpr wchar_t kHostClass[] = L"Host of a storm";
 
 const wchar_t* ClassOf(Kind kind) {
-    static const wchar_t* const kClasses[] = {
-        KORHEADER_CLASS,  KORGRID_CLASS,      KORGRAPH_CLASS, KORLEGEND_CLASS,
-        KORTOOLTIP_CLASS, KORFUNKYBAR_CLASS, WC_LISTVIEWW,   WC_TREEVIEWW};
+    static const wchar_t* const kClasses[] = {KORHEADER_CLASS, KORGRID_CLASS,    KORGRAPH_CLASS,
+                                              KORLEGEND_CLASS, KORTOOLTIP_CLASS, KORFUNKYBAR_CLASS,
+                                              WC_LISTVIEWW,    WC_TREEVIEWW};
     return kClasses[kind];
 }
 
@@ -164,7 +164,8 @@ LRESULT Stage::send(HWND window, UINT message, WPARAM wParam, LPARAM lParam) {
     return SendMessageW(window, message, wParam, lParam);
 }
 
-// ---- What windows receive --------------------------------------------------------------------------
+// ---- What windows receive
+// --------------------------------------------------------------------------
 
 template <Kind kind>
 LRESULT CALLBACK Stage::controlProc(HWND window, UINT message, WPARAM wParam, LPARAM lParam) {
@@ -264,7 +265,8 @@ LRESULT Stage::onHost(HWND window, UINT message, WPARAM wParam, LPARAM lParam) {
     return DefWindowProcW(window, message, wParam, lParam);
 }
 
-// ---- Running ---------------------------------------------------------------------------------------
+// ---- Running
+// ---------------------------------------------------------------------------------------
 
 void Stage::setTrap(const Operation& operation) {
     if (traps_.size() >= kMostTraps) traps_.erase(traps_.begin());
@@ -310,7 +312,8 @@ void Stage::pump() {
     constexpr UINT kSystemTimer = 0x118;
     int left = kMostPosted;
     MSG thrownAway;
-    while (PeekMessageW(&thrownAway, nullptr, WM_MOUSEFIRST, WM_MOUSELAST, PM_REMOVE)) {}
+    while (PeekMessageW(&thrownAway, nullptr, WM_MOUSEFIRST, WM_MOUSELAST, PM_REMOVE)) {
+    }
     take(WM_PAINT + 1, WM_TIMER - 1, left);
     take(WM_TIMER + 1, kSystemTimer - 1, left);
     take(kSystemTimer + 1, WM_MOUSEFIRST - 1, left);

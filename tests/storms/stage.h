@@ -50,13 +50,13 @@ public:
 
     // The grid whose messages the process-wide state follows: the one created last.
     HWND currentGrid() const { return currentGrid_; }
-    bool stripsInStep = false;  // the current grid has been laid out, and nothing came in between
-    bool hadTwoGrids = false;  // at the same time: the first one's objects are lost then
+    bool stripsInStep = false;   // the current grid has been laid out, and nothing came in between
+    bool hadTwoGrids = false;    // at the same time: the first one's objects are lost then
     bool hasMixedGrids = false;  // the last grid was created inside another one's creation
     int gridsCreated = 0;
     int textsLeft = 0;  // texts of single items that were deleted from a function bar
     bool selectionIsAnything = false;  // see noteSelecting
-    int paintingManner = 0;  // how a host answers GRIDN_PAINTCELLS
+    int paintingManner = 0;            // how a host answers GRIDN_PAINTCELLS
 
     // A window that was sent WM_DESTROY by hand, and lives without a record.
     void markWithoutRecord(HWND window) { live_[window].isWithoutRecord = true; }
@@ -126,7 +126,7 @@ private:
     uint32_t touched_ = 0;  // a bit for each place of each kind
     std::vector<Trap> traps_;
     int gridsInCreation_ = 0;
-    bool isAnchored_ = false;  // a press in the grid has not been let go
+    bool isAnchored_ = false;       // a press in the grid has not been let go
     bool isAnchorOutside_ = false;  // pressed while the view lay beyond the sheet
     int depth_ = 0;
     int innerLeft_ = 0;  // operations that traps may still do in this step

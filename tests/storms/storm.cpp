@@ -106,10 +106,9 @@ bool RunStorm(const StormPlan& plan) {
     stage.clear();
     CompareBalance(stage, before);
     std::printf("%s: seed %llu, %s heap, %u steps, %d pictures compared, %d pages, %d sheets\n",
-                plan.control.c_str(),
-                static_cast<unsigned long long>(plan.seed), NameOf(plan.heap),
-                static_cast<unsigned>(sequence.size()),
-                ChartsCompared() + OtherPicturesCompared(), PagesPrinted(), SheetsUsed());
+                plan.control.c_str(), static_cast<unsigned long long>(plan.seed), NameOf(plan.heap),
+                static_cast<unsigned>(sequence.size()), ChartsCompared() + OtherPicturesCompared(),
+                PagesPrinted(), SheetsUsed());
     std::fflush(stdout);
     return true;
 }

@@ -1,12 +1,12 @@
 // The storm linked with the library's objects: every record is in sight, and what the grid and its
 // strips show can be drawn again from it.
+#include "base/module.h"
+#include "funkybar/record.h"
 #include "grid/expected_grid.h"
 #include "grid/expected_picture.h"
-#include "grid/grid_state.h"
+#include "grid/state.h"
 #include "header/expected_strip.h"
-#include "header/header_record.h"
-#include "funkybar/funkybar_record.h"
-#include "platform/module.h"
+#include "header/record.h"
 #include "storms/failure.h"
 #include "storms/library.h"
 #include "storms/pictures.h"
@@ -19,7 +19,8 @@
 namespace kortest {
 namespace {
 
-// ---- Records ---------------------------------------------------------------------------------------
+// ---- Records
+// ---------------------------------------------------------------------------------------
 
 void CheckOverrides(const kor::SizeOverride* table, uint32_t count, int limit, int defaultSize,
                     const char* what) {
@@ -96,7 +97,8 @@ void CheckBarRecord() {
     if (!hasCurrent) FailStorm("bar: the current item is not in the list");
 }
 
-// ---- Pictures --------------------------------------------------------------------------------------
+// ---- Pictures
+// --------------------------------------------------------------------------------------
 
 constexpr int kLargestSide = 500;
 constexpr uint32_t kLargestZoom = 16;
@@ -124,7 +126,8 @@ ExpectedGrid DescribeGrid(const RECT& client) {
     expected.rowHeaderWidth = grid.rowHeaderWidth;
     expected.headersHidden = grid.headersHidden;
     expected.linesHidden = grid.gridLinesHidden;
-    expected.selection = grid.selection;
+    const kor::CellBlock& block = grid.selection;
+    expected.selection = {block.left, block.right, block.top, block.bottom};
     return expected;
 }
 
@@ -172,7 +175,8 @@ void CompareStrip(Stage& stage, HWND window) {
     const kor::HeaderRecord* record = kor::FindHeaderRecord(window);
     RECT client = {};
     GetClientRect(window, &client);
-    stage.runAlone([&] { SetWindowPos(window, HWND_TOP, 0, 0, 0, 0, SWP_NOSIZE | SWP_NOACTIVATE); });
+    stage.runAlone(
+        [&] { SetWindowPos(window, HWND_TOP, 0, 0, 0, 0, SWP_NOSIZE | SWP_NOACTIVATE); });
     if (!record || !IsWholeVisible(window, client) || client.right < 1 || client.bottom < 1 ||
         client.right > kLargestSide || client.bottom > kLargestSide ||
         kor::zoomLevel > kLargestZoom) {

@@ -41,20 +41,22 @@ TEST_P(Storms, BreakNothing) {
     EXPECT_TRUE(RunStorm(plan));
 }
 
-INSTANTIATE_TEST_SUITE_P(
-    Seed1, Storms,
-    ::testing::Values(Slice{"header", StormHeap::guarded, 10000},
-                      Slice{"grid", StormHeap::guarded, 4000}, Slice{"grid", StormHeap::plain, 4000},
-                      Slice{"chart", StormHeap::guarded, 4000},
-                      Slice{"chart", StormHeap::plain, 4000},
-                      Slice{"legend", StormHeap::guarded, 2000},
-                      Slice{"tooltip", StormHeap::guarded, 10000},
-                      Slice{"bar", StormHeap::guarded, 6000},
-                      Slice{"lists", StormHeap::guarded, 4000},
-                      Slice{"all", StormHeap::guarded, 4000}, Slice{"all", StormHeap::plain, 4000}),
-    NameOf);
+INSTANTIATE_TEST_SUITE_P(Seed1, Storms,
+                         ::testing::Values(Slice{"header", StormHeap::guarded, 10000},
+                                           Slice{"grid", StormHeap::guarded, 4000},
+                                           Slice{"grid", StormHeap::plain, 4000},
+                                           Slice{"chart", StormHeap::guarded, 4000},
+                                           Slice{"chart", StormHeap::plain, 4000},
+                                           Slice{"legend", StormHeap::guarded, 2000},
+                                           Slice{"tooltip", StormHeap::guarded, 10000},
+                                           Slice{"bar", StormHeap::guarded, 6000},
+                                           Slice{"lists", StormHeap::guarded, 4000},
+                                           Slice{"all", StormHeap::guarded, 4000},
+                                           Slice{"all", StormHeap::plain, 4000}),
+                         NameOf);
 
-// ---- Sequences that broke something once ----------------------------------------------------------
+// ---- Sequences that broke something once
+// ----------------------------------------------------------
 
 // "grid_drag_after_capture.txt" is a storm on the grid.
 std::vector<std::string> SequenceFiles() {

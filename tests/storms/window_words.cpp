@@ -6,8 +6,9 @@ namespace {
 // Bits that change what a window is to the system or to the library; the usual ones stay.
 DWORD OddStyle(int number) {
     const auto bits = static_cast<DWORD>(number);
-    return WS_CHILD | WS_VISIBLE | (bits & (WS_BORDER | WS_HSCROLL | WS_VSCROLL | WS_DISABLED |
-                                            WS_CLIPCHILDREN | WS_CLIPSIBLINGS | HCS_VERTICAL));
+    return WS_CHILD | WS_VISIBLE |
+           (bits & (WS_BORDER | WS_HSCROLL | WS_VSCROLL | WS_DISABLED | WS_CLIPCHILDREN |
+                    WS_CLIPSIBLINGS | HCS_VERTICAL));
 }
 
 // The system's own views wait for the pointer in a loop when they are pressed.
@@ -68,10 +69,14 @@ void DestroyHost(Stage& stage, const Arguments& a) { DestroyWindow(stage.parent(
 }  // namespace
 
 const Word kHostWords[] = {
-    {"shift", 10, "b", Shift},        {"pump", 60, "", Pump},
-    {"painting", 6, "i", Paint},      {"lose_capture", 12, "i", LoseCapture},
-    {"lose_focus", 6, "b", LoseFocus}, {"modal", 2, "b", Modal},
-    {"destroy_host", 1, "b", DestroyHost}, {"box", 1, "b", Box},
+    {"shift", 10, "b", Shift},
+    {"pump", 60, "", Pump},
+    {"painting", 6, "i", Paint},
+    {"lose_capture", 12, "i", LoseCapture},
+    {"lose_focus", 6, "b", LoseFocus},
+    {"modal", 2, "b", Modal},
+    {"destroy_host", 1, "b", DestroyHost},
+    {"box", 1, "b", Box},
 };
 const size_t kHostWordCount = std::size(kHostWords);
 

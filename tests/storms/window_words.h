@@ -26,23 +26,24 @@ struct WindowWords {
 };
 
 // The words of a kind: `name` is its prefix, as a literal with a dot.
-#define KORTEST_WINDOW_WORDS(kind, name)                                    \
-    {name "create", 6, "spzznb", WindowWords<kind>::create},                \
-    {name "destroy", 5, "s", WindowWords<kind>::destroy},                   \
-    {name "destroy_parent", 2, "s", WindowWords<kind>::destroyParent},      \
-    {name "destroy_message", 1, "s", WindowWords<kind>::destroyMessage},    \
-    {name "resize", 30, "szz", WindowWords<kind>::resize},                  \
-    {name "show", 6, "sb", WindowWords<kind>::show},                        \
-    {name "enable", 2, "sb", WindowWords<kind>::enable},                    \
-    {name "paint", 30, "sb", WindowWords<kind>::paint},                     \
-    {name "erase", 4, "s", WindowWords<kind>::erase},                       \
-    {name "focus", 10, "s", WindowWords<kind>::focus},                      \
-    {name "capture", 6, "si", WindowWords<kind>::capture},                  \
-    {name "reparent", 2, "sp", WindowWords<kind>::reparent},                \
-    {name "press", 60, "sxxn", WindowWords<kind>::press},                   \
-    {name "move", 80, "sxxb", WindowWords<kind>::move},                     \
-    {name "release", 50, "sxxb", WindowWords<kind>::release},               \
-    {name "wild", 40, "swnn", WindowWords<kind>::wild}
+#define KORTEST_WINDOW_WORDS(kind, name)                                                           \
+    {name "create", 6, "spzznb", WindowWords<kind>::create},                                       \
+        {name "destroy", 5, "s", WindowWords<kind>::destroy},                                      \
+        {name "destroy_parent", 2, "s", WindowWords<kind>::destroyParent},                         \
+        {name "destroy_message", 1, "s", WindowWords<kind>::destroyMessage},                       \
+        {name "resize", 30, "szz", WindowWords<kind>::resize},                                     \
+        {name "show", 6, "sb", WindowWords<kind>::show},                                           \
+        {name "enable", 2, "sb", WindowWords<kind>::enable},                                       \
+        {name "paint", 30, "sb", WindowWords<kind>::paint},                                        \
+        {name "erase", 4, "s", WindowWords<kind>::erase},                                          \
+        {name "focus", 10, "s", WindowWords<kind>::focus},                                         \
+        {name "capture", 6, "si", WindowWords<kind>::capture},                                     \
+        {name "reparent", 2, "sp", WindowWords<kind>::reparent},                                   \
+        {name "press", 60, "sxxn", WindowWords<kind>::press},                                      \
+        {name "move", 80, "sxxb", WindowWords<kind>::move},                                        \
+        {name "release", 50, "sxxb", WindowWords<kind>::release}, {                                \
+        name "wild", 40, "swnn", WindowWords<kind>::wild                                           \
+    }
 
 extern const Word kHostWords[];
 extern const size_t kHostWordCount;

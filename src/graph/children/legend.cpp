@@ -5,10 +5,10 @@
 #include <algorithm>
 #include <iterator>
 
-#include "graph/graph_entries.h"
-#include "platform/gdi_scopes.h"
-#include "platform/records.h"
-#include "platform/windows_helpers.h"
+#include "base/gdi_scopes.h"
+#include "base/records.h"
+#include "base/windows_helpers.h"
+#include "graph/data/entries.h"
 #include "text/text_run.h"
 
 namespace kor {

@@ -4,9 +4,9 @@
 
 #include <algorithm>
 
-#include "platform/gdi_scopes.h"
-#include "platform/local_text.h"
-#include "platform/records.h"
+#include "base/gdi_scopes.h"
+#include "base/local_text.h"
+#include "base/records.h"
 #include "text/text_run.h"
 
 namespace kor {

@@ -1,7 +1,7 @@
 // The desktop's clipboard takes movable blocks of the global heap only.
 #include "platform/clipboard.h"
 
-#include "platform/runtime.h"
+#include "base/runtime.h"
 
 namespace kor {
 

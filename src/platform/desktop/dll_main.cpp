@@ -1,5 +1,5 @@
 // What the desktop's loader calls, by way of the compiler's start-up code.
-#include "platform/module.h"
+#include "base/module.h"
 
 extern "C" BOOL WINAPI DllMain(HINSTANCE instance, DWORD reason, void*) {
     return kor::OnLibraryEvent(instance, reason);

@@ -1,7 +1,7 @@
 #include "platform/procedures.h"
 
-#include "platform/module.h"
-#include "platform/runtime.h"
+#include "base/module.h"
+#include "base/runtime.h"
 
 namespace kor {
 

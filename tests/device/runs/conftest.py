@@ -6,8 +6,9 @@ import sys
 import pytest
 
 TESTS = pathlib.Path(__file__).resolve().parents[2]
+TOOLS = TESTS.parent / "tools"
 sys.dont_write_bytecode = True
-sys.path[:0] = [str(TESTS / "image"), str(TESTS / "e2e"), str(TESTS.parent / "scripts")]
+sys.path[:0] = [str(TESTS / "image"), str(TOOLS / "desktop"), str(TOOLS)]
 
 
 def pytest_addoption(parser):

@@ -37,7 +37,7 @@ class StandIn:
 
     def __init__(self, folder, programs):
         self.folder, self.programs = folder, programs
-        for name in ("korcontrols.dll", "core_tests.exe"):
+        for name in ("korcontrols.dll", "library_tests.exe"):
             shutil.copy(programs / name, folder)
         (folder / "device").mkdir()
 
@@ -50,7 +50,7 @@ class StandIn:
         change(data)
         (self.folder / "device" / "korcontrols.dll").write_bytes(data)
         return subprocess.run(
-            [WINE_RUN, self.folder / "core_tests.exe", "--gtest_filter=Version.*"],
+            [WINE_RUN, self.folder / "library_tests.exe", "--gtest_filter=Version.*"],
             capture_output=True,
             text=True,
             check=False,

@@ -7,7 +7,7 @@ from desktop import wait_until
 from tour import opened, steps
 
 ROOT = pathlib.Path(__file__).resolve().parents[3]
-SUNSPOTS = ROOT / "examples" / "workbook" / "data" / "sunspots.csv"
+SUNSPOTS = ROOT / "apps" / "workbook" / "data" / "sunspots.csv"
 PICTURES = 12
 
 

@@ -2,7 +2,7 @@
 // the other, and both pictures are compared pixel for pixel.
 #pragma once
 
-#include "graph/pictures/literal_chart.h"
+#include "literal_chart/literal_chart.h"
 #include "support/pixels.h"
 #include "support/recording_host.h"
 

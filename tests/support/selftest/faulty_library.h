@@ -17,7 +17,7 @@ void FaultyDoubleFree(void);
 void FaultyWrongFamily(void);
 
 /* Never freed. */
-void *FaultyLeak(size_t size);
+void* FaultyLeak(size_t size);
 
 /* Resizes a block of 10 bytes, which count from 1; the result is their sum, -1 without memory. */
 int FaultyGrow(size_t size, UINT flags);

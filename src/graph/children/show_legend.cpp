@@ -1,0 +1,52 @@
+#include "graph/children/show_legend.h"
+
+#include <korcontrols/legend.h>
+
+#include <cmath>
+
+#include "base/gdi_scopes.h"
+#include "base/module.h"
+#include "base/windows_helpers.h"
+#include "graph/children/legend.h"
+#include "numbers/truncate.h"
+
+namespace kor {
+
+namespace {
+
+constexpr UINT kLegendTitleString = 9;
+constexpr int kLegendTitleCapacity = 50;
+constexpr int kBottomGap = 2;
+
+// Height of a client area of so many pixels, rounded up to whole lines.
+int SnappedHeight(HWND legend) {
+    WindowDC dc(legend);
+    const int line = LegendLinePitch(dc.get());
+    const double lines = std::ceil(static_cast<double>(ClientRectOf(legend).bottom) / line);
+    return TruncateToInt(lines) * line + kBottomGap;
+}
+
+}  // namespace
+
+void ShowLegend(GraphRecord& graph, const RECT& place) {
+    if (graph.hwndLegend || graph.isMakingLegend) return;
+    wchar_t title[kLegendTitleCapacity] = {};
+    LoadStringW(moduleInstance, kLegendTitleString, title, kLegendTitleCapacity);
+    RegisterLegendClass(graph.hInstance);
+    const int width = place.right - place.left;
+    graph.isMakingLegend = true;  // creating it sends messages, and a host may ask for one in them
+    graph.hwndLegend = CreateWindowExW(
+        0, KORLEGEND_CLASS, title, WS_CHILD | WS_CAPTION | WS_VSCROLL, place.left, place.top, width,
+        place.bottom - place.top, graph.hwnd,
+        reinterpret_cast<HMENU>(static_cast<INT_PTR>(KORLEGEND_ID)), graph.hInstance, nullptr);
+    graph.isMakingLegend = false;
+    if (!graph.hwndLegend) return;
+    POINT bottom = {0, SnappedHeight(graph.hwndLegend)};
+    MapWindowPoints(graph.hwndLegend, graph.hwnd, &bottom, 1);
+    MoveWindow(graph.hwndLegend, place.left, place.top, width, bottom.y - place.top, TRUE);
+    if (graph.life.retired) return;  // a legend that was taken out of the chart may outlive it
+    AttachLegend(graph.hwndLegend, &graph);
+    ShowWindow(graph.hwndLegend, SW_SHOW);
+}
+
+}  // namespace kor

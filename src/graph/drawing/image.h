@@ -1,0 +1,17 @@
+// The off-screen image: made in the window's size, copied to the window.
+#pragma once
+
+#include "graph/data/record.h"
+
+namespace kor {
+
+// Both sizes of the image's bitmap are multiples of 4.
+constexpr int RoundedUpTo4(int pixels) { return (pixels + 3) / 4 * 4; }
+
+// Makes the image for a client size, scales both axes and draws.
+void ResizeImage(GraphRecord& graph, int width, int height);
+
+// WM_PAINT's part of the work.
+void PaintFromImage(GraphRecord& graph);
+
+}  // namespace kor

@@ -1,0 +1,14 @@
+// Line and area charts, and the markers of a line.
+#pragma once
+
+#include "graph/data/record.h"
+
+namespace kor {
+
+void DrawLineChart(GraphRecord& graph, HDC dc);
+void DrawAreaChart(GraphRecord& graph, HDC dc);
+
+// A filled circle on each point, with the pen that is selected and a brush in the series' colour.
+void DrawSeriesMarkers(const GraphRecord& graph, HDC dc, const GraphSeries& series);
+
+}  // namespace kor

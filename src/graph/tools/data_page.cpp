@@ -1,0 +1,97 @@
+// The page of the shown ranges, the chart type and the zoom.
+#include <korcontrols/graph.h>
+
+#include "graph/data/choices.h"
+#include "graph/scale/number_format.h"
+#include "graph/tools/pages.h"
+
+namespace kor {
+
+namespace {
+
+constexpr int kYMinEdit = 1005;
+constexpr int kYMaxEdit = 1006;
+constexpr int kXMinEdit = 1007;
+constexpr int kXMaxEdit = 1008;
+constexpr int kTypeCombo = 1010;
+constexpr int kZoomCombo = 1011;
+
+// The selection that was applied last, of either combo box. With one value for both, the type and
+// the zoom are sent again on most applies; hosts see and expect that.
+constinit int lastSelection = 0;
+
+void FillNumber(HWND page, int editId, double value) {
+    wchar_t text[kNumberTextCapacity];
+    FormatGraphNumber(value, text, kGraphPrecision);
+    SetDlgItemTextW(page, editId, text);
+}
+
+template <int count>
+void FillCombo(HWND page, int comboId, const wchar_t* const (&texts)[count], int selection) {
+    for (const wchar_t* text : texts) {
+        SendDlgItemMessageW(page, comboId, CB_ADDSTRING, 0, reinterpret_cast<LPARAM>(text));
+    }
+    SendDlgItemMessageW(page, comboId, CB_SETCURSEL, static_cast<WPARAM>(selection), 0);
+}
+
+void InitialisePage(HWND page, LPARAM parameter) {
+    HWND graph = TakeGraphOfPage(page, parameter);
+    FillNumber(page, kXMinEdit, GraphXMin(graph));
+    FillNumber(page, kXMaxEdit, GraphXMax(graph));
+    FillNumber(page, kYMinEdit, GraphYMin(graph));
+    FillNumber(page, kYMaxEdit, GraphYMax(graph));
+    FillCombo(page, kTypeCombo, kTypeChoices, KorGraph_GetType(graph));
+    FillCombo(page, kZoomCombo, kZoomChoices, PlaceOfZoom(GraphZoom(graph)));
+    SetFocus(GetDlgItem(page, kTypeCombo));
+    SetFocus(GetDlgItem(page, kZoomCombo));
+}
+
+double NumberIn(HWND page, int editId) {
+    wchar_t text[kEditTextCapacity] = {};
+    GetDlgItemTextW(page, editId, text, kEditTextCapacity);
+    return NumberFromText(text);
+}
+
+// True when one of the two edits was changed, also when the range is then refused. An end that was
+// not typed is taken from the x range whatever the axis: typing only the upper end of y sends the
+// x range's lower end with it, which hosts rely on.
+bool ApplyRange(HWND page, HWND graph, LONG axis, int minEdit, int maxEdit) {
+    const bool isMinTyped = IsEdited(page, minEdit);
+    const bool isMaxTyped = IsEdited(page, maxEdit);
+    if (!isMinTyped && !isMaxTyped) return false;
+    const double lowEnd = isMinTyped ? NumberIn(page, minEdit) : GraphXMin(graph);
+    const double highEnd = isMaxTyped ? NumberIn(page, maxEdit) : GraphXMax(graph);
+    if (highEnd < lowEnd) {
+        MessageBoxW(graph, L"Incorrect Range Entered.", L"Range Error", MB_OK);
+    } else {
+        KorGraph_SetRange(graph, axis, lowEnd, highEnd);
+    }
+    return true;
+}
+
+// Sends a combo box's selection if it is another than the one applied last.
+bool ApplyChoice(HWND page, HWND graph, int comboId, UINT setter) {
+    const auto selection = static_cast<int>(SendDlgItemMessageW(page, comboId, CB_GETCURSEL, 0, 0));
+    if (selection == CB_ERR || selection == lastSelection) return false;
+    lastSelection = selection;
+    SendMessageW(graph, setter, 0, selection);
+    return true;
+}
+
+void Apply(HWND page) {
+    HWND graph = GraphOfPage(page);
+    bool isChanged = ApplyRange(page, graph, KORGRAPH_X, kXMinEdit, kXMaxEdit);
+    isChanged |= ApplyRange(page, graph, KORGRAPH_Y, kYMinEdit, kYMaxEdit);
+    if (!IsWindow(page)) return;  // gone while a range was refused in a box
+    isChanged |= ApplyChoice(page, graph, kTypeCombo, GM_SETTYPE);
+    isChanged |= ApplyChoice(page, graph, kZoomCombo, GM_SETZOOM);
+    if (isChanged) KorGraph_Redraw(graph);
+}
+
+}  // namespace
+
+INT_PTR CALLBACK DataPageProc(HWND page, UINT message, WPARAM, LPARAM lParam) {
+    return AnswerPage({InitialisePage, Apply}, page, message, lParam);
+}
+
+}  // namespace kor

@@ -1,0 +1,17 @@
+// The keyboard map of the grid's window.
+#pragma once
+
+#include "platform/platform.h"
+
+namespace kor {
+
+// WM_KEYDOWN: what the key means for the grid. Keys it does not know go to default processing.
+LRESULT OnGridKeyDown(WPARAM key, LPARAM flags);
+
+// The grid sends itself a key, as if it had been pressed.
+void PressGridKey(int key);
+
+// Whether Shift is down.
+bool IsShiftDown();
+
+}  // namespace kor
