@@ -2,6 +2,7 @@
 #include "graph/number_graph.h"
 
 #include "graph/data/axes.h"
+#include "numbers/truncate.h"
 
 #include <cfloat>
 #include <limits>
