@@ -1,4 +1,4 @@
-# korcontrols_warnings: what every target of ours compiles with. Warnings are errors.
+# korcontrols_warnings: the options that all of the project's targets compile with. Warnings are errors.
 add_library(korcontrols_warnings INTERFACE)
 target_compile_options(korcontrols_warnings INTERFACE
   -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror

@@ -1,5 +1,5 @@
-# How CMake builds libraries for Windows CE with GNU tools: objects come out of the compiler, and the
-# linker is called by itself, since the compiler only knows another platform's.
+# How CMake builds libraries for Windows CE with GNU tools: the compiler makes the objects, and the
+# linker is called directly, since the compiler only knows another platform's.
 include_guard()
 
 set(CMAKE_STATIC_LIBRARY_PREFIX lib)
@@ -11,7 +11,7 @@ set(CMAKE_IMPORT_LIBRARY_SUFFIX .dll.a)
 set(CMAKE_LIBRARY_PATH_FLAG -L)
 set(CMAKE_LINK_LIBRARY_FLAG -l)
 set(CMAKE_LINK_LIBRARY_SUFFIX "")
-set(CMAKE_LINK_DEF_FILE_FLAG "")  # giving the file is enough
+set(CMAKE_LINK_DEF_FILE_FLAG "")  # passing the file is enough
 
 set(CMAKE_RC_OUTPUT_EXTENSION .obj)
 set(CMAKE_RC_COMPILE_OBJECT
@@ -21,7 +21,7 @@ macro(windows_ce_gnu language)
   unset(CMAKE_${language}_LINKER_WRAPPER_FLAG)
   set(CMAKE_${language}_COMPILE_OPTIONS_PIC "")
   set(CMAKE_SHARED_LIBRARY_${language}_FLAGS "")
-  # Sorted and without times, so that the same objects give the same bytes.
+  # Sorted and without timestamps, so that the same objects give the same bytes.
   set(CMAKE_${language}_ARCHIVE_CREATE "<CMAKE_AR> qcD <TARGET> <OBJECTS>")
   set(CMAKE_${language}_ARCHIVE_APPEND "<CMAKE_AR> qD <TARGET> <OBJECTS>")
   set(CMAKE_${language}_ARCHIVE_FINISH "<CMAKE_RANLIB> -D <TARGET>")

@@ -1,5 +1,5 @@
 # Windows CE 3.0 on ARM: Debian's compiler for bare ARM, an assembler and a linker for Windows CE's
-# object format, and the desktop's platform and language headers. docs/device.md tells how they fit.
+# object format, and the desktop's platform and language headers. docs/device.md says how they fit.
 set(CMAKE_SYSTEM_NAME WindowsCE)
 set(CMAKE_SYSTEM_VERSION 3.0)
 set(CMAKE_SYSTEM_PROCESSOR arm)
@@ -7,12 +7,12 @@ list(APPEND CMAKE_MODULE_PATH ${CMAKE_CURRENT_LIST_DIR}/..)  # Platform/WindowsC
 get_filename_component(KOR_WINCE ${CMAKE_CURRENT_LIST_DIR}/../wince ABSOLUTE)
 get_filename_component(KOR_SCRIPTS ${CMAKE_CURRENT_LIST_DIR}/../../scripts ABSOLUTE)
 
-# Compiling to see what the compiler is must not need a run-time library.
+# CMake's checks of the compiler must not need a run-time library.
 set(CMAKE_TRY_COMPILE_TARGET_TYPE STATIC_LIBRARY)
 set(CMAKE_TRY_COMPILE_PLATFORM_VARIABLES KOR_DEVICE_TOOLS)
 
 if(NOT KOR_DEVICE_TOOLS)
-  # Quick when all is there: the packages are asked for first, and the tools built once per machine.
+  # Fast when everything is there: the packages are checked first, and the tools built once per machine.
   execute_process(COMMAND ${KOR_SCRIPTS}/setup device RESULT_VARIABLE _status)
   if(NOT _status EQUAL 0)
     message(FATAL_ERROR "scripts/setup device failed")
@@ -39,8 +39,8 @@ string(JOIN " " _machine
   -fno-unwind-tables -fno-asynchronous-unwind-tables -fno-stack-protector -Wframe-larger-than=2048
   "\"-B${KOR_WINCE}/bin\"" "\"-Wa,--coff-assembler=${KOR_DEVICE_TOOLS}/as\"")
 
-# Headers: the desktop's, with its calling-convention words empty, since here there is one convention.
-# Versions are those of Windows CE 3.0's time, so that no record has members that it does not know.
+# Headers: the desktop's, with its calling-convention keywords empty, since there is one convention here.
+# Versions are those of Windows CE 3.0's time, so that no structure has members that it does not know.
 execute_process(COMMAND i686-w64-mingw32-g++-posix -print-file-name=include
   OUTPUT_VARIABLE _desktop OUTPUT_STRIP_TRAILING_WHITESPACE COMMAND_ERROR_IS_FATAL ANY)
 execute_process(COMMAND arm-none-eabi-gcc -print-file-name=include

@@ -12,7 +12,7 @@ function fail(what) {
     exit 1
 }
 
-# section_base(NAME): the section of the image that an ELF section goes to, "" for one without a place.
+# section_base(NAME): the section of the image that an ELF section goes to, "" for one that has none.
 # Leaves in `kind` the flags that it has there. There is no ".bss$f": what is zero at load goes to .data.
 function section_base(name) {
     if (name ~ /^\.text(\.|$)/) { kind = "x"; return ".text" }
@@ -26,7 +26,7 @@ function start_section(name, flags, group,    base) {
     if (ignored) return
     base = section_base(name)
     if (base == "") fail("section " name " has no place in the library")
-    # A name after the dollar keeps sections apart; the linker sorts by it and cuts it off.
+    # A name after the dollar keeps sections apart; the linker sorts by it and drops it.
     print "\t.section\t" base "$" substr(name, 2) ",\"" kind "\""
     if (flags ~ /G/) print "\t.linkonce discard"
 }
@@ -43,7 +43,7 @@ $1 == ".section" {
 $1 ~ /^\.(text|data|bss)$/ { ignored = 0; print; next }
 ignored { next }
 
-# Of the other object format alone: types, sizes and visibility of names, marks for its linker.
+# Only in the other object format: types, sizes and visibility of names, marks for its linker.
 $1 ~ /^\.(type|size|hidden|internal|protected|ident|file|eabi_attribute|cpu|arch|fpu|arm)$/ { next }
 
 # Merging is what .linkonce does.

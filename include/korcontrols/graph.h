@@ -1,26 +1,27 @@
 /* The chart: line, area, bar, column and pie charts of numeric series.
  *
  * Create it as a child window of class KORGRAPH_CLASS (or GetGraphControlClassName()) after
- * RegisterGraphControl, and drive it with the messages below. The chart keeps copies of all data
- * and texts it is given and draws into an off-screen image that WM_PAINT copies to the window.
+ * RegisterGraphControl, and control it with the messages below. The chart keeps copies of all data
+ * and texts passed to it. It draws into an off-screen image that WM_PAINT copies to the window.
  *
- * New series and values, ranges, options and titles scale the axes again but draw nothing: make all
- * changes, then send GN_REDRAW once. (GN_CLEAR and GN_RESET scale nothing.) A change of size, zoom
- * or chart type draws by itself.
+ * New series and values, ranges, options and titles rescale the axes but draw nothing: make all
+ * changes, then send GN_REDRAW once. (GN_CLEAR and GN_RESET rescale nothing.) A change of size,
+ * zoom or chart type draws at once.
  *
- * Give the chart WS_CLIPSIBLINGS | WS_CLIPCHILDREN, or it paints over its tooltip (a sibling) and
- * its legend (a child), and a parent without a frame: the tooltip is placed as if the parent's
- * client area began at the corner of its window. The tooltip stays when the chart goes and ends
- * with the parent, so a host that makes charts again and again makes a parent for each.
+ * Give the chart WS_CLIPSIBLINGS | WS_CLIPCHILDREN; otherwise it paints over its tooltip (a
+ * sibling) and its legend (a child). Give it a parent without a frame: the tooltip is positioned as
+ * if the parent's client area began at the corner of the parent's window. The tooltip outlives the
+ * chart and is destroyed with the parent, so a host that creates charts repeatedly should create a
+ * parent for each.
  *
- * Codes GN_... act only inside WM_NOTIFY (code in wParam, argument in lParam, no NMHDR); sent as
+ * Codes GN_... act only inside WM_NOTIFY (code in wParam, argument in lParam, no NMHDR). Sent as
  * messages of their own they do nothing. The chart sends nothing to its parent.
  *
- * Point k of a series, counted from 0, stands at k + 1 on the category axis. A null pointer where a
- * message needs one changes nothing and stores nothing; the result is 0 then, and 1 from
+ * Point k of a series, counted from 0, stands at k + 1 on the category axis. Where a message needs
+ * a pointer, a null pointer changes nothing and stores nothing; the result is then 0, or 1 from
  * GM_ADDSERIES.
  *
- * A chart whose record could not be made still exists as a window and passes every message on to
+ * A chart whose record could not be allocated still exists as a window and passes every message to
  * default processing. */
 #ifndef KORCONTROLS_GRAPH_H
 #define KORCONTROLS_GRAPH_H
@@ -42,9 +43,9 @@ extern "C" {
 #define KORGRAPH_AREA 1
 #define KORGRAPH_BAR 2 /* horizontal bars: categories along y, values along x */
 #define KORGRAPH_COLUMN 3
-#define KORGRAPH_PIE 4 /* of the first series */
+#define KORGRAPH_PIE 4 /* shows the first series only */
 
-/* Options; all but live mode are on at first. */
+/* Options. All but live mode are initially on. */
 #define KORGRAPH_HORIZONTALGRID 0x001
 #define KORGRAPH_VERTICALGRID 0x002
 #define KORGRAPH_XTICKS 0x004
@@ -54,8 +55,8 @@ extern "C" {
 #define KORGRAPH_YLABELS 0x040
 #define KORGRAPH_XTITLE 0x080
 #define KORGRAPH_YTITLE 0x100
-#define KORGRAPH_PERCENTAGES 0x200 /* at the slices of a pie */
-#define KORGRAPH_LIVE 0x400        /* set it before the series are added */
+#define KORGRAPH_PERCENTAGES 0x200 /* beside the slices of a pie */
+#define KORGRAPH_LIVE 0x400        /* set it before adding series */
 
 /* Zoom indexes. */
 #define KORGRAPH_ZOOM25 0
@@ -71,11 +72,11 @@ extern "C" {
 #define KORGRAPH_X 0
 #define KORGRAPH_Y 1
 
-/* A series as the host hands it over. 16 bytes on 32-bit systems, 32 on 64-bit ones. */
+/* A series as the host passes it. 16 bytes on 32-bit systems, 32 on 64-bit ones. */
 typedef struct GraphSeriesData {
     LONG pointCount;      /* at least 1 */
     LPCWSTR name;         /* copied; may be null or empty; not read by the replacing codes */
-    const double* values; /* pointCount numbers, copied */
+    const double* values; /* pointCount values, copied */
     LONG seriesIndex;     /* which series; read by the replacing codes only */
 } GraphSeriesData;
 
@@ -96,11 +97,11 @@ typedef struct GraphRange {
 
 /* ---- Messages ---- */
 
-/* GM_ADDSERIES: adds a series; its colour is the next one of the palette.
+/* GM_ADDSERIES: adds a series. Its colour is the next one of the palette.
  *   wParam  0
  *   lParam  const GraphSeriesData*
- *   result  0, or 1 for a null pointer, a count below 1, no memory, or while the chart stands on a
- *           page that is printed (nothing is added then) */
+ *   result  0, or 1 for a null pointer, a count below 1, lack of memory, or while the chart's page
+ *           is being printed (nothing is added then) */
 #define GM_ADDSERIES (WM_USER + 6000)
 
 /* GM_SETTITLE, GM_SETXTITLE, GM_SETYTITLE: set the chart's and the axes' titles.
@@ -111,27 +112,27 @@ typedef struct GraphRange {
 #define GM_SETXTITLE (WM_USER + 6002)
 #define GM_SETYTITLE (WM_USER + 6004)
 
-/* GM_GETTITLE, GM_GETXTITLE, GM_GETYTITLE: read them.
+/* GM_GETTITLE, GM_GETXTITLE, GM_GETYTITLE: read the titles.
  *   wParam  0
- *   lParam  LPCWSTR*; receives the chart's own text, null without one. It is valid until the title
- *           is set again or the chart goes.
+ *   lParam  LPCWSTR*; receives a pointer to the chart's own text, or null without one. It is valid
+ *           until the title is set again or the chart is destroyed.
  *   result  0 */
 #define GM_GETTITLE (WM_USER + 6005)
 #define GM_GETXTITLE (WM_USER + 6006)
 #define GM_GETYTITLE (WM_USER + 6007)
 
-/* GM_SETCATEGORIES: names the points; label i stands at point i.
+/* GM_SETCATEGORIES: names the points. Label i belongs to point i.
  *   wParam  count; below 1 removes all labels
- *   lParam  const LPCWSTR*, count texts, copied; single ones may be null
- *   result  0, or 1 when there was no memory (the labels copied so far stay), or while the chart
- *           stands on a page that is printed (nothing changes then) */
+ *   lParam  const LPCWSTR*, count texts, copied; any of them may be null
+ *   result  0, or 1 for lack of memory (the labels copied so far stay), or while the chart's page
+ *           is being printed (nothing changes then) */
 #define GM_SETCATEGORIES (WM_USER + 6008)
 
-/* GM_SETTYPE: changes the chart type and draws. Between Bar and the others the axes trade their
- * ranges and titles, but not whether they are automatic: an axis that was fixed is to be fixed
- * anew.
+/* GM_SETTYPE: changes the chart type and draws. A change between Bar and any other type swaps the
+ * ranges and titles of the axes, but not whether they are automatic: fix the range of an axis again
+ * after such a change.
  *   wParam  0
- *   lParam  KORGRAPH_LINE to KORGRAPH_PIE; another number is kept and draws nothing
+ *   lParam  KORGRAPH_LINE to KORGRAPH_PIE; any other number is stored and draws nothing
  *   result  0 */
 #define GM_SETTYPE (WM_USER + 6009)
 
@@ -141,16 +142,17 @@ typedef struct GraphRange {
  *   result  0 */
 #define GM_GETTYPE (WM_USER + 6010)
 
-/* GM_SETRANGE: fixes an axis. Equal ends show one unit; the ends are not put in order, and a
+/* GM_SETRANGE: fixes the range of an axis. Equal ends show one unit. The ends are not sorted: a
  * minimum above the maximum gives no useful picture. The category axis of a bar chart (y) ignores
- * the ends given and follows the number of points.
+ * the given ends and follows the number of points.
  *   wParam  0
  *   lParam  const GraphRange*; an axis that is neither of the two changes nothing
  *   result  0 */
 #define GM_SETRANGE (WM_USER + 6011)
 
-/* GM_AUTORANGE: lets an axis follow the data again: the values that the series were added with.
- * Those set or replaced later count for no automatic range; add the series anew when they matter.
+/* GM_AUTORANGE: lets an axis follow the data again, that is, the values that the series were added
+ * with. Values set or replaced later do not affect automatic ranges; add the series again if they
+ * matter.
  *   wParam  0
  *   lParam  KORGRAPH_X or KORGRAPH_Y
  *   result  0 */
@@ -164,7 +166,7 @@ typedef struct GraphRange {
 
 /* GM_TOGGLEOPTIONS: turns options on or off.
  *   wParam  0
- *   lParam  options to turn over
+ *   lParam  options to invert
  *   result  0 */
 #define GM_TOGGLEOPTIONS (WM_USER + 6014)
 
@@ -175,17 +177,18 @@ typedef struct GraphRange {
 #define GM_GETOPTIONS (WM_USER + 6015)
 
 /* GN_RESET, inside WM_NOTIFY: removes all series and labels.
- *   lParam  nonzero also returns the ranges to automatic and 0 to 1; the zoom stays. One unit is
- *           one pixel then, with a tick on each, until a new series, range, option or title scales
- *           the axes: change one of them before the next redraw.
+ *   lParam  nonzero also makes the ranges automatic again, from 0 to 1. The zoom stays. One unit is
+ *           then one pixel, with a tick on each, until a new series, range, option or title
+ *           rescales the axes: change one of these before the next redraw.
  *   result  0 */
 #define GN_RESET (WM_USER + 6016)
 
-/* GN_PROPERTIES, inside WM_NOTIFY: runs the modal property sheet "Graph Properties", with a page of
- * the titles and a page of ranges, type and zoom. OK applies the pages that were shown, and draws
- * if anything was sent; the host is not told. It comes back when the sheet is closed; the host's
- * messages go on meanwhile. The sheet's owner is the chart: whether more than the chart is disabled
- * meanwhile is up to the platform, so a host does not send this while one is open.
+/* GN_PROPERTIES, inside WM_NOTIFY: runs the modal property sheet "Graph Properties", with one page
+ * for the titles and one for ranges, type and zoom. OK applies the pages that were shown, and draws
+ * if anything was sent. The host is not notified. The message returns when the sheet is closed; the
+ * host's messages are dispatched meanwhile. The sheet's owner is the chart. The platform decides
+ * whether more windows than the chart are disabled, so a host must not send this while a sheet is
+ * open.
  *   lParam  0
  *   result  0 */
 #define GN_PROPERTIES (WM_USER + 6017)
@@ -195,23 +198,23 @@ typedef struct GraphRange {
  *   result  0 */
 #define GN_SETVALUE (WM_USER + 6018)
 
-/* GN_REDRAW, inside WM_NOTIFY: draws the chart; it reaches the screen with the next paint.
+/* GN_REDRAW, inside WM_NOTIFY: draws the chart. The next paint shows it on the screen.
  *   lParam  0
  *   result  0 */
 #define GN_REDRAW (WM_USER + 6019)
 
-/* GN_PRINT, inside WM_NOTIFY: asks for a printer with the platform's print dialog and prints the
- * chart on one page. It comes back when that is done; the host's messages go on while the dialog is
- * open. After a print the chart's window is disabled, and the host enables it again; after a dialog
- * that was cancelled it is not. Does nothing without printing, or inside another print.
+/* GN_PRINT, inside WM_NOTIFY: shows the platform's print dialog and prints the chart on one page.
+ * The message returns when that is done; the host's messages are dispatched while the dialog is
+ * open. After a print the chart's window is disabled and the host must enable it again. A cancelled
+ * dialog does not disable it. Does nothing if printing is not available, or inside another print.
  *   lParam  0
  *   result  0 */
 #define GN_PRINT (WM_USER + 6020)
 
-/* GN_LIVEUPDATE, inside WM_NOTIFY: one step of live mode; without KORGRAPH_LIVE it does nothing.
- * The trace is drawn by the paint that follows, on the screen only: let one happen (UpdateWindow)
- * before the next step.
- *   lParam  in sweep mode a whole number, the new sample; in replace mode const GraphSeriesData*
+/* GN_LIVEUPDATE, inside WM_NOTIFY: one step of live mode. Without KORGRAPH_LIVE it does nothing.
+ * The next paint draws the trace, on the screen only: let it happen (UpdateWindow) before the next
+ * step.
+ *   lParam  in sweep mode an integer, the new sample; in replace mode const GraphSeriesData*
  *   result  0 */
 #define GN_LIVEUPDATE (WM_USER + 6021)
 
@@ -226,14 +229,14 @@ typedef struct GraphRange {
  *   result  0 */
 #define GN_CLEAR (WM_USER + 6023)
 
-/* GM_SETDATAMODE: chooses what a live update does.
+/* GM_SETDATAMODE: selects what a live update does.
  *   wParam  0
  *   lParam  KORGRAPH_SWEEP or KORGRAPH_REPLACE
  *   result  0 */
 #define GM_SETDATAMODE (WM_USER + 6024)
 
-/* GM_SHOWLEGEND: creates the legend and shows it, once in a chart's life: later requests are
- * ignored, also when the legend has been destroyed. Hide, show and move its window (GetDlgItem with
+/* GM_SHOWLEGEND: creates and shows the legend, once in a chart's life. Later requests are ignored,
+ * even if the legend has been destroyed: hide, show and move its window (GetDlgItem with
  * KORLEGEND_ID) instead. Its height is rounded up to whole lines.
  *   wParam  0
  *   lParam  const RECT*, in the chart's client coordinates
@@ -264,9 +267,9 @@ typedef struct GraphRange {
  *   result  0 */
 #define GM_GETRANGE (WM_USER + 6029)
 
-/* GM_COPY: puts the chart's image on the clipboard, as CF_DIB of 8 bits per pixel in the colours of
- * the series palette. Both sizes are those of the client area rounded up to multiples of 4. What
- * was on the clipboard is gone afterwards, also when there was no memory for the image.
+/* GM_COPY: puts the chart's image on the clipboard, as a CF_DIB of 8 bits per pixel in the colours
+ * of the series palette. Width and height are those of the client area, rounded up to multiples of
+ * 4. The previous contents of the clipboard are lost, even if there is no memory for the image.
  *   wParam  0
  *   lParam  0
  *   result  0 */
@@ -274,33 +277,33 @@ typedef struct GraphRange {
 
 /* ---- Functions ---- */
 
-/* Registers the chart's window class under `instance`, the host's own, once per process.
- *   result  nonzero; 0 when the first call could not register it (it is not tried again: later
- *           calls answer 1) */
+/* Registers the chart's window class under the host's `instance`, once per process.
+ *   result  nonzero; 0 when the first call could not register it (no later call tries again: they
+ *           return 1) */
 DWORD KORCONTROLS_API RegisterGraphControl(HINSTANCE instance);
 
-/* The chart's class name; it belongs to the library. */
+/* The chart's class name. The library owns the text. */
 LPCWSTR KORCONTROLS_API GetGraphControlClassName(void);
 
 /* Fills a command bar of the host with the chart's controls: the library's three button images
  * (show chart, properties, legend: image indexes 0 to 2 of an empty bar), the host's buttons, the
  * zoom combo box and the chart type combo box, in this order from the left. The items' data are the
- * arguments of GM_SETZOOM and GM_SETTYPE; "100%" and "Line" are selected. The host's window gets
- * the commands and drives the chart; the library connects nothing.
+ * arguments of GM_SETZOOM and GM_SETTYPE; "100%" and "Line" are selected. The host's window
+ * receives the commands and controls the chart; the library connects nothing.
  *
- * The tooltip texts (of the first two buttons, the zoom and the type combo box, and one more) go to
- * the bar as WM_USER + 81 (wParam 5, lParam LPCWSTR*). Array and texts belong to the library and
- * stay valid; the first text changes with the chart, "Show Grid" while it is shown and "Show Graph"
- * while it is hidden, so a bar must read it anew each time.
+ * The tooltip texts (of the first two buttons, the zoom and the type combo box, and one more) are
+ * sent to the bar as WM_USER + 81 (wParam 5, lParam LPCWSTR*). The library owns the array and the
+ * texts, which stay valid. The first text changes with the chart, "Show Grid" while it is shown and
+ * "Show Graph" while it is hidden, so a bar must read it again each time.
  *
- * On a desktop a toolbar takes the message for another one and would read the count as a pointer.
- * So a toolbar gets it only when the host has set the window property "korcontrols tooltips" on it,
- * to anything but null. By that the host says that its own procedure answers the message and does
- * not pass it on. A bar of another window class is always told.
+ * To a desktop toolbar that message has another meaning: it would read the count as a pointer. So a
+ * toolbar receives it only if the host has set the window property "korcontrols tooltips" on it, to
+ * anything but null. With it the host declares that its own procedure handles the message and does
+ * not pass it on. A bar of any other window class always receives it.
  *   instance       the host's, under which the combo boxes are created
  *   commandBar     a command bar, or on a desktop a toolbar that was sent TB_BUTTONSTRUCTSIZE
  *   buttons        buttonCount descriptions, added as they are; null or a count of 0 adds none
- *   zoomComboOut   receives the zoom combo box, null when it could not be made; may be null
+ *   zoomComboOut   receives the zoom combo box, or null when it could not be created; may be null
  *   zoomComboId    its control id
  *   typeComboOut   the same for the chart type
  *   typeComboId    its control id
@@ -310,8 +313,8 @@ DWORD KORCONTROLS_API SetupGraphCommandBar(HINSTANCE instance, HWND commandBar,
                                            HWND* zoomComboOut, UINT zoomComboId, HWND* typeComboOut,
                                            UINT typeComboId);
 
-/* Whether charts can be printed: the two modules that printing needs were loaded, which is tried
- * when a chart is created.
+/* Whether charts can be printed, that is, whether the two modules that printing needs are loaded.
+ * Creating a chart tries to load them.
  *   result  1, or 0 */
 DWORD KORCONTROLS_API IsPrintingAvailableForGraphControl(void);
 

@@ -2,21 +2,21 @@
  *
  * The grid keeps column widths, row heights, zoom, scroll position, selection and an equation bar.
  * Whenever cells must be drawn it sends its parent GRIDN_PAINTCELLS with the visible range; the
- * parent answers inside that notification with SetCellBackGroundColor, SetCellBorder and
+ * parent responds inside that notification with SetCellBackGroundColor, SetCellBorder and
  * SetCellValue. Everything is drawn into an off-screen image; WM_PAINT copies it to the window.
  *
- * There is one grid in a process: the functions take no window handle and act on that grid. Create
+ * There is one grid per process: the functions take no window handle and act on that grid. Create
  * it as a child window of class KORGRID_CLASS with WS_CHILD | WS_VISIBLE | WS_CLIPCHILDREN, after
  * RegisterGridControl. A second window of the class takes everything over from the first, which
- * does not work again, not even when the second is gone. Positions are pixels in the grid's client
- * area; ends of the visible range are exclusive, ends of a selection inclusive. Sizes "in units"
- * are pixels at 100 % zoom.
+ * never works again, not even after the second is destroyed. Positions are pixels in the grid's
+ * client area. Ends of the visible range are exclusive, ends of a selection inclusive. Sizes "in
+ * units" are pixels at 100 % zoom.
  *
- * Nothing tells the zoom level, a size, or what is hidden: the host remembers what it set.
+ * No function reads the zoom level, a size, or what is hidden: the host must remember what it set.
  *
- * Functions called before the grid's window exists, or after it is gone, keep or return what the
- * grid knows and draw nothing. After it is gone those that redraw still ask its parent to paint
- * cells (GRIDN_PAINTCELLS); nothing comes of the answers. */
+ * Functions called before the grid's window exists, or after it is destroyed, store or return the
+ * grid's state and draw nothing. After its destruction, those that redraw still ask its parent to
+ * paint cells (GRIDN_PAINTCELLS); the parent's calls then have no effect. */
 #ifndef KORCONTROLS_GRID_H
 #define KORCONTROLS_GRID_H
 
@@ -51,10 +51,10 @@ typedef struct GridSelection {
 
 #define KORGRID_PAIR(low, high) ((DWORD)(WORD)(low) | (DWORD)(WORD)(high) << 16)
 
-/* The visible cells, ends exclusive. A partly visible last column or row counts. After a horizontal
- * scroll, SetFirstVisibleCell or a column's resizing, columns are counted over the whole client
- * width, as if the row header were not there, so that the last one, or more if they are narrow, may
- * lie outside the window; WM_SIZE and GRIDM_REDRAW count over the cells alone. 8 bytes. */
+/* The visible cells, ends exclusive. A partly visible last column or row is included. After a
+ * horizontal scroll, SetFirstVisibleCell or the resizing of a column, columns are counted over the
+ * whole client width, as if there were no row header. The last column, or several narrow ones, may
+ * then lie outside the window. WM_SIZE and GRIDM_REDRAW count over the cells alone. 8 bytes. */
 typedef struct GridVisibleRange {
     WORD firstColumn;
     WORD endColumn;
@@ -62,7 +62,7 @@ typedef struct GridVisibleRange {
     WORD endRow;
 } KORCONTROLS_EVEN GridVisibleRange;
 
-/* A cell as notifications point to it. 4 bytes. */
+/* A cell that a notification points to. 4 bytes. */
 typedef struct GridCellPair {
     WORD column;
     WORD row;
@@ -70,10 +70,10 @@ typedef struct GridCellPair {
 
 /* ---- Notifications to the parent ----
  *
- * All are sent (SendMessage), so the parent handles them before the grid goes on; their results are
- * ignored, and pointers are valid during the call only. Those marked WM_NOTIFY arrive as WM_NOTIFY
- * with the code below in wParam and the data itself in lParam: lParam is NOT an NMHDR pointer, so a
- * parent with other controls looks at wParam first. (A control's id can never be confused with a
+ * All are sent (SendMessage), so the parent handles them before the grid continues. Results are
+ * ignored. Pointers are valid during the call only. Those marked WM_NOTIFY arrive as WM_NOTIFY with
+ * the code below in wParam and the data itself in lParam: lParam is NOT an NMHDR pointer, so a
+ * parent with other controls must look at wParam first. (A control's id cannot be confused with a
  * code as long as ids stay below 3425.) */
 
 /* WM_NOTIFY: cells must be drawn. lParam: const GridVisibleRange*. The area is white and has its
@@ -81,14 +81,14 @@ typedef struct GridCellPair {
 #define GRIDN_PAINTCELLS 3425
 
 /* WM_NOTIFY: the left button was pressed. lParam: const GridCellPair*, the cell under the pointer.
- * No GRIDN_CURRENTCELL comes with it: show the current cell's text here as well (with Shift the
- * current cell is another one than the cell pressed). A double click's second press is not told.
- * Beyond the last visible column or row the answer is 0; but up to one default size past the last
- * column or row of the sheet it is KORGRID_COLUMNS or KORGRID_ROWS, so check before indexing. */
+ * No GRIDN_CURRENTCELL accompanies it: show the current cell's text here as well (with Shift, the
+ * current cell is not the pressed cell). The second press of a double click is not notified. Beyond
+ * the last visible column or row the index is 0. Up to one default size past the last column or row
+ * of the sheet it is KORGRID_COLUMNS or KORGRID_ROWS, so check before indexing. */
 #define GRIDN_CELLCLICKED 3427
 
-/* WM_NOTIFY: a column's, or row's, border was dragged and let go. The grid has drawn before, at
- * zoom levels other than 100 % perhaps too little: answer with GRIDM_REDRAW.
+/* WM_NOTIFY: the border of a column, or row, was dragged and released. The grid has already
+ * redrawn, but at zoom levels other than 100 % perhaps not enough: respond with GRIDM_REDRAW.
  * lParam (a value): low word the new size in units, high word the absolute column or row. */
 #define GRIDN_COLUMNRESIZED 3430
 #define GRIDN_ROWRESIZED 3431
@@ -96,17 +96,17 @@ typedef struct GridCellPair {
 #define KORGRID_RESIZEDSIZE(lParam) LOWORD(lParam)
 #define KORGRID_RESIZEDINDEX(lParam) HIWORD(lParam)
 
-/* The message itself: text was committed in the equation bar.
+/* A message of its own, not WM_NOTIFY: text was committed in the equation bar.
  *   wParam  LPCWSTR, at most 255 characters; copy what you keep
  *   lParam  low word the current ROW, high word the current COLUMN (the reverse of a CellIndex)
- * A redraw of all cells follows, so the parent only stores the text. */
+ * A redraw of all cells follows, so the parent need only store the text. */
 #define GRIDN_EQUATIONENTERED 3432
 
 #define KORGRID_EQUATIONROW(lParam) LOWORD(lParam)
 #define KORGRID_EQUATIONCOLUMN(lParam) HIWORD(lParam)
 
-/* The message itself: an emptied equation bar was committed. wParam 0, lParam as above. The edit's
- * modified flag stays set, so a second commit sends it again. */
+/* A message of its own, not WM_NOTIFY: an emptied equation bar was committed. wParam 0, lParam as
+ * above. The edit's modified flag stays set, so a second commit sends it again. */
 #define GRIDN_EQUATIONEMPTY 3433
 
 /* WM_NOTIFY: the current cell may have changed (keys; Escape or "X" in the equation bar). The
@@ -116,20 +116,20 @@ typedef struct GridCellPair {
 /* WM_NOTIFY: a drag changed the selection. lParam: const GridSelection*. */
 #define GRIDN_SELECTING 3435
 
-/* WM_NOTIFY: the left button was released, after a double click twice. lParam: const
+/* WM_NOTIFY: the left button was released. A double click sends it twice. lParam: const
  * GridSelection*. */
 #define GRIDN_SELECTIONDONE 3436
 
 /* WM_NOTIFY: the equation edit got the focus. lParam: 0. */
 #define GRIDN_EDITFOCUS 3437
 
-/* WM_NOTIFY: the equation edit lost the focus, and commits next. lParam: 1 when a press in the grid
- * took the focus, else 0. */
+/* WM_NOTIFY: the equation edit lost the focus and is about to commit. lParam: 1 when a press in the
+ * grid took the focus, else 0. */
 #define GRIDN_EDITKILLFOCUS 3438
 
-/* Besides these the parent receives, when "fx" is pressed, a posted WM_COMMAND with the number
- * given to SetFunctionButtonMessageID, and, when Delete is pressed in the grid, a sent WM_KEYDOWN
- * with wParam VK_DELETE and lParam 1. */
+/* The parent also receives a posted WM_COMMAND, with the number given to
+ * SetFunctionButtonMessageID, when "fx" is clicked, and a sent WM_KEYDOWN, with wParam VK_DELETE
+ * and lParam 1, when Delete is pressed in the grid. */
 
 /* ---- Messages to the grid ---- */
 
@@ -138,7 +138,7 @@ typedef struct GridCellPair {
  *   result          0 */
 #define GRIDM_REDRAW 3424
 
-/* GRIDM_SETEQUATIONTEXT: shows a text in the equation bar; nothing is committed by it.
+/* GRIDM_SETEQUATIONTEXT: shows a text in the equation bar without committing anything.
  *   wParam  passed on to the edit, 0
  *   lParam  LPCWSTR, copied; null changes nothing
  *   result  0 */
@@ -152,12 +152,13 @@ static __inline void KorGrid_SetEquationText(HWND grid, LPCWSTR text) {
 
 /* ---- Life ---- */
 
-/* Registers the grid's window class under `instance`, the host's own.
- *   result  nonzero, or 0 when the class could not be registered (it already is, for example) */
+/* Registers the grid's window class under the host's `instance`.
+ *   result  nonzero, or 0 when the class could not be registered (for example because it already
+ *           is) */
 DWORD KORCONTROLS_API RegisterGridControl(HINSTANCE instance);
 
-/* Forgets all column widths and row heights, scrolls to A1 and empties the equation bar. Keeps the
- * selection and the zoom, and repaints nothing: call SetFirstVisibleCell(0) afterwards. */
+/* Discards all column widths and row heights, scrolls to A1 and empties the equation bar. Keeps the
+ * selection and the zoom. Repaints nothing: call SetFirstVisibleCell(0) afterwards. */
 void KORCONTROLS_API ResetGrid(void);
 
 /* ---- Drawing, inside GRIDN_PAINTCELLS ----
@@ -165,12 +166,13 @@ void KORCONTROLS_API ResetGrid(void);
  * Each does nothing for a cell outside the visible range. A cell's box is x, y to x + width,
  * y + height; its grid lines are the box's left and top edges. */
 
-/* Fills the box and the lines around it (one pixel more to the right and below), so that a cell
- * filled with white has no grid lines: fill only cells that have a colour of their own. The brush
- * stays the caller's; a null brush draws nothing. */
+/* Fills the box and the lines around it (one pixel more to the right and below), so a cell filled
+ * with white has no grid lines: fill only cells that have a colour of their own. The caller keeps
+ * the brush. A null brush draws nothing. */
 void KORCONTROLS_API SetCellBackGroundColor(CellIndex cell, HBRUSH brush);
 
-/* Draws the box's edges whose flags have any of the low 16 bits set. The pen stays the caller's. */
+/* Draws those edges of the box whose flags have any of the low 16 bits set. The caller keeps the
+ * pen. */
 void KORCONTROLS_API SetCellBorder(CellIndex cell, HPEN pen, DWORD left, DWORD right, DWORD top,
                                    DWORD bottom);
 
@@ -178,7 +180,8 @@ void KORCONTROLS_API SetCellBorder(CellIndex cell, HPEN pen, DWORD left, DWORD r
  *   text        zero-terminated; null draws nothing
  *   font        font at 100 % zoom, scaled by the grid; 0: the image's current font, unscaled
  *   textColour  colour of the letters
- *   backColour  colour behind them: letters are drawn on a box of it, so pass the cell's own
+ *   backColour  colour behind them: letters are drawn on a box of this colour, so pass the cell's
+ *               own
  *   format      DrawTextW flags; 0 means DT_NOPREFIX | DT_VCENTER | DT_CENTER. Without DT_NOPREFIX
  *               a "&" underlines what follows it
  *   spanLeft    > 0: the text's rectangle begins this many columns further left (not before the
@@ -197,19 +200,20 @@ DWORD KORCONTROLS_API ToggleGridLines(void);
 
 /* ---- Sizes and zoom ---- */
 
-/* Sets a size in pixels at the current zoom (the low 16 bits count). Repaints nothing. A size in
- * units is restored with (units * level + 3) / 4 pixels, exactly from 100 % on; below, not every
- * size can be set.
- *   column, row  counted from the first visible one; others than those in view may be given, and
- *                negative numbers stand for those before it
- *   result       1; 0 when there was no memory or the column or row lies outside the sheet
- * The size in units is compared with the cell area in pixels, at any zoom: a larger one becomes the
- * area less 10, in units (never below 0). Without a client area nothing is cut. */
+/* Sets a size in pixels at the current zoom (only the low 16 bits are used). Repaints nothing. To
+ * restore a size in units, set (units * level + 3) / 4 pixels. From 100 % up this is exact; below,
+ * not every size can be set.
+ *   column, row  counted from the first visible one. It need not be in view; negative numbers are
+ *                those before the first visible one
+ *   result       1, or 0 for lack of memory or a column or row outside the sheet
+ * The size in units is compared with the cell area in pixels, at any zoom. A larger size is clamped
+ * to the area less 10, in units (never below 0). Without a client area nothing is clamped. */
 DWORD KORCONTROLS_API SetColumnWidth(LONG column, LONG width);
 DWORD KORCONTROLS_API SetRowHeight(LONG row, LONG height);
 
-/* Sets the zoom in quarters (4 = 100 %), lays everything out again and redraws. 0 is refused: the
- * level stays as it was. There is no upper limit; from some level on no whole cell has room.
+/* Sets the zoom in quarters (4 = 100 %), lays everything out again and redraws. 0 is refused and
+ * leaves the level unchanged. There is no upper limit; above some level not even one whole cell
+ * fits.
  *   result  nonzero when the headers are hidden */
 DWORD KORCONTROLS_API SetGridZoomLevel(DWORD level);
 
@@ -219,17 +223,18 @@ DWORD KORCONTROLS_API ToggleViewStateOfHeaders(void);
 
 /* ---- Scrolling ---- */
 
-/* Makes `cell` the top left one and redraws. Not checked: past column 255 or row 16383 no cells are
- * shown.
+/* Makes `cell` the top left visible cell and redraws. The cell is not checked: past column 255 or
+ * row 16383 no cells are shown.
  *   result  1 */
 DWORD KORCONTROLS_API SetFirstVisibleCell(CellIndex cell);
 
-/* Sets how many columns, or rows, the host's data has: the scroll bar's extent, at least the number
- * of visible ones. The bar is set at once, with the number visible now as its page. Until the first
- * call, or a scroll, a grid's bars have the system's range of 0 to 100; sizing and zooming leave
- * them alone. So call these when the grid has its size, and again after WM_SIZE and a zoom.
- *   result  the scroll bar's position; while the bar is hidden the grid's window handle, which is 0
- *           before there is a grid. The number is kept in any case. */
+/* Sets how many columns, or rows, the host's data has. This is the scroll bar's extent, but at
+ * least the number of visible ones. The scroll bar is set at once, with the number visible now as
+ * its page. Until the first call, or a scroll, a grid's scroll bars have the system's range of 0 to
+ * 100. Sizing and zooming do not update them, so call these functions once the grid has its size,
+ * and again after WM_SIZE and after a zoom.
+ *   result  the scroll bar's position. While the scroll bar is hidden it is the grid's window
+ *           handle, which is 0 before there is a grid. The number is stored in any case. */
 LONG KORCONTROLS_API SetHorizontalDataRange(LONG columns);
 LONG KORCONTROLS_API SetVerticalDataRange(LONG rows);
 
@@ -245,44 +250,45 @@ void KORCONTROLS_API GetVisibleRange(GridVisibleRange* range);
 DWORD KORCONTROLS_API GetNumberOfVisibleColumns(void);
 DWORD KORCONTROLS_API GetNumberOfVisibleRows(void);
 
-/* Whether a cell is in the visible range, or whole inside the client area. Only cells of the last
- * visible column and row are measured; all others count as whole.
+/* Whether a cell is in the visible range, and whether it also lies completely inside the client
+ * area. Only cells of the last visible column and row are measured; all other cells of the range
+ * count as completely visible.
  *   result  1 or 0 */
 DWORD KORCONTROLS_API IsIndexVisible(CellIndex cell);
 DWORD KORCONTROLS_API IsIndexCompletelyVisible(CellIndex cell);
 
 /* ---- Selection ---- */
 
-/* Selects a block and highlights it; nothing is scrolled or notified and the anchor for Shift
+/* Selects a block and highlights it. Nothing is scrolled or notified, and the anchor for Shift
  * stays. Text that is being typed would be committed to the new current cell: give the grid the
  * focus first.
  *   columns  KORGRID_PAIR(left, right)
  *   rows     KORGRID_PAIR(top, bottom)
- *   result   nonzero, or 0 (and no change) for a block that is turned round or leaves the sheet */
+ *   result   nonzero, or 0 (and no change) for a block that is inverted or leaves the sheet */
 DWORD KORCONTROLS_API SetSelectedRanged(DWORD columns, DWORD rows);
 
 /* Fills *selection with the selected block; a null pointer is ignored. */
 void KORCONTROLS_API GetSelectedRanged(GridSelection* selection);
 
 /* Fills *cell with the current cell.
- *   result  1, or 0 (nothing written) for a null pointer or while the view's origin is negative */
+ *   result  1, or 0 (nothing written) for a null pointer or while the first visible column or row
+ *           is negative */
 DWORD KORCONTROLS_API GetCurrentSelectedCell(GridCellPair* cell);
 
 /* ---- Equation bar ---- */
 
-/* The equation bar's edit control, or 0 before the grid exists; after its end the handle of the
- * edit that is gone. It belongs to the grid. */
+/* The equation bar's edit control, or 0 before the grid exists. After the grid's destruction it is
+ * the handle of the destroyed edit. The grid owns the edit. */
 HWND KORCONTROLS_API GetHandleToEquationControl(void);
 
-/* Which of the two had the focus last: the grid's window or the edit; 0 before either had it. */
+/* The grid's window or the edit, whichever had the focus last; 0 before either had it. */
 HWND KORCONTROLS_API GetControlWithFocus(void);
 
-/* Sets the WM_COMMAND number that a press on "fx" posts to the parent. */
+/* Sets the WM_COMMAND number that a click on "fx" posts to the parent. */
 void KORCONTROLS_API SetFunctionButtonMessageID(DWORD id);
 
-/* Commits the equation bar. The current cell stays, unlike after a click on "OK", which then moves
- * it down.
- *   result  0, or 1 when nothing had been typed */
+/* Commits the equation bar. The current cell stays, whereas a click on "OK" also moves it down.
+ *   result  0, or 1 when nothing was typed */
 LONG KORCONTROLS_API PressOKButton(void);
 
 #ifdef __cplusplus

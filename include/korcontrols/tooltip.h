@@ -1,6 +1,6 @@
 /* The tooltip: a small framed text just above a point. The chart creates one as a child of its own
- * parent and shows the value under the pointer with it. It stays when the chart goes, until the
- * parent goes. The class is registered when the first chart is created; a host may then create
+ * parent to show the value under the pointer. The tooltip outlives the chart and is destroyed with
+ * the parent. The class is registered when the first chart is created; a host may then create
  * tooltips of its own, under the chart's instance. */
 #ifndef KORCONTROLS_TOOLTIP_H
 #define KORCONTROLS_TOOLTIP_H
@@ -17,13 +17,13 @@ extern "C" {
 /* What to show and where, in client coordinates of the tooltip's parent. 16 bytes on 32-bit
  * systems, 24 on 64-bit ones. */
 typedef struct ToolTipRequest {
-    LPCWSTR text; /* with line breaks; of more than 128 characters 127 are shown */
+    LPCWSTR text; /* may have line breaks; of more than 128 characters only 127 are shown */
     LONG x;       /* left edge */
     LONG y;       /* bottom edge */
     LONG limit;   /* the right edge stays below this */
 } ToolTipRequest;
 
-/* TIPM_SHOW: sets the text, sizes and places the tooltip, and shows it.
+/* TIPM_SHOW: sets the text, sizes and positions the tooltip, and shows it.
  *   wParam  0
  *   lParam  const ToolTipRequest*; null does nothing
  *   result  0 */

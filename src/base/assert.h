@@ -1,8 +1,8 @@
-// What the code relies on, checked where that is asked for.
+// Assertions, compiled in only on request.
 #pragma once
 
-// KOR_ASSERT(condition) ends the process at the line whose condition does not hold. It is compiled
-// only with KORCONTROLS_ASSERTIONS; elsewhere the condition is not evaluated.
+// KOR_ASSERT(condition) ends the process at the line whose condition is false. It does so only with
+// KORCONTROLS_ASSERTIONS; without it the condition is not evaluated.
 #ifdef KORCONTROLS_ASSERTIONS
 #define KOR_ASSERT(condition) ((condition) ? static_cast<void>(0) : __builtin_trap())
 #else

@@ -1,17 +1,18 @@
-// Scopes for drawing: each gives back in its destructor what it took, one type per way of giving
-// back. They live for the length of a function; handles that a record keeps are plain fields.
+// Scope guards for GDI: each destructor releases what its constructor acquired, with one type per
+// way of releasing. They live no longer than a function call; handles that a record keeps are plain
+// fields.
 #pragma once
 
 #include "platform/platform.h"
 
 namespace kor {
 
-// Selects an object into a DC and puts the previous one back.
+// Selects an object into a DC and restores the previous one. A null object selects nothing.
 class SelectScope {
 public:
     SelectScope(HDC dc, HGDIOBJ object) noexcept
         : dc_(dc), previous_(object ? SelectObject(dc, object) : nullptr) {}
-    SelectScope(HDC, HRGN) = delete;  // a region is copied in, and a number comes back
+    SelectScope(HDC, HRGN) = delete;  // a region is copied, and the result is an integer
     ~SelectScope() {
         if (previous_) SelectObject(dc_, previous_);
     }
@@ -23,8 +24,8 @@ private:
     HGDIOBJ previous_;
 };
 
-// A pen, brush, font or bitmap that is deleted at the end. Declare it before the SelectScope that
-// selects it, so that it is no longer selected when it goes.
+// A pen, brush, font or bitmap that is deleted at the end of the scope. Declare it before the
+// SelectScope that selects it, so that it is deselected before it is deleted.
 template <typename Handle>
 class LocalGdiObject {
 public:
@@ -58,7 +59,7 @@ private:
     HDC dc_;
 };
 
-// A memory DC of its own.
+// A memory DC compatible with `like`, or with the screen when that is null.
 class MemoryDC {
 public:
     explicit MemoryDC(HDC like) noexcept : dc_(CreateCompatibleDC(like)) {}
@@ -74,7 +75,7 @@ private:
     HDC dc_;
 };
 
-// BeginPaint and EndPaint. Where painting cannot begin, the DC is null and the area empty.
+// BeginPaint and EndPaint. When BeginPaint fails the DC is null and the area empty.
 class PaintScope {
 public:
     explicit PaintScope(HWND hwnd) noexcept : hwnd_(hwnd) { dc_ = BeginPaint(hwnd_, &paint_); }

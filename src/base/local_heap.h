@@ -7,13 +7,13 @@
 
 namespace kor {
 
-// Whether the bytes of so many values can be counted.
+// Whether the size of `count` values in bytes fits into SIZE_T.
 template <typename Value>
 constexpr bool HasCountableBytes(SIZE_T count) {
     return count <= SIZE_MAX / sizeof(Value);
 }
 
-// A zero-filled array of `count` values, or null. Freed with LocalFree.
+// A zero-filled array of `count` values, freed with LocalFree; null when there is no memory.
 template <typename Value>
 Value* AllocateLocal(uint32_t count) {
     static_assert(std::is_trivially_copyable_v<Value>);
@@ -22,8 +22,8 @@ Value* AllocateLocal(uint32_t count) {
         LocalAlloc(LMEM_ZEROINIT, static_cast<SIZE_T>(count) * sizeof(Value)));
 }
 
-// The array with room for `count` values, moved if it must be, or null with `array` left as it was.
-// What lies past the old end is not zeroed.
+// Resizes an array to `count` values and may move it. Null when there is no memory; `array` is
+// unchanged then. Values past the old end are not zeroed.
 template <typename Value>
 Value* ReallocateLocal(Value* array, uint32_t count) {
     static_assert(std::is_trivially_copyable_v<Value>);

@@ -6,7 +6,8 @@
 
 namespace kor {
 
-// A copy of a text, freed with LocalFree; null for a null or empty text, or without memory.
+// A copy of a text, freed with LocalFree; null for a null or empty text, or when there is no
+// memory.
 inline wchar_t* CopyText(const wchar_t* text) {
     if (!text || !*text) return nullptr;
     const size_t length = wcslen(text);
@@ -15,7 +16,7 @@ inline wchar_t* CopyText(const wchar_t* text) {
     return copy;
 }
 
-// Frees a block and forgets it.
+// Frees a block and sets the pointer to null.
 template <typename Value>
 void FreeLocal(Value*& block) {
     if (block) LocalFree(block);

@@ -1,16 +1,16 @@
-// The library as a module of the process: its instance, and the events of its life.
+// The library as a module of the process: its instance and the loader's events.
 #pragma once
 
 #include "platform/platform.h"
 
 namespace kor {
 
-// The library's own instance, set when the process attaches and never cleared. Its resources are
-// loaded and its own windows created under it.
+// The library's own instance, set when the process attaches and never cleared. The library loads
+// its resources from it and creates its own windows with it.
 extern HINSTANCE moduleInstance;
 
-// What each platform's entry point calls with the system loader's event (DLL_PROCESS_ATTACH and its
-// like); defined in src/library. Always TRUE.
+// Called by each platform's entry point with the loader's event, such as DLL_PROCESS_ATTACH;
+// defined in src/library. Always returns TRUE.
 BOOL OnLibraryEvent(HINSTANCE instance, DWORD reason);
 
 }  // namespace kor

@@ -1,4 +1,4 @@
-// Records of windows: where they come from, and when they go.
+// Window records: allocation and lifetime.
 #pragma once
 
 #include "base/assert.h"
@@ -32,18 +32,17 @@ inline void SetUserData(HWND hwnd, void* record) {
     SetWindowLongPtrW(hwnd, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(record));
 }
 
-// Where a record is in its life. The record of every control that has one per window holds this as
+// The lifetime of a record. The record of every control that has one per window holds this as
 // `life`.
 struct RecordLife {
-    uint32_t uses;  // procedures that work with the record at this moment, one inside another
-    bool retired;   // its window has gone
+    uint32_t uses;  // nested procedures that are using the record now
+    bool retired;   // its window has been destroyed
 };
 
-// One procedure's work with a record, which may be null. Nearly every call of a procedure to the
-// system sends messages, and a host may destroy the window inside any of them; the procedure that
-// is under way goes on with its record. So a record that was retired is freed, by
-// FreeRecord(Record*), when the outermost use of it ends. Every window procedure begins with a use,
-// WM_CREATE's included.
+// One procedure's use of a record, which may be null. Nearly every system call that a procedure
+// makes sends messages, and a host may destroy the window inside any of them, while the procedure
+// still needs its record. So FreeRecord(Record*) frees a retired record when its outermost use
+// ends. Every window procedure begins with a use, WM_CREATE's included.
 template <typename Record>
 class RecordUse {
 public:
@@ -62,7 +61,7 @@ private:
     Record* record_;
 };
 
-// WM_DESTROY: nothing leads from the window to its record any more. It goes with its last use.
+// WM_DESTROY: the window no longer leads to its record. The record is freed with its last use.
 template <typename Record>
 void RetireRecord(Record& record) {
     KOR_ASSERT(record.life.uses > 0 && !record.life.retired);

@@ -1,5 +1,6 @@
-// The C runtime functions that the library uses, all of them exports of the platform's own runtime
-// (the core library on Windows CE, msvcrt on the desktop), never a compiler's replacement of them.
+// The C runtime functions that the library uses. All of them are exports of the platform's own
+// runtime (the core library on Windows CE, msvcrt on the desktop), never the compiler's
+// replacements.
 #pragma once
 
 #include <stdlib.h>
@@ -8,7 +9,7 @@
 
 namespace kor {
 
-// Room for the decimal digits of any 32-bit number, its sign and the terminator.
+// Room for the decimal digits of any 32-bit integer, its sign and the terminator.
 constexpr int kDecimalCapacity = 12;
 
 inline long DecimalValue(const wchar_t* text) { return _wtol(text); }

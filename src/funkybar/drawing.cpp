@@ -9,8 +9,8 @@ namespace kor {
 
 namespace {
 
-// Puts a DC's colours and background mode back: the menu's DC is the system's, and the next entry
-// is drawn with it too.
+// Restores a DC's colours and background mode: the menu's DC belongs to the system, and the next
+// entry is drawn with it too.
 class ColourScope {
 public:
     explicit ColourScope(HDC dc) noexcept
@@ -54,7 +54,7 @@ void SetItemColours(HDC dc, const FunkyBarItem& item) {
     SetBkColor(dc, item.backgroundColour);
 }
 
-// In the font that is selected.
+// Measured in the selected font.
 Size TextSize(HDC dc, const FunkyBarItem& item) {
     SIZE size = {};
     const auto length = static_cast<int>(item.textBytes / sizeof(wchar_t)) - 1;

@@ -9,10 +9,12 @@ namespace kor {
 // Answers WM_PAINT.
 void PaintBar(HWND hwnd);
 
-// Size of an item's menu entry. Measured in a window DC's own font, not in the menu's.
+// Size of an item's menu entry in pixels.
+// Compatibility: measured in the font of a window DC, not in the menu's; pinned by
+// BarMenuDrawing.MeasuresOnTheBarsOwnDC.
 Size MeasureEntry(HWND hwnd, const FunkyBarItem& item);
 
-// Draws an entry into `area`, in dc's coordinates; without an item just its background.
+// Draws an entry into `area`, in the DC's coordinates; only its background when `item` is null.
 void DrawEntry(HDC dc, const RECT& area, const FunkyBarItem* item, bool selected);
 
 }  // namespace kor

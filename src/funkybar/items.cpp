@@ -22,7 +22,7 @@ void FreeItem(FunkyBarItem* item) {
     LocalFree(item);
 }
 
-// A copy of what the description holds, in no list yet; null without memory.
+// A copy of the described item, not in the list yet; null when there is no memory.
 FunkyBarItem* NewItem(const FunkyBarItemDesc& description) {
     auto* item = AllocateLocal<FunkyBarItem>(1);
     if (!item) return nullptr;
@@ -40,7 +40,8 @@ FunkyBarItem* NewItem(const FunkyBarItemDesc& description) {
     return item;
 }
 
-// Inside the list only the place behind the first item can be reached; the rest is refused.
+// Compatibility: inside the list an item can be inserted after the first one only, and is refused
+// elsewhere; pinned by BarInsertion.FartherInsideIsRefused.
 bool LinkItem(FunkyBarItem* item, int32_t index) {
     if (!funkyBar.first) {
         funkyBar.first = item;
@@ -108,7 +109,8 @@ bool ReadItem(FunkyBarItemDesc* description) {
     if (!item) return false;
     if (description->mask & FBIF_TEXT) {
         if (!description->text) return false;
-        // A text that fills the buffer gets no terminator; the capacity is the caller's whole room.
+        // Compatibility: a text that fills the buffer has no terminator; pinned by
+        // BarReading.OfATextThatFillsTheBufferLeavesNoTerminator.
         if (description->textCapacity > 0) {
             wcsncpy(description->text, item->text, static_cast<size_t>(description->textCapacity));
         }
@@ -133,10 +135,12 @@ bool RemoveItem(int32_t index) {
         UnlinkItemAfter(ItemAt(index - 1));
     }
     --funkyBar.count;
-    // The record alone: the text stays allocated, as the host is told.
+    // Compatibility: only the record is freed, the text stays allocated; pinned by
+    // BarDeletion.FreesTheRecordAlone.
     LocalFree(item);
     if (wasCurrent) funkyBar.current = funkyBar.first;
-    // Without its first item the bar is also painted when the next one was the current one already.
+    // Compatibility: when the first item goes, the bar is also repainted if the next one was
+    // current already; pinned by BarDeletion.OfTheFirstItemBeforeTheCurrentOneRepaints.
     return wasCurrent || (wasFirst && funkyBar.current == funkyBar.first);
 }
 

@@ -1,4 +1,4 @@
-// Where the parts of the bar and of a menu entry stand: numbers only, in pixels.
+// Layout of the bar and of a menu entry: pure calculations, in pixels.
 #pragma once
 
 #include "numbers/shapes.h"
@@ -29,7 +29,7 @@ static_assert(BarImageTop(25, 17) == 4);
 static_assert(BarTextLeft(true, 16) == 22 && BarTextLeft(true, 0) == 6);
 static_assert(BarTextLeft(false, 0) == 3);
 
-// Height that makes a font of so many points on a device of so many pixels per inch.
+// Font height in pixels, negative as in LOGFONT, for a size in points.
 constexpr int FontHeight(int points, int pixelsPerInch) { return -points * pixelsPerInch / 72; }
 
 static_assert(FontHeight(10, 96) == -13 && FontHeight(10, 72) == -10);
@@ -38,14 +38,14 @@ static_assert(FontHeight(10, 96) == -13 && FontHeight(10, 72) == -10);
 
 constexpr int kEntryImageInset = 2;  // from the entry's left and top edge
 constexpr int kEntryImageGap = 4;
-constexpr int kMenuLeft = 3;  // of the whole menu, on the screen
+constexpr int kMenuLeft = 3;  // of the whole menu, in screen coordinates
 
 constexpr int EntryTextLeft(int entryLeft, int imageWidth) {
     return entryLeft + kEntryImageInset + imageWidth + kEntryImageGap;
 }
 
-// Of the image and the gaps beside it; a text taller than its image makes the entry as high as
-// itself.
+// Width of the text, the image and the gaps beside it. Height of the image and its inset, or of a
+// text that is taller than the image.
 constexpr Size EntrySize(Size text, Size image) {
     return {text.width + image.width + kEntryImageInset + kEntryImageGap,
             text.height > image.height ? text.height : image.height + kEntryImageInset};

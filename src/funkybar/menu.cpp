@@ -9,7 +9,7 @@ namespace kor {
 
 namespace {
 
-// An entry's command is its item's position, counted from 1: 0 means that nothing was chosen.
+// An entry's command is its item's index plus 1: 0 means that nothing was chosen.
 void AppendEntries(HMENU menu) {
     UINT_PTR command = 1;
     for (const FunkyBarItem* item = funkyBar.first; item; item = item->next, ++command) {
@@ -17,7 +17,7 @@ void AppendEntries(HMENU menu) {
     }
 }
 
-// The item of an entry's data, null when it is not in the list any more.
+// The item of an entry's data; null when it is no longer in the list.
 const FunkyBarItem* ItemOfEntry(ULONG_PTR data) {
     return ItemAt(IndexOfItem(reinterpret_cast<const void*>(data)));
 }

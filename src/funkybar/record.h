@@ -19,7 +19,7 @@ struct FunkyBarItem {
     FunkyBarItem* next;
 };
 
-// All of it is one per process. Bars of the same process share it.
+// One per process, shared by all its bars.
 struct FunkyBarState {
     FunkyBarItem* first;
     FunkyBarItem* last;
@@ -28,7 +28,7 @@ struct FunkyBarState {
     HIMAGELIST itemImages;   // the host's, never destroyed here; outlives the window
     HIMAGELIST arrowImages;  // from WM_CREATE to WM_DESTROY
     HFONT font;              // likewise
-    bool menuOpen;           // some bar waits for its menu
+    bool menuOpen;           // a bar's menu is open
 };
 
 extern FunkyBarState funkyBar;

@@ -6,7 +6,8 @@ namespace kor {
 
 namespace {
 
-// The host may do anything inside: change items, choose another one, destroy the window.
+// The host may do anything inside the notification: change items, select another one, destroy the
+// window.
 void NotifySelected(HWND hwnd, int32_t index) {
     HWND parent = GetParent(hwnd);
     if (!parent) return;

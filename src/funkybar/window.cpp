@@ -1,5 +1,5 @@
-// The function bar's window: registration, life and dispatch. All state is module-wide; a window
-// adds nothing to it but the font and the arrow, which are there from WM_CREATE to WM_DESTROY.
+// The function bar's window: registration, lifetime and dispatch. All state is module-wide; a
+// window only adds the font and the arrow, which exist from WM_CREATE to WM_DESTROY.
 #include <korcontrols/funkybar.h>
 
 #include "base/gdi_scopes.h"
@@ -20,7 +20,7 @@ constexpr int kFontPoints = 10;
 
 constinit wchar_t className[] = KORFUNKYBAR_CLASS;
 
-// The system's font, bold and of ten points.
+// The system font, bold, ten points.
 HFONT CreateBarFont(HWND hwnd) {
     LOGFONTW description = {};
     GetObjectW(GetStockObject(SYSTEM_FONT), sizeof description, &description);
@@ -30,7 +30,7 @@ HFONT CreateBarFont(HWND hwnd) {
     return CreateFontIndirectW(&description);
 }
 
-// A second bar of the process finds both there already.
+// For a second bar of the process both exist already.
 LRESULT OnCreate(HWND hwnd) {
     if (!funkyBar.font) funkyBar.font = CreateBarFont(hwnd);
     if (!funkyBar.arrowImages) {
@@ -41,7 +41,8 @@ LRESULT OnCreate(HWND hwnd) {
     return 0;
 }
 
-// An open menu would stay on the screen, and its loop wait for ever, when its window has gone.
+// An open menu is cancelled: without its window it would stay on the screen and its loop would wait
+// for ever.
 LRESULT OnDestroy(HWND hwnd) {
     if (funkyBar.menuOpen) SendMessageW(hwnd, WM_CANCELMODE, 0, 0);
     RemoveAllItems();
@@ -57,7 +58,7 @@ LRESULT OnPaint(HWND hwnd) {
     return 0;
 }
 
-// Without a current item the bar showed none; now it shows the first one.
+// Repaints when the bar had no current item and now shows the first one.
 LRESULT OnInsertItem(HWND hwnd, const FunkyBarItemDesc* description) {
     const FunkyBarItem* shown = funkyBar.current;
     const int32_t result = InsertItem(description);

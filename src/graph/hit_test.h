@@ -1,4 +1,4 @@
-// Which data point lies under the pointer, and what the tooltip says of it.
+// Finds the data point under the pointer, and its tooltip text.
 #pragma once
 
 #include "graph/data/record.h"
@@ -7,7 +7,7 @@
 namespace kor {
 
 constexpr int kTipTextCapacity = 128;
-static_assert(kTipTextCapacity > 2 * kNumberTextCapacity + 10);  // a share, a value, their words
+static_assert(kTipTextCapacity > 2 * kNumberTextCapacity + 10);  // a share, a value, their labels
 
 // Fills `text` (kTipTextCapacity characters) and returns 1 when a point lies under an image
 // position; otherwise empties it and returns 0. Series are tried in the order they were added.

@@ -10,7 +10,7 @@ namespace kor {
 
 namespace {
 
-// One for the process: a value is shown under one pointer only.
+// One per process, because there is only one pointer.
 constinit wchar_t tipText[kTipTextCapacity] = {};
 
 void ShowValueAt(const GraphRecord& graph, int x, int y) {
@@ -24,7 +24,7 @@ void ShowValueAt(const GraphRecord& graph, int x, int y) {
     KorToolTip_Show(graph.hwndToolTip, &request);
 }
 
-// Each step moves the view by one tick, while there is data beyond that edge.
+// Each step moves the view by one tick, as long as there is data beyond that edge.
 void PanLeft(GraphRecord& graph, const RECT& plot) {
     if (xPixel(graph, graph.xDataMin) >= plot.left) return;
     MoveXCentre(graph, -graph.xTickStep);

@@ -1,11 +1,11 @@
-// A press on the chart: it shows the value under it, or pans by an arrow.
+// Presses on the chart: they show the value under the pointer, or pan by an arrow.
 #pragma once
 
 #include "graph/data/record.h"
 
 namespace kor {
 
-// Image position, read signed.
+// x and y are image coordinates and may be negative.
 LRESULT OnGraphButtonDown(GraphRecord& graph, int x, int y);
 
 // The release hides the value again.

@@ -35,7 +35,7 @@ void RefreshLegend(const GraphRecord& graph) {
 }  // namespace
 
 void SetTitle(GraphRecord& graph, wchar_t*& title, const wchar_t* text) {
-    wchar_t* const copy = CopyText(text);  // first: the text may be the title itself
+    wchar_t* const copy = CopyText(text);  // copied first: it may be the title itself
     FreeLocal(title);
     title = copy;
     LayOutAndRescale(graph);

@@ -1,4 +1,4 @@
-// What the host sets of a chart besides its data: titles, type, options, zoom, colour.
+// What the host sets on a chart besides its data: titles, type, options, zoom, colour.
 #pragma once
 
 #include "graph/data/record.h"

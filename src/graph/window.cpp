@@ -1,5 +1,6 @@
 // The chart: a window procedure over a record in the window's user data. A window whose record
-// could not be made passes every message on; one that could not be finished runs with what it has.
+// could not be allocated passes every message to default processing. A chart that could not be set
+// up completely works with what it has.
 #include <korcontrols/graph.h>
 #include <korcontrols/tooltip.h>
 
@@ -70,7 +71,7 @@ LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
     return 0;
 }
 
-// The legend goes with the chart's window, the tooltip with the parent's.
+// The legend is destroyed with the chart's window, the tooltip with the parent's.
 LRESULT OnDestroy(HWND hwnd, GraphRecord& graph) {
     DetachLegend(graph.hwndLegend);
     SetUserData(hwnd, nullptr);
@@ -130,7 +131,7 @@ LRESULT OnReset(GraphRecord& graph, bool ranges) {
     return 0;
 }
 
-// The codes that act only inside WM_NOTIFY. False when default processing is to follow.
+// Handles the codes that act only inside WM_NOTIFY. False if default processing is to follow.
 bool OnNotify(GraphRecord& graph, WPARAM code, LPARAM argument) {
     switch (code) {
     case GN_RESET: OnReset(graph, argument != 0); return true;
@@ -153,14 +154,14 @@ bool OnNotify(GraphRecord& graph, WPARAM code, LPARAM argument) {
     }
 }
 
-// The record stands for a page: whatever arrives is kept away from it, and what the window itself
-// needs is noted for the time after.
+// The record describes a page. No message reaches it, and what the window itself needs is noted for
+// later.
 LRESULT AnswerOnPage(GraphRecord& graph, HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
     switch (message) {
     case WM_PAINT: graph.paintMissed = true; break;
     case WM_SIZE: graph.sizeMissed = true; break;
     case GM_ADDSERIES:
-    case GM_SETCATEGORIES: return 1;  // nothing was taken
+    case GM_SETCATEGORIES: return 1;  // nothing was stored
     default: break;
     }
     return DefWindowProcW(hwnd, message, wParam, lParam);

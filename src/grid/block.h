@@ -1,4 +1,4 @@
-// Cells and blocks of them: rules over numbers, without a window.
+// Cells and blocks of cells: pure calculations, without a window.
 #pragma once
 
 #include <algorithm>
@@ -25,7 +25,7 @@ struct CellBlock {
     bool operator==(const CellBlock&) const = default;
 };
 
-// Where a Shift-extension began; both kNoAnchor without one.
+// Where an extension with Shift began; both are kNoAnchor when there is none.
 struct Anchor {
     int column;
     int row;
@@ -37,7 +37,7 @@ constexpr bool IsValidRange(const CellBlock& block) {
            block.bottom < kRowLimit;
 }
 
-// The smallest block with both cells; each number is truncated to 16 bits.
+// The smallest block that contains both cells; each index is truncated to 16 bits.
 constexpr CellBlock BlockBetween(int columnA, int rowA, int columnB, int rowB) {
     return {static_cast<uint16_t>(std::min(columnA, columnB)),
             static_cast<uint16_t>(std::max(columnA, columnB)),

@@ -1,5 +1,5 @@
-// What the host draws with while it answers GRIDN_PAINTCELLS: background, border and text of a
-// cell, straight into the off-screen image.
+// What a host calls to draw cells inside GRIDN_PAINTCELLS: background, border and text of a cell,
+// straight into the off-screen image.
 #include <korcontrols/grid.h>
 
 #include <algorithm>
@@ -21,9 +21,9 @@ constexpr UINT kDefaultFormat = DT_NOPREFIX | DT_VCENTER | DT_CENTER;
 constexpr int kTextMargin = 3;
 constexpr int kTextTop = 1;
 constexpr int kHashLimit = 255;
-constexpr LONG kSpanLimit = 16000;  // columns; keeps the sums within their numbers
+constexpr LONG kSpanLimit = 16000;  // columns; keeps the sums from overflowing
 
-// Where a text may be drawn; `box` is its own cell's.
+// The client rectangle that a text may cover; `box` is its own cell's.
 RECT TextArea(const RECT& box, int column, LONG spanLeft, LONG spanRight) {
     RECT area = box;
     if (spanLeft > 0) {
@@ -32,7 +32,7 @@ RECT TextArea(const RECT& box, int column, LONG spanLeft, LONG spanRight) {
         area.left = ColumnLeft(first);
     }
     if (spanRight > 0) {
-        // Past the sheet's end columns go on with the default width.
+        // Columns past the sheet's end have the default width.
         area.right = ColumnLeft(column + std::min<LONG>(spanRight, kSpanLimit) + 1);
     } else if (spanRight < 0) {
         area.right = ClientRectOf(grid.hwndGrid).right + (box.right - box.left);
@@ -40,8 +40,8 @@ RECT TextArea(const RECT& box, int column, LONG spanLeft, LONG spanRight) {
     return {area.left + kTextMargin, area.top + kTextTop, area.right - kTextMargin, area.bottom};
 }
 
-// As many "#" as fit into `width` pixels; `text` has room for kHashLimit of them and the
-// terminator.
+// Fills `text` with as many "#" as fit into `width` pixels. It has room for kHashLimit of them and
+// the terminator.
 void FillWithHashes(HDC dc, int width, wchar_t* text) {
     const int hashWidth = TextRun(dc, L"#").Width();
     const int count = hashWidth > 0 ? std::clamp(width / hashWidth, 0, kHashLimit) : 0;
@@ -52,8 +52,8 @@ void FillWithHashes(HDC dc, int width, wchar_t* text) {
 struct CellText {
     const wchar_t* text;
     UINT format;
-    bool fitCheck;  // too wide: a row of "#"
-    bool keepSpan;  // centred and not too wide: over the span all the same
+    bool fitCheck;  // a text that is too wide becomes a row of "#"
+    bool keepSpan;  // a centred text stays over the span even if it fits
 };
 
 void DrawRun(TextRun& run, const RECT& area, UINT format) {
@@ -91,7 +91,7 @@ extern "C" void KORCONTROLS_API SetCellBackGroundColor(CellIndex cell, HBRUSH br
     const int row = KORGRID_CELLROW(cell);
     if (!brush || !IsCellVisible(column, row)) return;
     RECT box = CellBox(column, row);
-    ++box.right;  // over the lines on all four sides
+    ++box.right;  // covers the lines on all four sides
     ++box.bottom;
     FillRect(grid.memoryDC, &box, brush);
 }

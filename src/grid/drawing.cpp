@@ -12,7 +12,7 @@ namespace kor {
 
 namespace {
 
-// Where skipping ends even if columns have no width at all.
+// The column at which skipping ends even if columns have no width.
 constexpr int kSkipLimit = 2 * kColumnLimit;
 
 void DrawLine(HDC dc, int fromX, int fromY, int toX, int toY) {
@@ -21,7 +21,7 @@ void DrawLine(HDC dc, int fromX, int fromY, int toX, int toY) {
 }
 
 // Client y where the vertical lines end, and x where the horizontal ones do: at the edge of the
-// area, or, with the sheet's last row or column on screen, at that row's or column's edge.
+// area or, when the sheet's last row or column is visible, at its edge.
 int VerticalLinesEnd(const RECT& area) {
     const int endRow = grid.firstVisibleRow + grid.visibleRowCount;
     return endRow == kRowLimit ? RowTop(endRow) : area.bottom;

@@ -18,8 +18,8 @@ void DrawGridLines(HDC dc, HPEN pen, const RECT& area);
 
 enum class Invalidate { no, yes };
 
-// Inverts the visible part of a block in the image, and perhaps invalidates it. Since the highlight
-// is an inversion, each block that was drawn is taken away by the same call before anything moves.
+// Inverts the visible part of a block in the image, and invalidates it if asked to. Since the
+// highlight is an inversion, the same call removes it, and must do so before anything moves.
 void InvertBlock(const CellBlock& block, Invalidate invalidate);
 
 // The same for the selection.

@@ -1,5 +1,5 @@
-// Whether there is something to commit is the edit's own modified flag. Leaving the edit commits,
-// so whoever moves the focus to the grid commits by that.
+// The edit's own modified flag says whether there is something to commit. Losing the focus commits,
+// so moving the focus to the grid is a way to commit.
 #include "grid/equation.h"
 
 #include "base/runtime.h"
@@ -15,8 +15,8 @@ namespace kor {
 namespace {
 
 constexpr int kCommitCapacity = 256;  // characters, with the terminator
-// WM_SETTEXT has no use for its wParam: by this one a host that subclasses the edit can tell that
-// the grid makes room for a new text.
+// WM_SETTEXT ignores its wParam. By this value a host that subclasses the edit can tell that the
+// grid clears it for a new text.
 constexpr WPARAM kClearTextMark = 256;
 
 void SetModified(bool modified) { SendMessageW(grid.hwndEquation, EM_SETMODIFY, modified, 0); }
@@ -27,7 +27,7 @@ void SetEquationText(WPARAM mark) {
 
 void FocusGrid() { SetFocus(grid.hwndGrid); }
 
-// What a message of the edit comes to: the result to return, or that it goes on to the edit.
+// How to handle a message to the edit: pass it on to the edit, or return a result.
 struct EditAnswer {
     bool passOn;
     LRESULT result;
@@ -83,7 +83,7 @@ EditAnswer OnEditArrow(WPARAM key, LPARAM flags) {
 EditAnswer OnEditKeyDown(WPARAM key, LPARAM flags) {
     switch (key) {
     case VK_RETURN: return OnEditEnter();
-    case VK_BACK: SetModified(true); return kPassOn;  // taking text away is a change as well
+    case VK_BACK: SetModified(true); return kPassOn;  // deleting text is a change as well
     case VK_TAB: return OnEditTab();
     case VK_ESCAPE: return OnEditEscape();
     case VK_LEFT:
@@ -120,7 +120,7 @@ LRESULT CALLBACK EquationEditProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM
 LRESULT CALLBACK OkButtonProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
     const LRESULT result = PassToButton(hwnd, message, wParam, lParam);
     if (message != WM_LBUTTONDOWN) return result;
-    PressGridKey(VK_DOWN);  // the press has taken the focus, and so has committed
+    PressGridKey(VK_DOWN);  // the press has taken the focus, which has committed
     return 0;
 }
 

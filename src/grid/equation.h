@@ -12,13 +12,13 @@ LRESULT CALLBACK OkButtonProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lPa
 LRESULT CALLBACK FunctionButtonProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam);
 LRESULT CALLBACK CancelButtonProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam);
 
-// Hands a typed text to the parent: 0, or 1 when there is nothing to commit.
+// Hands the typed text to the parent. Returns 0, or 1 when there is nothing to commit.
 LRESULT CommitEquation();
 
-// Empties the edit and has the parent show the current cell again.
+// Empties the edit and notifies the parent of the current cell, so that its text is shown again.
 LRESULT CancelEquation();
 
-// WM_CHAR of the grid: the first character replaces what the edit shows, and the focus follows.
+// WM_CHAR of the grid: the character replaces the edit's text, and the edit gets the focus.
 void TypeIntoEquation(WPARAM character, LPARAM flags);
 
 // Empties the edit.

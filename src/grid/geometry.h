@@ -1,7 +1,7 @@
-// Sizes and positions of columns and rows: numbers only, no window and no DC.
+// Sizes and positions of columns and rows: pure calculations, without a window or a DC.
 //
-// Both axes work alike: all columns (rows) have a default size but those in a short table of
-// overrides, sorted by index. Sizes are kept in units and become pixels at each lookup.
+// Both axes work alike: all columns (rows) have the default size except those in a short table of
+// overrides, sorted by index. Sizes are stored in units and converted to pixels at each lookup.
 #pragma once
 
 #include <cstdint>
@@ -24,44 +24,49 @@ struct GridAxis {
     int defaultSize;  // units
 };
 
-// Pixels of one column or row at a zoom.
+// Size of one column or row in pixels.
 int SizeOf(const GridAxis& axis, int index, uint32_t zoom);
 
-// Pixels of all from `first` up to, not including, `end`; 0 when the range is empty.
+// Sum of the sizes from `first` up to, not including, `end`, in pixels; 0 when the range is empty.
 int SizeOfRange(const GridAxis& axis, int first, int end, uint32_t zoom);
 
-// Pixels from one index to a later one. The overrides' deltas are added unscaled, so it is exact at
-// 100 % only; it chooses how much to redraw after a resize, and nothing else.
+// Pixels from one index to a later one, approximately; used only to choose how much to redraw after
+// a resize.
+// Compatibility: the deltas of the overrides are added unscaled, so it is exact at 100 % only;
+// pinned by GridDistance.AddsDeltasUnscaled.
 int RoughDistance(const GridAxis& axis, int first, int index, uint32_t zoom);
 
-// What a size in pixels becomes in units, cut to 16 bits.
+// Converts pixels to units, truncated to 16 bits.
 uint16_t UnitsFromPixels(uint16_t pixels, uint32_t zoom);
 
-// The same, cut to the cell area: a value above `area` becomes the area
-// less 10. (Units are compared with pixels here; it has always been so.) Never below 0.
+// The same, clamped to the cell area: a value above `area` becomes `area` less 10, never below 0.
+// Compatibility: units are compared with pixels; pinned by GridSizes.LimitComparesUnitsWithPixels.
 uint16_t UnitsWithinArea(uint16_t pixels, uint32_t zoom, int area);
 
-// How many columns or rows from `first` on it takes to fill `extent` pixels, the partly visible
-// last one included: at most 255, none at or past `limit`.
+// Number of columns or rows from `first` on that fill `extent` pixels, a partly visible last one
+// included. At most 255, and none at or past `limit`.
 int CountVisible(const GridAxis& axis, int first, int limit, int extent, uint32_t zoom);
 
-// Which index lies at a pixel position, the first one beginning at `origin`. Past the last visible
-// one a single further one is recognised; beyond that the answer is 0.
+// The index at a pixel position; index `first` begins at `origin`.
+// Compatibility: a single index past the visible ones is found, beyond that the result is 0; pinned
+// by GridIndex.GoesOnePastTheVisibleOnesAndIsZeroBeyond.
 int IndexAt(const GridAxis& axis, int first, int visibleCount, int origin, int position,
             uint32_t zoom);
 
-// The visible columns or rows that a selected range touches, as pixels from the first visible one.
+// The visible part of a selected range, in pixels from the first visible column or row.
 struct VisibleSpan {
     bool touches;
     int offset;
     int length;
 };
 
-// Both ends of the selection and of the visible range count as inside.
+// Both ends of the selected range are inclusive.
+// Compatibility: the end of the visible range counts as visible; pinned by
+// GridSelectedSpan.CountsTheEndOfTheVisibleRangeAsInside.
 VisibleSpan SelectedSpan(const GridAxis& axis, int selectedFirst, int selectedLast, int first,
                          int visibleCount, uint32_t zoom);
 
-// Width of the row header that shows the numbers up to `lastNumber`.
+// Width in pixels of the row header that shows the numbers up to `lastNumber`.
 int RowHeaderWidthFor(int lastNumber);
 
 }  // namespace kor

@@ -14,9 +14,9 @@ namespace kor {
 
 namespace {
 
-// A strip gets as many items as are visible: new ones are appended empty, surplus ones taken away
-// at the front. All are labelled afterwards, so it does not matter which go. A message to the strip
-// may lead to another update of it: that one is newer and complete, and this one ends.
+// Gives a strip as many items as are visible. Missing ones are appended empty, surplus ones deleted
+// at the front; all are labelled afterwards, so it does not matter which are deleted. A message to
+// the strip may cause another update of it. That one is newer and complete, so this one stops.
 void SetItemCount(HWND header, const uint8_t& visibleCount, int defaultSize) {
     const int wanted = visibleCount;
     const int count = KorHeader_GetItemCount(header);
@@ -42,7 +42,6 @@ void FormatColumnName(int column, wchar_t (&name)[kColumnNameCapacity]) {
     *letter = L'\0';
 }
 
-// Each message to a strip may change the grid: what an item says is looked up when it is its turn.
 LRESULT UpdateColumnHeader(int width) {
     const int count =
         CountVisible(ColumnAxis(), grid.firstVisibleColumn, kColumnLimit, width, zoomLevel);
@@ -64,6 +63,8 @@ LRESULT UpdateRowHeader(int height) {
     return 1;
 }
 
+// Each message to a strip may change the grid, so an item's label and size are looked up only when
+// the item is set.
 void FillColumnHeader() {
     for (int i = 0; i < grid.visibleColumnCount; ++i) {
         const int column = grid.firstVisibleColumn + i;

@@ -1,4 +1,4 @@
-// Keeping the two header strips in step with the view. The visible counts are a by-product: as many
+// Keeps the two header strips in step with the view. The visible counts are a by-product: as many
 // columns, or rows, are visible as the strip needs items to fill its length.
 #pragma once
 
@@ -21,7 +21,8 @@ LRESULT UpdateRowHeader(int height);
 void FillColumnHeader();
 void FillRowHeader();
 
-// With the extent of the cell area, client size less cellsLeft or cellsTop.
+// UpdateColumnHeader and UpdateRowHeader with the extent of the cell area: client size less
+// cellsLeft or cellsTop.
 LRESULT UpdateColumnHeaderOverCells();
 LRESULT UpdateRowHeaderOverCells();
 

@@ -19,7 +19,8 @@ Anchor ShiftAnchor() {
     return {grid.anchorColumn, grid.anchorRow};
 }
 
-// A selection that is none (page down can leave one behind the last row) leads back to A1.
+// Compatibility: an invalid selection (page down can leave one past the last row) moves to A1;
+// pinned by InvalidSelection.BecomesA1ByEveryArrowAndPageKey.
 template <typename Move>
 void MoveSelection(Move move) {
     const CellBlock block = grid.selection;
@@ -55,8 +56,10 @@ void OnDown() {
 }
 
 void OnPageUp() {
+    // Compatibility: within the first page the selection stays and nothing is notified; pinned by
+    // PageKeys.PageUpInTheFirstScreenOnlyScrolls.
     if (IsValidRange(grid.selection) && grid.selection.top <= grid.visibleRowCount) {
-        ScrollVertically(SB_PAGEUP);  // within the first page the cell stays, and nobody is told
+        ScrollVertically(SB_PAGEUP);
         return;
     }
     MoveSelection([](CellBlock block) { return MovePageUp(block, grid.visibleRowCount); });
@@ -72,7 +75,7 @@ void OnPageDown() {
     NotifyCurrentCell();
 }
 
-// Tab and Enter move as an arrow does, without extending.
+// Tab and Enter move like an arrow key, without extending.
 LRESULT OnAdvance(int arrowKey) {
     if (!HasCurrentCell()) return 1;
     SetFocus(grid.hwndGrid);
@@ -101,7 +104,7 @@ LRESULT OnGridKeyDown(WPARAM key, LPARAM flags) {
     case VK_RIGHT: OnRight(); break;
     case VK_DOWN: OnDown(); break;
     case VK_DELETE: NotifyDeleteKey(); break;
-    default: break;  // Control, Escape and the rest mean nothing here
+    default: break;  // Control, Escape and the rest have no effect
     }
     return 0;
 }

@@ -5,10 +5,11 @@
 
 namespace kor {
 
-// WM_KEYDOWN: what the key means for the grid. Keys it does not know go to default processing.
+// WM_KEYDOWN: what the key means for the grid. Keys beyond those it examines (Tab to Delete) go to
+// default processing.
 LRESULT OnGridKeyDown(WPARAM key, LPARAM flags);
 
-// The grid sends itself a key, as if it had been pressed.
+// Sends the grid a key, as if it had been pressed.
 void PressGridKey(int key);
 
 // Whether Shift is down.

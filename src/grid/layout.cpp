@@ -17,9 +17,9 @@ constexpr int kButtonWidth = 25;
 // WM_SIZE's way of saying "some other window was maximised": what the grid sends itself.
 constexpr WPARAM kLayOutAgain = SIZE_MAXSHOW;
 
-// The new bitmap's contents are undefined: the redraw that follows paints all of it.
+// The new bitmap's contents are undefined; the redraw that follows paints all of it.
 void ReplaceImage(int width, int height) {
-    if (!grid.memoryDC) return;  // the window is past its WM_DESTROY
+    if (!grid.memoryDC) return;  // the window has received WM_DESTROY
     WindowDC screen(grid.hwndGrid);
     HBITMAP bitmap = CreateCompatibleBitmap(screen.get(), width, std::max(height, 1));
     if (!bitmap) return;  // the old image, too small or too large, is better than none

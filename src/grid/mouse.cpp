@@ -1,7 +1,9 @@
 // A press sets the anchor and starts a timer; moves span the block from the anchor to the pointer;
-// the release stops the timer and clears the anchor. The anchor alone says that moves extend the
-// block: after a release with Shift held, moves without a button go on extending. A host may take
-// the capture away at any time, with a message box for example; that ends a drag as well.
+// the release stops the timer and clears the anchor. A host may take the capture away at any time,
+// with a message box for example; that ends a drag as well.
+// Compatibility: only the anchor says that moves extend the block, so after a release with Shift
+// held, moves without a button go on extending it; pinned by
+// MouseDrag.GoesOnAfterAReleaseWithShift.
 #include "grid/mouse.h"
 
 #include <algorithm>
@@ -56,7 +58,7 @@ LRESULT OnGridButtonDown(WPARAM keys, int x, int y) {
     const Cell hit = CellFromPoint(x, y);
     grid.lastMouseX = x;
     grid.lastMouseY = y;
-    // Whoever had the capture may have taken it back at once: then there is no drag.
+    // The window that had the capture may have taken it back at once: then there is no drag.
     if (grid.isDragging) {
         SetTimer(grid.hwndGrid, kAutoScrollTimerId, kAutoScrollInterval, nullptr);
     }
@@ -98,7 +100,7 @@ void OnAutoScroll() {
     const RECT client = ClientRectOf(grid.hwndGrid);
     if (grid.lastMouseX < client.left + grid.cellsLeft) ScrollHorizontally(SB_LINEUP);
     if (grid.lastMouseX > client.right - kAutoScrollMargin) ScrollHorizontally(SB_LINEDOWN);
-    // Above the equation bar's edge, not the cells': the column header does not scroll.
+    // The equation bar's edge, not the cells': over the column header nothing scrolls.
     if (grid.lastMouseY < client.top + grid.equationBarHeight) ScrollVertically(SB_LINEUP);
     if (grid.lastMouseY > client.bottom - kAutoScrollMargin) ScrollVertically(SB_LINEDOWN);
 }

@@ -7,13 +7,15 @@ namespace kor {
 
 constexpr UINT_PTR kAutoScrollTimerId = 10101;
 
-// Client positions: `x` read unsigned, `y` signed.
+// Client positions; `y` is read signed.
+// Compatibility: `x` is read unsigned, so left of the window counts as far right of it; pinned by
+// MouseDrag.LeftOfTheWindowIsFarRightOfIt.
 LRESULT OnGridButtonDown(WPARAM keys, int x, int y);
 LRESULT OnGridPointerMove(int x, int y);
 LRESULT OnGridButtonUp(WPARAM keys);
 
-// The capture has gone to another window, or is to be given up: the drag ends as a release ends it,
-// but the parent is not notified.
+// The capture is lost, or has to be released: the drag ends as with a release, but the parent is
+// not notified.
 void LoseGridDrag();
 
 // One step of the timer that runs while the button is down.

@@ -1,4 +1,4 @@
-// Numbers wrap round below 0, as 16-bit numbers do, and are invalid then.
+// Indexes wrap round below 0, as 16-bit integers do, and are invalid then.
 #include "grid/moves.h"
 
 #include <cstdint>
@@ -44,7 +44,8 @@ CellBlock MoveUp(CellBlock block, Anchor anchor) {
     } else {
         block.top = Word(anchor.row);
         --block.bottom;
-        // The right column is put back here, not the bottom row.
+        // Compatibility: the right column is restored here, not the bottom row; pinned by
+        // GridMovesUp.RestoreTheRightColumnWhenABlockIsTurnedRound.
         if (!IsValidRange(block)) block.right = Word(block.bottom + 1);
     }
     return block;
@@ -96,7 +97,8 @@ CellBlock MovePageDown(CellBlock block, int rows) {
     block.top = Word(block.top + rows);
     block.bottom = block.top;
     block.right = block.left;
-    // One past the last row: not a valid selection, and the next key leads back to the first cell.
+    // Compatibility: one past the last row, which is not a valid selection; the next key leads to
+    // A1; pinned by GridPages.StopAtTheTopAndRunPastTheBottom.
     if (!IsValidRange(block)) block.bottom = block.top = Word(kRowLimit);
     return block;
 }

@@ -1,20 +1,21 @@
-// Where each arrow and page key takes a selection: rules over numbers, without a window.
+// Where each arrow and page key moves a selection: pure calculations, without a window.
 //
-// The four arrows are not mirror images of each other. Hosts and their users know them as they are;
-// each is a rule of its own.
+// Compatibility: the four arrows are not mirror images of each other; each is a rule of its own;
+// pinned by GridMovesLeft.ShrinkTowardsAnAnchorFurtherLeft and
+// GridMovesRight.ShrinkTowardsAnyOtherAnchor.
 #pragma once
 
 #include "grid/block.h"
 
 namespace kor {
 
-// With the anchor of a Shift-extension; without one the single cell moves.
+// With an anchor they extend the block; without one the single cell moves.
 CellBlock MoveLeft(CellBlock block, Anchor anchor);
 CellBlock MoveUp(CellBlock block, Anchor anchor);
 CellBlock MoveRight(CellBlock block, Anchor anchor);
 CellBlock MoveDown(CellBlock block, Anchor anchor);
 
-// By a page of `rows` rows; the block becomes one cell.
+// Move by a page of `rows` rows; the block becomes one cell.
 CellBlock MovePageUp(CellBlock block, int rows);
 CellBlock MovePageDown(CellBlock block, int rows);
 

@@ -13,7 +13,7 @@ void Notify(WPARAM code, LPARAM data) { SendMessageW(grid.hwndParent, WM_NOTIFY,
 
 template <typename Data>
 void NotifyWith(WPARAM code, const Data& data) {
-    Data copy = data;  // the parent may change the grid's own while it reads
+    Data copy = data;  // the parent may change the grid's own data while it reads
     Notify(code, reinterpret_cast<LPARAM>(&copy));
 }
 

@@ -1,5 +1,6 @@
-// What the grid tells its parent: one function per message, the only place that packs GRIDN_ codes.
-// All are sent, and the parent may call back into the library before they return.
+// The grid's notifications to its parent: one function per message, the only place that packs
+// GRIDN_ codes. All but the last are sent, and the parent may call back into the library before
+// they return.
 #pragma once
 
 #include "grid/block.h"
@@ -19,7 +20,7 @@ void NotifyEquationEntered(const wchar_t* text);  // for the current cell
 void NotifyEquationEmpty();
 void NotifyDeleteKey();
 
-// The one that is posted: the command of the "fx" button.
+// The only one that is posted: the command of the "fx" button.
 void PostFunctionCommand();
 
 }  // namespace kor

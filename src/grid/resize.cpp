@@ -36,12 +36,15 @@ void ResizeColumn(int item, uint16_t units) {
     StoreColumnWidth(column, units);
     UpdateColumnHeader(area.right);
     grid.resizeLinePos = kNoResizeLine;
-    // Counted from the first cell's edge, not the window's: it begins a header's width too early.
+    // Compatibility: a distance from the first cell's edge is used as a client position, so the
+    // area begins a header's width too early; pinned by
+    // GridResizeEndPicture.RedrawsFromTheColumnsOffset.
     area.left = RoughDistance(ColumnAxis(), grid.firstVisibleColumn, column, zoomLevel);
     RedrawCells(area);
 }
 
-// One row further than the visible ones is redrawn as well; columns stop at the last visible one.
+// Compatibility: the row after the visible ones is redrawn as well, the column after them is not;
+// pinned by GridResizeEndPicture.RowsAndColumnsDifferAtTheCount.
 void ResizeRow(int item, uint16_t units) {
     const int row = grid.firstVisibleRow + item;
     if (item > grid.visibleRowCount) {

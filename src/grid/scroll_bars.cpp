@@ -10,7 +10,7 @@ namespace kor {
 
 namespace {
 
-// Where the view stands along one bar.
+// The view's position along one bar.
 struct BarView {
     int bar;  // SB_HORZ or SB_VERT
     int first;
@@ -26,8 +26,9 @@ BarView RowView() {
     return {SB_VERT, grid.firstVisibleRow, grid.visibleRowCount, grid.verticalDataRange};
 }
 
-// The first index as long as the visible ones lie within the data, else the end of the visible
-// ones.
+// The first visible index while the visible ones lie within the data.
+// Compatibility: otherwise the end of the visible ones; pinned by
+// ScrollBars.VerticalDataRangePutsAViewPastTheDataBehindIt.
 int ThumbWithinData(const BarView& view) {
     const int end = view.visibleCount + view.first;
     return end <= view.dataRange ? view.first : end;
@@ -45,7 +46,8 @@ LONG SetBar(const BarView& view, int thumb) {
     return SetScrollInfo(grid.hwndGrid, view.bar, &info, TRUE);
 }
 
-// The grid's window handle as the number that says "nothing was done".
+// Compatibility: the grid's window handle is the result when the bar was not set; pinned by
+// ScrollBars.HiddenBarsTakeDataRangesWithoutBeingSet.
 LONG GridHandleAsResult() { return static_cast<LONG>(reinterpret_cast<LONG_PTR>(grid.hwndGrid)); }
 
 void ToggleBar(bool& hidden, const BarView& view) {
@@ -79,7 +81,9 @@ using namespace kor;
 extern "C" LONG KORCONTROLS_API SetHorizontalDataRange(LONG columns) {
     grid.horizontalDataRange = std::max<LONG>(columns, grid.visibleColumnCount);
     if (!grid.hwndGrid || grid.horizontalScrollBarHidden) return GridHandleAsResult();
-    return SetBar(ColumnView(), grid.firstVisibleColumn);  // the first column in any case
+    // Compatibility: the first column in any case, unlike rows; pinned by
+    // ScrollBars.HorizontalDataRangeKeepsTheFirstColumnAsPosition.
+    return SetBar(ColumnView(), grid.firstVisibleColumn);
 }
 
 extern "C" LONG KORCONTROLS_API SetVerticalDataRange(LONG rows) {
@@ -88,7 +92,7 @@ extern "C" LONG KORCONTROLS_API SetVerticalDataRange(LONG rows) {
     return SetBar(RowView(), ThumbWithinData(RowView()));
 }
 
-// A bar takes room along the other axis when it comes and gives it back when it goes.
+// A bar takes room from the other axis while it is shown.
 extern "C" DWORD KORCONTROLS_API ToggleHorizontalScrollBar(void) {
     ToggleBar(grid.horizontalScrollBarHidden, ColumnView());
     return static_cast<DWORD>(UpdateRowHeaderOverCells());

@@ -3,8 +3,8 @@
 
 namespace kor {
 
-// After a scroll step, from the new first index and the visible count from before it. A hidden bar
-// is left alone.
+// Sets a bar after a scroll step, from the new first index and the visible count from before it. A
+// hidden bar is left alone.
 void SetColumnBarAfterScroll();
 void SetRowBarAfterScroll();
 

@@ -14,8 +14,10 @@ namespace kor {
 
 namespace {
 
-// The new first column of a scroll code, or none when the step is refused. A page forward while
-// nothing is visible goes to -1: there is no current cell then, until something scrolls back.
+// The new first column after a scroll code, or none when the step is refused.
+// Compatibility: while nothing is visible a page forward moves one column back, from the first one
+// to -1; there is no current cell then, until the view scrolls into the sheet again; pinned by
+// RowScrollingElsewhere.PageDownOfNothingMakesTheOriginNegative.
 std::optional<int> ColumnAfterScroll(int code, int thumbPosition) {
     const int first = grid.firstVisibleColumn;
     const bool atStart = first < 1;
@@ -34,7 +36,8 @@ std::optional<int> ColumnAfterScroll(int code, int thumbPosition) {
     }
 }
 
-// Rows at the top are not refused upward steps: the view is redrawn where it is.
+// Compatibility: unlike columns, rows at the top are not refused upward steps, and the view is
+// redrawn where it is; pinned by RowScrolling.LineUpGoesOneBackAndRedrawsAtTheFirstRow.
 std::optional<int> RowAfterScroll(int code, int thumbPosition) {
     const int first = grid.firstVisibleRow;
     const bool atEnd = grid.maxVisibleRowCount + first >= kRowLimit + 1;
@@ -49,7 +52,7 @@ std::optional<int> RowAfterScroll(int code, int thumbPosition) {
     }
 }
 
-// The view moves when the thumb is let go, not while it is dragged.
+// The view moves when the thumb is released, not while it is dragged.
 bool IsHandled(int code) { return code >= SB_LINEUP && code <= SB_THUMBPOSITION; }
 
 }  // namespace
@@ -61,7 +64,9 @@ LRESULT OnHorizontalScroll(int code, int thumbPosition) {
     InvertSelection(Invalidate::no);
     grid.firstVisibleColumn = *first;
     SetColumnBarAfterScroll();
-    UpdateColumnHeader(ClientRectOf(grid.hwndGrid).right);  // the full width, row header or not
+    // Compatibility: columns are counted over the full client width, row header or not; pinned by
+    // ColumnScrollingElsewhere.CountsColumnsOverTheFullClientWidth.
+    UpdateColumnHeader(ClientRectOf(grid.hwndGrid).right);
     RedrawClient();
     return 0;
 }

@@ -56,8 +56,8 @@ LRESULT OnHeaderClick(HWND header, int itemA, int itemB) {
 }
 
 LRESULT SelectAll() {
-    // One past the whole sheet: no selection is ever this one, so a second press on the corner
-    // button selects everything once more.
+    // Compatibility: one past the whole sheet, which the branch below never selects. So a second
+    // press on the corner button selects everything once more.
     constexpr CellBlock kUnselectable = {0, kColumnLimit, 0, kRowLimit};
     if (grid.selection == kUnselectable) {
         InvertSelection(Invalidate::yes);

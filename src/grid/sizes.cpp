@@ -15,8 +15,9 @@ namespace {
 
 constexpr uint32_t kTableStep = 16;  // entries by which a table grows
 
-// Makes sure the table can take one entry more. A table is grown when it is one entry short of
-// full; when that fails its block is lost to the grid, and so are its entries.
+// Makes sure the table can take one entry more. A table is grown by a step when it
+// is full, the first time one entry before that; when that fails its block is lost to the grid, and
+// so are its entries.
 bool MakeRoom(SizeOverride*& table, uint32_t& count) {
     if (!table) {
         table = AllocateLocal<SizeOverride>(kTableStep);
@@ -44,14 +45,15 @@ bool StoreSize(SizeOverride*& table, uint32_t& count, int defaultSize, int index
     return true;
 }
 
-// The units of a host's size (its low 16 bits count), cut to the cell area if there is one yet.
+// Units of a size that the host gives in pixels, of which the low 16 bits count; clamped to the
+// cell area unless the client area is empty.
 uint16_t UnitsFor(LONG pixels, int clientExtent, int cellsStart) {
     const auto wanted = static_cast<uint16_t>(pixels);
     return clientExtent > 0 ? UnitsWithinArea(wanted, zoomLevel, clientExtent - cellsStart)
                             : UnitsFromPixels(wanted, zoomLevel);
 }
 
-// Any sum of two numbers, wrapped round: what a host passes may be as large as it likes.
+// Adds with wrap-round: a host may pass any number.
 int IndexFrom(int first, LONG relative) {
     return static_cast<int>(static_cast<uint32_t>(first) + static_cast<uint32_t>(relative));
 }

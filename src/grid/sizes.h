@@ -1,4 +1,4 @@
-// The grid's own columns and rows: which sizes they have now, how those are kept and changed.
+// Sizes of the grid's own columns and rows: lookup, storage and changes.
 #pragma once
 
 #include "grid/geometry.h"
@@ -8,7 +8,7 @@ namespace kor {
 constexpr int kDefaultColumnWidth = 60;  // units
 constexpr int kDefaultRowHeight = 16;
 
-// The two axes as they are now; valid until the next size is stored or forgotten.
+// The two axes with their current sizes; valid until the next size is stored or forgotten.
 GridAxis ColumnAxis();
 GridAxis RowAxis();
 
@@ -18,7 +18,7 @@ int RowHeight(int row);
 int ColumnsWidth(int first, int end);  // `end` exclusive
 int RowsHeight(int first, int end);
 
-// Stores a size: false when there was no memory, or when the index lies outside the sheet.
+// Stores a size. False when there is no memory, or when the index lies outside the sheet.
 bool StoreColumnWidth(int column, uint16_t units);
 bool StoreRowHeight(int row, uint16_t units);
 

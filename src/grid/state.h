@@ -1,5 +1,5 @@
-// The one grid of the process: everything it knows. Its zoom stands in zoom/zoom.h, where the
-// header strips read it too.
+// The whole state of the process's one grid. Its zoom is in zoom/zoom.h, where the header strips
+// read it too.
 #pragma once
 
 #include <korcontrols/grid.h>
@@ -12,14 +12,14 @@
 namespace kor {
 
 static_assert(kColumnLimit == KORGRID_COLUMNS && kRowLimit == KORGRID_ROWS);
-// Notifications give the block to the parent by its address.
+// Notifications pass the parent a block's address as a GridSelection*.
 static_assert(sizeof(CellBlock) == sizeof(GridSelection));
 constexpr int kNoResizeLine = -1;
 constexpr int kEditBufferBytes = 260;
 
-// Window handles keep their value after WM_DESTROY, when they are no windows any more. Drawing
-// objects and blocks are the grid's own: made in WM_CREATE, WM_SIZE or on demand, 0 again after
-// WM_DESTROY.
+// Window handles keep their values after WM_DESTROY, when they no longer name windows. The grid
+// owns the drawing objects and heap blocks: they are created in WM_CREATE, WM_SIZE or on demand,
+// and are null again after WM_DESTROY.
 struct GridState {
     HWND hwndGrid = nullptr;
     HWND hwndParent = nullptr;  // receives every notification
@@ -34,7 +34,7 @@ struct GridState {
     WNDPROC savedButtonProc = nullptr;
     HDC memoryDC = nullptr;          // everything is drawn here; WM_PAINT copies from it
     HBITMAP memoryBitmap = nullptr;  // client size, selected into memoryDC
-    HGDIOBJ blankBitmap = nullptr;   // what memoryDC held at first; back before memoryBitmap goes
+    HGDIOBJ blankBitmap = nullptr;   // memoryDC's first bitmap; reselected before memoryBitmap goes
     HPEN gridLinePen = nullptr;
     int32_t firstVisibleColumn = 0;
     int32_t firstVisibleRow = 0;
@@ -63,7 +63,7 @@ struct GridState {
     HWND focusWindow = nullptr;  // the grid or the edit, whichever had the focus last
     uint32_t functionButtonMessageId = 0;
     bool editCaretMode = false;  // the user clicked into the edit: arrows move its caret
-    bool focusByMouse = false;   // a press in the grid is taking the focus just now
+    bool focusByMouse = false;   // while a press in the grid takes the focus
     bool isDragging = false;     // from a press to its release, while the grid has the capture
     int32_t lastMouseX = 0;
     int32_t lastMouseY = 0;
@@ -74,11 +74,12 @@ struct GridState {
 
 extern GridState grid;
 
-// The state itself never goes. What a grid that was destroyed in the middle of its own work has
-// made after that goes when the work ends.
+// The state itself is never freed. Releases what a grid created after it was destroyed in the
+// middle of its own work, when that work ends.
 void FreeRecord(GridState* state);
 
-// What follows from other initial values: done once, when the process attaches the library.
+// Sets what is derived from other initial values. Called once, when the process attaches the
+// library.
 void InitialiseGridState();
 
 }  // namespace kor

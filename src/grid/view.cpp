@@ -25,7 +25,7 @@ extern "C" DWORD KORCONTROLS_API ToggleViewStateOfHeaders(void) {
 extern "C" DWORD KORCONTROLS_API SetGridZoomLevel(DWORD level) {
     if (level == 0) return grid.headersHidden;
     zoomLevel = level;
-    grid.headersHidden = !grid.headersHidden;  // the toggle turns it back
+    grid.headersHidden = !grid.headersHidden;  // the toggle below inverts it again
     return ToggleViewStateOfHeaders();
 }
 

@@ -46,7 +46,7 @@ HWND CreateChild(const wchar_t* windowClass, const wchar_t* text, DWORD style, C
                            instance, nullptr);
 }
 
-// All buttons come from one class: the procedure replaced last serves the three.
+// All buttons are of one class, so the procedure that was replaced last serves all three.
 HWND CreateBarButton(const wchar_t* text, DWORD style, ChildId id, WNDPROC procedure,
                      HINSTANCE instance) {
     HWND button = CreateChild(L"BUTTON", text, style, id, instance);
@@ -71,13 +71,13 @@ void CreateChildren(HINSTANCE instance) {
     grid.hwndRowHeader = CreateChild(KORHEADER_CLASS, L"", HCS_VERTICAL, kRowHeaderId, instance);
 }
 
-// Never deleted: the headers keep it for the life of the process.
+// The font is never deleted: the headers keep it for the life of the process.
 void SetHeaderFont() {
     LOGFONTW description = {};
     description.lfWeight = FW_BOLD;
     description.lfCharSet = DEFAULT_CHARSET;
-    // Five bytes of an 8-bit string in a wide field name no face that exists, so the system picks
-    // its own. That is wanted: headers look the same wherever there is no such face.
+    // Compatibility: five bytes of an 8-bit string in a wide field name no face that exists, so the
+    // system picks its own; pinned by GridCreation.DescribesABoldFontWithANarrowFaceName.
     memcpy(description.lfFaceName, "Arial", 5);
     HFONT font = CreateFontIndirectW(&description);
     if (!font) return;
@@ -92,7 +92,9 @@ void CreateImageDC() {
     TEXTMETRICW metrics = {};
     GetTextMetricsW(parentDC, &metrics);
     grid.equationBarHeight = metrics.tmHeight + kEquationBarMargin;
-    ReleaseDC(grid.hwndGrid, parentDC);  // it came from the parent; the platform goes by the DC
+    // Compatibility: the parent's DC is released in the grid's name; the platform goes by the DC;
+    // pinned by GridCreation.TakesTheParentsDCAndReleasesItInTheGridsName.
+    ReleaseDC(grid.hwndGrid, parentDC);
 }
 
 void ReleaseDrawingObjects() {
@@ -107,18 +109,18 @@ void ReleaseDrawingObjects() {
     grid.gridLinePen = nullptr;
 }
 
-// Places nothing: WM_SIZE follows and does.
+// Places no child: the WM_SIZE that follows does.
 LRESULT OnCreate(HWND hwnd, const CREATESTRUCTW* creation) {
     if (!creation) return 0;
     grid.life.retired = false;
-    ReleaseDrawingObjects();  // of a grid that this one follows while it still lives
-    RegisterHeaderClass(
-        creation->hInstance);  // fails when it already is, and need not succeed then
+    ReleaseDrawingObjects();  // of an earlier grid that still exists
+    // Fails when the class is already registered; then it need not succeed.
+    RegisterHeaderClass(creation->hInstance);
     grid.hwndParent = creation->hwndParent;
     grid.hwndGrid = hwnd;
     WhenHeaderResizeIsLost(OnHeaderResizeLost);
     CreateChildren(creation->hInstance);
-    if (grid.life.retired || grid.hwndGrid != hwnd) return 0;  // a host has destroyed it by now
+    if (grid.life.retired || grid.hwndGrid != hwnd) return 0;  // a host has destroyed it meanwhile
     grid.gridLinePen = CreatePen(PS_SOLID, 1, kGridLineColour);
     CreateImageDC();
     return 0;

@@ -1,7 +1,7 @@
-// One press or border drag is tracked at a time, in `headerDrag`. The strip under the button has
-// the capture, so moves and the release come to it; should another strip receive them all the same,
-// an item that it has not is ignored. A drag ends with the release, with the capture, which another
-// window may take, or with the strip.
+// One press or border drag is tracked at a time, in `headerDrag`. The strip that was pressed has
+// the capture, so moves and the release go to it. If another strip receives them anyway, an item
+// that it does not have is ignored. A drag ends with the release, with the loss of the capture, or
+// with the strip.
 #include "header/drag.h"
 
 #include <korcontrols/header.h>
@@ -19,7 +19,7 @@ namespace {
 constexpr int kSizeBoundMargin = 10;
 
 void PostToParent(const HeaderRecord& header, UINT notification, int lowWord, int highWord) {
-    if (header.life.retired) return;  // nobody could ask the sender anything
+    if (header.life.retired) return;  // the parent could no longer query the sender
     PostMessageW(header.parent, notification, reinterpret_cast<WPARAM>(header.window),
                  WordPair(lowWord, highWord));
 }
@@ -32,7 +32,7 @@ bool HasItem(const HeaderRecord& header, int index) {
     return index >= 0 && static_cast<uint32_t>(index) < header.count;
 }
 
-// Repaints from a position to the strip's end.
+// Invalidates from a position to the strip's end.
 void InvalidateFrom(const HeaderRecord& header, int start) {
     RECT area = ClientRectOf(header.window);
     (IsVertical(header) ? area.top : area.left) = start;
@@ -64,7 +64,7 @@ void PressMovesTo(const HeaderRecord& header, int position) {
     PostToParent(header, HCN_ITEMCLICK, headerDrag.pressAnchor, item);
 }
 
-// Before the capture is taken: whoever loses it may do anything.
+// The strip is set before the capture is taken: the window that loses it may do anything.
 void BeginDrag(const HeaderRecord& header) {
     headerDrag.strip = &header;
     SetCapture(header.window);
@@ -84,8 +84,9 @@ void EndResize(const HeaderRecord& header) {
     const auto item = static_cast<uint32_t>(resized);
     PostToParent(header, HCN_ITEMRESIZED, resized,
                  UnitsOfDraggedSize(header.sizes[item], zoomLevel));
-    // The start is multiplied by the bare zoom level: usually too far along, and the parent
-    // repaints the strip anyway.
+    // Compatibility: the start is multiplied by the bare zoom level and so is usually too far
+    // along; the parent repaints the strip anyway; pinned by
+    // HeaderResize.InvalidatesFromFarBehindTheItemWhenLetGo.
     InvalidateFrom(header,
                    static_cast<int>(zoomLevel * static_cast<uint32_t>(ItemStart(header, item))));
 }
@@ -102,7 +103,7 @@ int UnitsOfDraggedSize(int pixels, uint32_t zoom) {
 }
 
 void UpdateSizeBounds(const HeaderRecord& header, int clientWidth, int clientHeight) {
-    // Strips are created without a size; a bound below the least size would be none.
+    // Strips are created without a size; the bound must not be below the minimum size.
     if (IsVertical(header)) {
         headerDrag.maximumRowSize = std::max(clientHeight - kSizeBoundMargin, kMinimumItemSize);
     } else {
@@ -115,8 +116,9 @@ LRESULT OnHeaderButtonDown(HeaderRecord& header, int position) {
     headerDrag.resizeItem = -1;
     headerDrag.pressAnchor = -1;
     if (hit.onBorder) {
-        // The border of item -1, the strip's first pixels, takes the capture as well; there is
-        // nothing to drag then, and the release leaves the capture alone.
+        // Compatibility: the border of item -1, the strip's first pixels, takes the capture as
+        // well; nothing is dragged then, and the release does not release the capture; pinned by
+        // HeaderPress.AtTheStripsBeginTakesTheCaptureForGood.
         headerDrag.resizeItem = hit.borderItem;
         headerDrag.dragPosition = position;
         BeginDrag(header);

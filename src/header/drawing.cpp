@@ -1,4 +1,4 @@
-// Items are drawn as raised buttons with Rectangle calls, so that pen and brush decide each edge.
+// Items are drawn as raised buttons with Rectangle calls; pen and brush decide each edge.
 #include "header/drawing.h"
 
 #include <korcontrols/header.h>
@@ -21,7 +21,8 @@ void DrawBox(HDC dc, const RECT& box) { Rectangle(dc, box.left, box.top, box.rig
 
 void SelectStock(HDC dc, int object) { SelectObject(dc, GetStockObject(object)); }
 
-// Outline and face; the pen left selected is white, the brush the one the frame is drawn with.
+// Draws outline and face. Leaves the white pen selected, and the brush that the frame is drawn
+// with.
 void DrawFace(HDC dc, const RECT& box, const RECT& highlight, bool selected) {
     SelectObject(dc, headerPaint.framePen);
     SelectObject(dc, headerPaint.faceBrush);
@@ -105,11 +106,11 @@ void DrawHeaderItems(const HeaderRecord& header, const RECT& area) {
     const bool vertical = IsVertical(header);
     const int lowEdge = vertical ? area.top : area.left;
     const int highEdge = vertical ? area.bottom : area.right;
-    // One font serves all labels; without one they are drawn with the DC's own.
+    // One font serves all labels; if it cannot be created they are drawn with the DC's own.
     LocalGdiObject<HFONT> font(
         CreateZoomedFont(static_cast<HFONT>(GetCurrentObject(header.dc, OBJ_FONT))));
     SelectScope pen(header.dc, headerPaint.framePen);
-    // Items select brushes of their own: whatever fails, the DC's own is put back in the end.
+    // Items select other brushes: whatever fails, the DC's own is restored at the end.
     const HGDIOBJ hollow = GetStockObject(NULL_BRUSH);
     SelectScope brush(header.dc, hollow ? hollow : headerPaint.faceBrush);
     int start = 0;

@@ -11,7 +11,7 @@ constexpr int kGrip = 6;
 HeaderHit HitTestHeader(const uint16_t* sizes, uint32_t count, int position) {
     HeaderHit hit = {-1, false, -1};
     if (position < 0) return hit;
-    int edge = 0;  // start of the item, and after its turn its end
+    int edge = 0;  // start of item i, then its end
     for (uint32_t i = 0; i < count && hit.item < 0; ++i) {
         const int item = static_cast<int>(i);
         if (position - edge < kGrip) {

@@ -8,15 +8,17 @@ namespace kor {
 
 namespace {
 
-// The count itself is a valid index: the arrays have a spare place for it.
+// Compatibility: the count itself is a valid index, and the arrays have a spare element for it;
+// pinned by HeaderItems.HaveASparePlaceAtTheCount.
 bool IsBadIndex(const HeaderRecord& header, int index) {
     return index < 0 || static_cast<uint32_t>(index) > header.count;
 }
 
-// A copy on the local heap, an empty one for a null text; null when there is no memory.
+// A copy on the local heap, empty for a null text; null when there is no memory.
 wchar_t* CopyLabel(const wchar_t* text) {
     const size_t length = text ? wcslen(text) : 0;
-    // Twice what a wide string needs; hosts have always been given this much room.
+    // Compatibility: twice the room that a wide string needs; pinned by
+    // HeaderItems.ReserveFourBytesForACharacter.
     auto* copy =
         reinterpret_cast<wchar_t*>(AllocateLocal<uint32_t>(static_cast<uint32_t>(length) + 1));
     if (copy && text) memcpy(copy, text, length * sizeof(wchar_t));
@@ -28,7 +30,7 @@ void FreeLabel(HeaderRecord& header, uint32_t index) {
     header.texts[index] = nullptr;
 }
 
-// Grows one array by a step and zeroes the new places; false leaves it as it was.
+// Grows one array by a step and zeroes the new elements. False: the array is unchanged.
 template <typename Value>
 bool GrowArray(Value*& array, uint32_t capacity) {
     const uint32_t newCapacity = capacity + kHeaderCapacityStep;
@@ -39,7 +41,7 @@ bool GrowArray(Value*& array, uint32_t capacity) {
     return true;
 }
 
-// An array that grew before another one failed stays grown; the capacity tells what all three have.
+// An array that grew before another one failed stays grown; `capacity` counts what all three have.
 bool Grow(HeaderRecord& header) {
     if (!GrowArray(header.texts, header.capacity) || !GrowArray(header.sizes, header.capacity) ||
         !GrowArray(header.states, header.capacity)) {
@@ -49,11 +51,11 @@ bool Grow(HeaderRecord& header) {
     return true;
 }
 
-// Makes an empty place at `index` by moving all places from there up to the capacity by one.
+// Opens a gap at `index`: moves all elements from there up to the capacity by one.
 void OpenPlace(HeaderRecord& header, uint32_t index) {
     const uint32_t last = index < header.capacity ? header.capacity - 1 : header.capacity;
     KOR_ASSERT(index <= last);
-    FreeLabel(header, last);  // falls off the end
+    FreeLabel(header, last);  // the move overwrites it
     const size_t moved = last - index;
     memmove(header.texts + index + 1, header.texts + index, moved * sizeof(wchar_t*));
     memmove(header.sizes + index + 1, header.sizes + index, moved * sizeof(uint16_t));
@@ -86,7 +88,7 @@ LRESULT DeleteItem(HeaderRecord& header, int index) {
         memmove(header.texts + place, header.texts + place + 1, moved * sizeof(wchar_t*));
         memmove(header.sizes + place, header.sizes + place + 1, moved * sizeof(uint16_t));
         memmove(header.states + place, header.states + place + 1, moved * sizeof(uint8_t));
-        header.texts[header.count - 1] = nullptr;  // it has moved down
+        header.texts[header.count - 1] = nullptr;  // its label has moved down
     }
     --header.count;
     return 1;

@@ -33,7 +33,7 @@ void ReleaseRecordDC(HeaderRecord& record) {
     record.dc = nullptr;
 }
 
-// A record in no list yet, or null when there is no memory.
+// A record that is not in the list yet; null when there is no memory.
 HeaderRecord* NewHeaderRecord(const CREATESTRUCTW& creation, HWND window) {
     auto* record = AllocateLocal<HeaderRecord>(1);
     if (!record) return nullptr;
@@ -84,7 +84,7 @@ HeaderRecord* CreateHeaderRecord(const CREATESTRUCTW& creation, HWND window) {
     return record;
 }
 
-// The DC goes at once: the system hands it to another window next.
+// The DC is released at once: the system hands it to another window next.
 void RetireHeaderRecord(HeaderRecord& record) {
     Unlink(&record);
     ReleaseRecordDC(record);
@@ -92,7 +92,7 @@ void RetireHeaderRecord(HeaderRecord& record) {
     RetireRecord(record);
 }
 
-// Labels may lie in any place, also past the count.
+// Any element may hold a label, also past the count.
 void FreeRecord(HeaderRecord* record) {
     if (record->texts) {
         for (uint32_t i = 0; i <= record->capacity; ++i) {
@@ -107,7 +107,7 @@ void FreeRecord(HeaderRecord* record) {
 
 bool IsVertical(const HeaderRecord& record) { return (record.style & HCS_VERTICAL) != 0; }
 
-// Wraps round where many items are as large as can be.
+// The sum wraps round when very many items have the largest size.
 int ItemStart(const HeaderRecord& record, uint32_t index) {
     uint32_t start = 0;
     for (uint32_t i = 0; i < index; ++i) start += record.sizes[i];

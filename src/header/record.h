@@ -7,9 +7,8 @@
 
 namespace kor {
 
-// In the module's list from WM_CREATE to WM_DESTROY. The three item arrays always have one
-// place more than `capacity` says: an index equal to the count is a valid one, even when the strip
-// is full.
+// In the module's list from WM_CREATE to WM_DESTROY. The three item arrays always have one element
+// more than `capacity` says: an index equal to the count is valid, even when the strip is full.
 struct HeaderRecord {
     HWND window;     // the key of the list
     HWND parent;     // receives all notifications
@@ -31,13 +30,15 @@ constexpr uint32_t kHeaderInitialCapacity = 10;
 constexpr uint32_t kHeaderCapacityStep = 25;
 
 // A drag and its bounds, in pixels along the strip; indexes are -1 for none.
+// Compatibility: lastHoveredItem outlives the drag; pinned by
+// HeaderPress.StaysSilentOnTheItemWhereTheLastDragEnded.
 struct HeaderDrag {
     const HeaderRecord* strip = nullptr;  // where the button went down; null without a drag
     int maximumRowSize = 600;
     int maximumColumnSize = 600;
     int resizeItem = -1;                       // whose border is dragged
-    int pressAnchor = -1;                      // where the button went down
-    int lastHoveredItem = -1;                  // last one reported; outlives the drag
+    int pressAnchor = -1;                      // the item that was pressed
+    int lastHoveredItem = -1;                  // the item reported last
     int dragPosition = 0;                      // last pointer position while resizing
     void (*resizeLost)(HWND strip) = nullptr;  // see WhenHeaderResizeIsLost
 };
@@ -46,7 +47,7 @@ extern HeaderDrag headerDrag;
 
 constexpr int kMinimumItemSize = 3;
 
-// What every strip paints with; made for the first strip, gone with the last.
+// What every strip paints with; created for the first strip, deleted with the last.
 struct HeaderPaintObjects {
     HPEN framePen;
     HBRUSH faceBrush;
@@ -57,13 +58,13 @@ extern HeaderPaintObjects headerPaint;
 // The record of a window, or null.
 HeaderRecord* FindHeaderRecord(HWND window);
 
-// Makes the record of a new window and appends it to the list; null when there is no memory.
+// Creates the record of a new window and appends it to the list; null when there is no memory.
 HeaderRecord* CreateHeaderRecord(const CREATESTRUCTW& creation, HWND window);
 
-// WM_DESTROY: takes the record out of the list and gives its DC back.
+// WM_DESTROY: removes the record from the list and releases its DC.
 void RetireHeaderRecord(HeaderRecord& record);
 
-// Frees the record and all it holds.
+// Frees the record and everything it holds.
 void FreeRecord(HeaderRecord* record);
 
 bool IsVertical(const HeaderRecord& record);

@@ -56,7 +56,7 @@ LRESULT AnswerWithoutRecord(HWND hwnd, UINT message, WPARAM wParam, LPARAM lPara
     case HCM_GETITEM: return 0;
     case HCM_GETITEMSIZE: return -1;
     case WM_PAINT:
-        ValidateRect(hwnd, nullptr);  // nothing to draw, and it must not be asked for for ever
+        ValidateRect(hwnd, nullptr);  // otherwise the system sends WM_PAINT endlessly
         return 1;
     case WM_MOUSEMOVE:
     case WM_LBUTTONDOWN:

@@ -5,10 +5,11 @@
 
 namespace kor {
 
-// Registers the class "korvane Header"; false when it could not be, as when it already is.
+// Registers the class "korvane Header". False when that fails, for instance because it is
+// registered already.
 bool RegisterHeaderClass(HINSTANCE instance);
 
-// What is called, with the strip, when a border was being dragged and will not be let go: the strip
+// Sets the handler that is called with the strip when a border drag is cancelled because the strip
 // has lost the capture. No message tells the parent.
 void WhenHeaderResizeIsLost(void (*handler)(HWND strip));
 

@@ -1,5 +1,5 @@
-// What happens when a process attaches the library: state that follows from other state gets its
-// initial value, in a fixed order, before anything else can run. Nothing is left to do at detach.
+// Runs when a process attaches the library: derived state gets its initial value, in a fixed order,
+// before anything else can run. Nothing needs to be done at detach.
 #include "base/module.h"
 #include "grid/state.h"
 

@@ -24,7 +24,7 @@ bool IsSelected(HWND list, LONG row) {
     return SendMessageW(list, LVM_GETITEMSTATE, static_cast<WPARAM>(row), LVIS_SELECTED) != 0;
 }
 
-// Sets a whole row, or appends it when its index is below 0. The row's index, or kNoRow.
+// Sets a whole row, or appends it when its index is below 0. Returns the row's index, or kNoRow.
 LONG PlaceRow(HWND list, LVITEMW& row) {
     if (row.iItem >= 0) return Send(list, LVM_SETITEMW, 0, &row) ? row.iItem : kNoRow;
     row.iItem = RowCount(list);
@@ -78,7 +78,7 @@ extern "C" LONG KORCONTROLS_API KorListView_UpdateItem(HWND list, LONG index, co
 extern "C" LONG KORCONTROLS_API KorListView_GetIndexFromCurrentPosition(HWND list) {
     if (!IsWindow(list)) return kNoRow;
     const auto position = static_cast<LPARAM>(GetMessagePos());
-    // On a desk of several displays a position may be negative.
+    // On a desktop with several displays a position may be negative.
     LVHITTESTINFO hit = {};
     hit.pt = {SignedLowWord(position), SignedHighWord(position)};
     MapWindowPoints(nullptr, list, &hit.pt, 1);

@@ -1,4 +1,4 @@
-// Doubles in the form that the processor compares fastest: themselves, or whole numbers in the same
+// Doubles in the form that the processor compares fastest: as they are, or as integers in the same
 // order.
 #pragma once
 
@@ -11,8 +11,8 @@ namespace kor {
 
 using Comparable = std::conditional_t<kHasFloatingPoint, double, int64_t>;
 
-// Of numbers, infinite ones included. What is no number lies between no two finite ones in either
-// form, but the forms differ where it is compared with one alone.
+// Valid for finite values and infinities. A NaN is never between two finite values in either form,
+// but single comparisons with a NaN differ between the forms.
 constexpr Comparable ComparableOf(double value) {
     if constexpr (kHasFloatingPoint) {
         return value;

@@ -1,6 +1,5 @@
-// Doubles by their bits: what a processor without floating point asks of them in a few instructions
-// on whole numbers. The answers are those of the comparisons and conversions of C++, for every
-// double.
+// Doubles by their bits: questions that a processor without floating point answers in a few integer
+// instructions. The answers are those of C++'s comparisons and conversions, for every double.
 #pragma once
 
 #include <bit>
@@ -9,8 +8,7 @@
 namespace kor {
 
 constexpr int kExponentBias = 1023;
-constexpr uint32_t kExponentMask =
-    0x7FF;  // also the exponent of infinities and of what is no number
+constexpr uint32_t kExponentMask = 0x7FF;  // also the exponent of infinities and NaNs
 
 constexpr uint64_t BitsOf(double value) { return std::bit_cast<uint64_t>(value); }
 constexpr uint32_t HighBitsOf(double value) { return static_cast<uint32_t>(BitsOf(value) >> 32); }
@@ -21,8 +19,8 @@ constexpr int BiasedExponentOf(double value) {
     return static_cast<int>(HighBitsOf(value) >> 20 & kExponentMask);
 }
 
-// The first 32 bits of the number, the highest set: the value, cut off, is that times 2 to the
-// power of its exponent - 31. Not for 0 and numbers so close to it that they lack the highest bit.
+// The first 32 bits of the significand, the highest one set: the truncated value is that times
+// 2^(exponent - 31). Not for 0 and subnormal values, which lack the highest bit.
 constexpr uint32_t LeadingBitsOf(double value) {
     return 0x80000000u | static_cast<uint32_t>(BitsOf(value) >> 21 & 0x7FFFFFFF);
 }
@@ -32,17 +30,16 @@ constexpr bool IsFiniteByBits(double value) {
     return (HighBitsOf(value) & kMask) != kMask;
 }
 
-// A whole number that is larger for a larger double and equal for equal ones, of either zero too.
-// Infinities lie outside all finite numbers. What is no number lies beyond them and is equal to
-// itself: ask for that first where it matters.
+// An integer that orders as the doubles do; both zeros give the same. Infinities lie outside all
+// finite values. NaNs lie beyond the infinities and equal themselves; test for NaN first where it
+// matters.
 constexpr int64_t OrderOf(double value) {
     const auto bits = static_cast<int64_t>(BitsOf(value));
     const int64_t magnitude = bits & INT64_MAX;
     return bits < 0 ? -magnitude : magnitude;
 }
 
-// Truncated toward zero and cut to +-2 to the power of `limitBits`, at most 31 less one; 0 for what
-// is no number.
+// Truncated toward zero and clamped to +-2^limitBits, with limitBits at most 30; 0 for a NaN.
 constexpr int TruncateByBits(double value, int limitBits) {
     constexpr uint64_t kInfinity = static_cast<uint64_t>(kExponentMask) << 52;
     const int exponent = BiasedExponentOf(value) - kExponentBias;

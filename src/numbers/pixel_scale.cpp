@@ -4,7 +4,7 @@ namespace kor {
 
 namespace {
 
-// Exponents at which neither the reciprocal nor a sum of exponents leaves its range.
+// Up to this exponent, of either sign, neither the reciprocal nor a sum of exponents overflows.
 constexpr int kMostExponent = 900;
 
 constexpr int32_t kMostCentre = 1 << 30;

@@ -1,10 +1,10 @@
 // A chart's mapping of values to pixels without floating point:
 //
-//     pixels = the whole part of (value - centre) / unitsPerPixel
+//     pixels = (value - centre) / unitsPerPixel, truncated toward zero
 //
-// Each of the two operations rounds to a double, and a value close to a pixel's edge may end on
-// either side of it by that. So whole numbers answer only where the value is far enough from an
-// edge, and leave the rest, a few of ten thousand, to the doubles.
+// Both operations round to a double, which may put a value near a pixel's edge on either side of
+// it. So the integers answer only where the value is far enough from an edge. The rest, a few in
+// ten thousand, are left to the doubles.
 #pragma once
 
 #include <cstdint>
@@ -15,23 +15,24 @@ namespace kor {
 
 constexpr int kPixelFraction = 16;  // bits of a position below the pixel
 
-// Positions are pixels from the value 0, in units of 1 / 2^kPixelFraction. As zeros it knows none.
+// Positions are pixels from the value 0, in units of 1 / 2^kPixelFraction. All zeros: no position
+// is known.
 struct PixelScale {
     uint32_t reciprocal;  // leading bits of 1 / unitsPerPixel
-    int32_t shift;        // less the value's exponent: how far down the product is a position
+    int32_t shift;        // less the value's exponent: right shift from product to position
     int32_t centre;       // position of the centre, rounded down
 };
 
-// Knows none when the axis is so far from 0 or so steep that positions have no room.
+// All zeros when the axis is so far from 0 or so steep that positions would overflow.
 PixelScale MakePixelScale(double centre, double unitsPerPixel);
 
 constexpr int kUnknownPixels = INT32_MIN;
 
 // The pixels of a value, or kUnknownPixels.
 //
-// A position is at most 2.5 units above what the product says, since both factors are cut off to 32
-// bits and the shift is at least 2; the centre's is off by 1; the roundings of the doubles by less
-// than 2^-20. The margin is twice all that.
+// A position is at most 2.5 units above the product, since both factors are truncated to 32 bits
+// and the shift is at least 2. The centre's position is off by 1, and the doubles' roundings by
+// less than 2^-20. The margin is twice all that.
 inline int QuickPixels(const PixelScale& scale, double value) {
     constexpr uint32_t kMargin = 8;
     constexpr uint32_t kPixel = 1u << kPixelFraction;

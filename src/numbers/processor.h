@@ -1,11 +1,11 @@
-// What the processor that the library is compiled for can do by itself.
+// What the target processor can do in hardware.
 #pragma once
 
 namespace kor {
 
-// Without floating-point instructions each addition of doubles costs some 60 instructions, a
-// comparison 30 and a division 600. What is done for every point of a chart is done with whole
-// numbers there; src/numbers has what that takes.
+// Without floating-point instructions an addition of doubles costs some 60 instructions, a
+// comparison 30 and a division 600. Work that is done for every point of a chart uses integers
+// there; src/numbers has what that takes.
 #ifdef __SOFTFP__
 constexpr bool kHasFloatingPoint = false;
 #else

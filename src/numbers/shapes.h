@@ -1,5 +1,5 @@
-// Points, sizes and rectangles in pixels for what needs no window; those of the platform look
-// alike.
+// Points, sizes and rectangles in pixels, for code that needs no window. They are laid out like the
+// platform's.
 #pragma once
 
 #include <cstdint>

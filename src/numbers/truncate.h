@@ -1,12 +1,12 @@
-// Doubles to integers, whatever the double.
+// Conversion of any double to an integer.
 #pragma once
 
 #include "numbers/comparable.h"
 
 namespace kor {
 
-// Largest pixel distance that ever comes out of a data value: far outside every window, and small
-// enough for the platform's drawing to compute with.
+// Largest pixel distance that a data value ever gives: far outside every window, and small enough
+// for the platform's drawing to compute with.
 constexpr int kPixelLimitBits = 26;
 constexpr int kPixelLimit = 1 << kPixelLimitBits;
 

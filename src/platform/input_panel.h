@@ -1,9 +1,9 @@
-// The panel on the screen by which a device without a keyboard takes text.
+// The on-screen panel for text input on devices without a keyboard.
 #pragma once
 
 namespace kor {
 
-// Each does nothing where the panel is in that state already, or where there is none.
+// Each does nothing when the panel is already in that state, or when there is none.
 void ShowInputPanel();
 void HideInputPanel();
 

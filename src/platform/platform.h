@@ -16,8 +16,8 @@
 
 namespace kor {
 
-// Windows CE marks an index of a system colour with this bit where an index of something else, or
-// a handle, could be meant. The library always writes it.
+// Windows CE sets this bit in a system colour's index to tell it from other indexes and from
+// handles. The library always sets it.
 constexpr int kSystemColourFlag = 0x40000000;
 
 // The system colour of a flagged index, such as COLOR_BTNFACE | kSystemColourFlag.
@@ -26,8 +26,8 @@ COLORREF SystemColour(int flaggedIndex);
 // The stock brush of a flagged index. It is never deleted.
 HBRUSH SystemStockBrush(int flaggedIndex);
 
-// Lets drawing into a DIB section come to its end, so that its bits may be read. On Windows CE
-// drawing is done when a call returns.
+// Finishes pending drawing into a DIB section, so that its bits may be read. On Windows CE drawing
+// is finished when a call returns.
 void FinishDrawing();
 
 }  // namespace kor

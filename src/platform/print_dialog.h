@@ -6,14 +6,14 @@
 
 namespace kor {
 
-// 68 bytes on 32-bit systems. Windows CE has no 64-bit kind; there the companion's record is the
-// same with handles and pointers widened and aligned, 104 bytes.
+// 68 bytes on 32-bit systems. Windows CE has no 64-bit form; on 64-bit desktops the companion's
+// record is the same with handles and pointers widened and aligned, 104 bytes.
 struct PrintDialogRecord {
     DWORD size;  // of this record
     HWND owner;
-    HDC dc;             // out: the printer's, the caller's to delete
-    DWORD flags;        // the library leaves this and all that follows 0, and
-    RECT leastMargins;  // the companion does not look at it
+    HDC dc;             // out: the printer's; the caller deletes it
+    DWORD flags;        // the library leaves this and all that follows 0,
+    RECT leastMargins;  // and the companion ignores it
     RECT margins;
     HINSTANCE instance;
     LPARAM customData;

@@ -8,19 +8,19 @@ namespace kor {
 
 namespace {
 
-constexpr LONG kHuge = 2048;       // pixels of a font's height
-constexpr LONG kSmall = 256;       // of the font that is looked at instead
-constexpr LONG kMargin = 4;        // of its pixels; hinting moves an edge by one
-constexpr LONG kSideLimit = 8192;  // of the part that is looked at
+constexpr LONG kHuge = 2048;       // font height in pixels
+constexpr LONG kSmall = 256;       // height of the small font that is examined instead
+constexpr LONG kMargin = 4;        // in the small font's pixels; hinting moves an edge by one
+constexpr LONG kSideLimit = 8192;  // of the area that is examined
 
-// A position in the small font's pixels, rounded down.
+// Converts to the small font's pixels, rounding down.
 LONG Reduced(int64_t pixels, LONG height) {
     const int64_t scaled = pixels * kSmall;
     return static_cast<LONG>(scaled / height - (scaled % height < 0 ? 1 : 0));
 }
 
-// Whether a text leaves a mark on a bitmap of this size; true as well when that cannot be found
-// out.
+// Whether a text marks any pixel of a bitmap of this size. Also true when that cannot be
+// determined.
 bool LeavesMark(SIZE size, HFONT font, POINT at, const wchar_t* text, int length) {
     const ScratchBitmap paper(size);
     if (!paper.IsMade()) return true;
@@ -39,7 +39,7 @@ bool MayShowInk(HDC dc, const wchar_t* text, int length, POINT at, const RECT& s
     if (!GetObjectW(GetCurrentObject(dc, OBJ_FONT), sizeof font, &font)) return true;
     const LONG height = font.lfHeight < 0 ? -font.lfHeight : font.lfHeight;
     if (height < kHuge) return true;
-    // The surface as the small text sees it.
+    // The surface in the small font's pixels, relative to the text.
     const auto side = [&](LONG position, LONG origin) {
         return Reduced(static_cast<int64_t>(position) - origin, height);
     };

@@ -13,7 +13,7 @@ namespace {
 
 constexpr int kLongestNumber = 40;
 
-// Place of a character among those of numbers, or -1.
+// Index of a character in kNumberCharacters, or -1.
 int PlaceOf(wchar_t character) {
     if (character >= L'0' && character <= L'9') return character - L'0';
     for (int i = 10; i < kNumberCharacterCount; ++i) {
@@ -22,9 +22,9 @@ int PlaceOf(wchar_t character) {
     return -1;
 }
 
-// A number's characters from left to right.
+// Advance widths of a number's characters, from left to right.
 struct Advances {
-    int count;  // negative when the text is no number, or too long
+    int count;  // negative when the text is not a number, or too long
     int width;
     INT each[kLongestNumber];
 };
@@ -45,8 +45,7 @@ Advances AdvancesOf(const NumberWidths& widths, const wchar_t* text) {
     return found;
 }
 
-// One text, drawn black on white twice, the second time below the first and told how wide its
-// characters are.
+// One text drawn black on white in two rows, the lower one with explicit advance widths.
 class TwoRows {
 public:
     TwoRows(SIZE row, HFONT font, const wchar_t* text, int length, const INT* advances)

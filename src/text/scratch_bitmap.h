@@ -1,4 +1,4 @@
-// A bitmap on which a text is tried out, and whose pixels can be read.
+// A bitmap for trial drawing of texts, whose pixels can be read.
 #pragma once
 
 #include <cstdint>
@@ -7,7 +7,7 @@
 
 namespace kor {
 
-// 32 bits to a pixel, the first row at the top. White once it is made.
+// 32 bits per pixel, top-down, white at first.
 class ScratchBitmap {
 public:
     explicit ScratchBitmap(SIZE size) noexcept : size_(size), dc_(nullptr) {
@@ -32,7 +32,7 @@ public:
     bool IsMade() const noexcept { return isWhite_; }
     HDC dc() const noexcept { return dc_.get(); }
 
-    // What has been drawn so far; of a bitmap that is made.
+    // The pixels drawn so far. Requires IsMade().
     const uint32_t* Pixels() const noexcept {
         FinishDrawing();
         return static_cast<const uint32_t*>(bits_);
@@ -50,7 +50,7 @@ private:
     bool isWhite_ = false;
 };
 
-// The colour of a pixel, without what lies above it.
+// A pixel's colour, without its upper byte.
 constexpr uint32_t ColourOfPixel(uint32_t pixel) { return pixel & 0xFFFFFF; }
 constexpr uint32_t kWhitePixel = 0xFFFFFF;
 

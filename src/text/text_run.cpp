@@ -7,17 +7,17 @@ namespace kor {
 namespace {
 
 constexpr int kPlainLengthLimit = 255;
-// Formats that place one line and do nothing else; DT_VCENTER means nothing without DT_SINGLELINE.
+// Formats that only align a single line; DT_VCENTER has no effect without DT_SINGLELINE.
 constexpr UINT kPlainFormats = DT_LEFT | DT_CENTER | DT_RIGHT | DT_VCENTER | DT_NOPREFIX;
 
-// Latin letters, digits and signs that stand for themselves: nothing that joins, turns the
-// direction or breaks a line, and no prefix mark.
+// Latin letters, digits and signs that stand for themselves: nothing that joins, changes the
+// writing direction or breaks a line, and no prefix character.
 constexpr bool IsPlain(wchar_t character) {
     if (character >= 0x20 && character <= 0x7E) return character != L'&';
     return character >= 0xA1 && character <= 0x17F && character != 0xAD;
 }
 
-// Length of a text whose characters are all plain, else -1.
+// Length of a text of at most kPlainLengthLimit characters, all of them plain; else -1.
 int PlainLength(const wchar_t* text) {
     int length = 0;
     while (length <= kPlainLengthLimit && IsPlain(text[length])) ++length;

@@ -5,8 +5,8 @@
 
 namespace kor {
 
-// A new font: `font` at the current zoom, with its own proportions. The caller deletes it. Null
-// when `font` is null or cannot be read or made.
+// Creates a copy of `font` at the current zoom, with the font's own proportions. The caller deletes
+// it. Null when `font` is null or cannot be read, or when the copy cannot be created.
 HFONT CreateZoomedFont(HFONT font);
 
 }  // namespace kor

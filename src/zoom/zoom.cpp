@@ -6,7 +6,7 @@ constinit uint32_t zoomLevel = kZoomWhole;
 
 int ZoomedFontHeight(int height, uint32_t zoom) {
     const double scaled = (zoom * 0.25) * height;
-    // A zoom beyond all sense must not overflow the number.
+    // An absurd zoom must not overflow the integer.
     constexpr double kLimit = 32767.0;
     if (scaled > kLimit || scaled < -kLimit) return -32767;
     const int truncated = static_cast<int>(scaled);

@@ -1,5 +1,5 @@
-// What the stand-in for the device's library has counted in this process, for benchmarks and tests.
-// It lies in shared memory, so that the library's list of exports stays as it is.
+// Counters of the stand-in for the device's library in this process, for benchmarks and tests. They
+// are in shared memory, so that the library's exports stay as they are.
 #pragma once
 
 #include <windows.h>
@@ -10,14 +10,14 @@
 namespace device {
 
 struct Counters {
-    uint64_t instructions;  // of the guest, those included whose condition did not hold
-    uint64_t softFloat;     // those of them in the helpers for arithmetic that the processor lacks
+    uint64_t instructions;  // of the guest, including those whose condition was false
+    uint64_t softFloat;     // of these, in the helpers for arithmetic that the processor lacks
     uint64_t importCalls;   // calls of the platform by the guest
     uint64_t callbacks;     // calls of the guest by the platform
     uint64_t exportCalls;   // calls of the guest by the program
     uint32_t heapBytes;     // of blocks that the guest has allocated and not freed
-    uint32_t gdiObjects;    // with DCs and image lists, that it has made and not given back
-    uint32_t stackLow;      // the guest's stack in this process; never used words hold kUnusedStack
+    uint32_t gdiObjects;    // including DCs and image lists, created and not released
+    uint32_t stackLow;      // the guest's stack in this process; unused words hold kUnusedStack
     uint32_t stackSize;
 };
 
@@ -30,7 +30,7 @@ inline void CountersName(wchar_t (&name)[kCountersNameCapacity]) {
                GetCurrentProcessId());
 }
 
-// Null where the library is not the device's.
+// Null when the library is not the device's.
 inline const Counters* FindCounters() {
     wchar_t name[kCountersNameCapacity] = L"";
     CountersName(name);

@@ -1,2 +1,2 @@
-// Vector memory of a processor that the device does not have; the platform headers ask for it.
+// Stands in for a header of another processor's vector memory; the platform headers include it.
 #pragma once

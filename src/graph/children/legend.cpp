@@ -29,7 +29,7 @@ constinit bool registered = false;
 struct LegendRecord {
     HINSTANCE instance;
     HWND window;
-    const GraphRecord* graph;  // not owned; null before attachment and after the chart has gone
+    const GraphRecord* graph;  // not owned; null before attachment and after the chart's end
     int32_t firstEntry;
     int32_t entryCount;  // at the last paint
     RecordLife life;
@@ -45,7 +45,7 @@ void DrawSwatch(HDC dc, int top, COLORREF colour) {
     Rectangle(dc, kSwatchLeft, top, kSwatchLeft + kSwatchSide, top + kSwatchSide);
 }
 
-// Entries without a name take no line. Those below the client area are not to be seen.
+// Entries without a name take no line. Entries below the client area are not drawn.
 void DrawEntries(const LegendRecord& legend, HDC dc, SIZE client, int lineHeight) {
     int top = kTextTop;
     for (int i = legend.firstEntry; i < legend.entryCount && top < client.cy; ++i) {
@@ -59,7 +59,8 @@ void DrawEntries(const LegendRecord& legend, HDC dc, SIZE client, int lineHeight
     }
 }
 
-// The count differs from the last paint's: the list begins at its start again.
+// Stores the current number of entries. True if it differs from the last paint's; the list is then
+// scrolled back to its start.
 bool TakeEntryCount(LegendRecord& legend) {
     const int count = EntryCount(*legend.graph);
     if (count == legend.entryCount) return false;
@@ -68,7 +69,9 @@ bool TakeEntryCount(LegendRecord& legend) {
     return true;
 }
 
-// A pie's range is one longer than that of the other types, and so is the refresh a stronger one.
+// Compatibility: a pie's scroll range is one longer than that of the other types
+// (LegendScroll.TooManySlicesHaveTheirNumberAsMaximum). A pie's legend is also invalidated, where
+// that of the other types is only updated.
 void SetUpScrollBar(const LegendRecord& legend, int clientHeight, int pitch) {
     const bool pie = IsPieChart(*legend.graph);
     if (static_cast<int64_t>(pitch) * legend.entryCount > clientHeight) {
@@ -89,8 +92,8 @@ void SetUpScrollBar(const LegendRecord& legend, int clientHeight, int pitch) {
     }
 }
 
-// Default processing may erase what is invalid and take the invalidation away, so it comes before
-// the scroll bar is set up, which may invalidate anew.
+// Default processing may erase what is invalid and then validate it, so it comes before the scroll
+// bar is set up, which may invalidate again.
 LRESULT OnPaint(LegendRecord& legend, WPARAM wParam, LPARAM lParam) {
     bool changed = false;
     int lineHeight = 0;
@@ -107,7 +110,7 @@ LRESULT OnPaint(LegendRecord& legend, WPARAM wParam, LPARAM lParam) {
         }
     }
     const LRESULT result = DefWindowProcW(legend.window, WM_PAINT, wParam, lParam);
-    if (changed && legend.graph) {  // the chart may have gone meanwhile
+    if (changed && legend.graph) {  // the chart may be gone by now
         SetUpScrollBar(legend, ClientRectOf(legend.window).bottom, lineHeight + kLineGap);
     }
     return result;
@@ -123,12 +126,14 @@ LRESULT OnScroll(LegendRecord& legend, int request) {
     case SB_PAGEDOWN:
         if (legend.firstEntry < legend.entryCount - 1) ++legend.firstEntry;
         break;
-    case SB_THUMBPOSITION:  // the thumb always leads back to the start
+    // Compatibility: the thumb always leads back to the start
+    // (LegendScroll.ThumbAlwaysGoesToTheStart).
+    case SB_THUMBPOSITION:
     case SB_THUMBTRACK:
     case SB_TOP: legend.firstEntry = 0; break;
     default: break;
     }
-    if (!legend.window) return 0;  // the platform would repaint every window on the screen
+    if (!legend.window) return 0;  // a null window would repaint every window on the screen
     InvalidateRect(legend.window, nullptr, TRUE);
     UpdateWindow(legend.window);
     return 0;
@@ -200,7 +205,7 @@ bool AttachLegend(HWND hwnd, const GraphRecord* graph) {
     return true;
 }
 
-// The host may have destroyed the legend, and its handle be another window's now.
+// The host may have destroyed the legend, and its handle may be another window's now.
 void DetachLegend(HWND hwnd) {
     if (!IsLegend(hwnd)) return;
     auto* legend = UserDataOf<LegendRecord>(hwnd);

@@ -10,12 +10,12 @@ struct GraphRecord;
 // Registers the class once per process; false when that first call failed.
 bool RegisterLegendClass(HINSTANCE instance);
 
-// Lets a legend read a chart; false, and no change, without a chart or a legend's record. The chart
-// detaches itself before its record goes.
+// Lets a legend read a chart. False, with no change, without a chart or a legend's record. The
+// chart must detach itself before its record is freed.
 bool AttachLegend(HWND legend, const GraphRecord* graph);
 void DetachLegend(HWND legend);
 
-// Pixels from one line to the next in a legend's font, as it is selected in `dc`.
+// Pixels from one line to the next in the legend's font, which is selected in `dc`.
 int LegendLinePitch(HDC dc);
 
 }  // namespace kor

@@ -18,7 +18,7 @@ constexpr UINT kLegendTitleString = 9;
 constexpr int kLegendTitleCapacity = 50;
 constexpr int kBottomGap = 2;
 
-// Height of a client area of so many pixels, rounded up to whole lines.
+// Height of the legend's client area rounded up to whole lines, plus a gap below them.
 int SnappedHeight(HWND legend) {
     WindowDC dc(legend);
     const int line = LegendLinePitch(dc.get());
@@ -34,7 +34,7 @@ void ShowLegend(GraphRecord& graph, const RECT& place) {
     LoadStringW(moduleInstance, kLegendTitleString, title, kLegendTitleCapacity);
     RegisterLegendClass(graph.hInstance);
     const int width = place.right - place.left;
-    graph.isMakingLegend = true;  // creating it sends messages, and a host may ask for one in them
+    graph.isMakingLegend = true;  // creation sends messages in which a host may ask again
     graph.hwndLegend = CreateWindowExW(
         0, KORLEGEND_CLASS, title, WS_CHILD | WS_CAPTION | WS_VSCROLL, place.left, place.top, width,
         place.bottom - place.top, graph.hwnd,
@@ -44,7 +44,7 @@ void ShowLegend(GraphRecord& graph, const RECT& place) {
     POINT bottom = {0, SnappedHeight(graph.hwndLegend)};
     MapWindowPoints(graph.hwndLegend, graph.hwnd, &bottom, 1);
     MoveWindow(graph.hwndLegend, place.left, place.top, width, bottom.y - place.top, TRUE);
-    if (graph.life.retired) return;  // a legend that was taken out of the chart may outlive it
+    if (graph.life.retired) return;  // a legend moved to another parent may outlive the chart
     AttachLegend(graph.hwndLegend, &graph);
     ShowWindow(graph.hwndLegend, SW_SHOW);
 }

@@ -5,8 +5,8 @@
 
 namespace kor {
 
-// Creates the legend at a place in the chart, its height rounded up to whole lines, and shows it.
-// While there is one, nothing happens.
+// Creates the legend in a rectangle of the chart, its height rounded up to whole lines, and shows
+// it. Does nothing if the chart has made one already.
 void ShowLegend(GraphRecord& graph, const RECT& place);
 
 }  // namespace kor

@@ -13,7 +13,7 @@ namespace kor {
 
 namespace {
 
-constexpr uint32_t kCapacity = 128;  // characters; one more is kept for the terminator
+constexpr uint32_t kCapacity = 128;  // characters; one more is allocated for the terminator
 constexpr int kInset = 3;
 
 constinit wchar_t className[] = KORTOOLTIP_CLASS;
@@ -33,7 +33,8 @@ void FreeRecord(ToolTipRecord* tip) {
     DeleteRecord(tip);
 }
 
-// A text of the full capacity is kept whole, a longer one loses one character more than it must.
+// Compatibility: a text of the full capacity is kept whole, but a longer one is truncated to one
+// character less than that (ToolTipPicture.Of129CharactersIsCutTo127).
 void TakeText(ToolTipRecord& tip, const wchar_t* text) {
     const size_t length = wcslen(text);
     const size_t kept = length <= tip.capacity ? length : tip.capacity - 1;
@@ -48,7 +49,7 @@ SIZE MeasureTip(HWND hwnd, const wchar_t* text) {
     return {measured.cx + 2 * kInset, measured.cy + 2 * kInset};
 }
 
-// What a request's numbers come to, within what a coordinate can be.
+// Clamps a position to the range of a coordinate.
 int Coordinate(int64_t pixels) {
     return static_cast<int>(std::clamp<int64_t>(pixels, INT32_MIN, INT32_MAX));
 }
@@ -83,8 +84,8 @@ void DrawTip(const ToolTipRecord& tip, HDC dc) {
     DrawTextW(dc, tip.text, -1, &inside, 0);
 }
 
-// A pending erase happens first: default processing would erase what has been drawn. Who gives a DC
-// does not lose what was to be painted in the window.
+// A pending erase is done first; otherwise default processing would erase what has been drawn.
+// Painting into a caller's DC must not discard the window's own pending update.
 void OnPaint(const ToolTipRecord& tip, HDC given) {
     const bool pending = GetUpdateRect(tip.window, nullptr, FALSE) != 0;
     { PaintScope validate(tip.window); }

@@ -14,7 +14,7 @@ namespace {
 constexpr double kXTickPixels = 50.0;
 constexpr double kYTickPixels = 25.0;
 
-// After any change of an axis' centre or units.
+// To be called after any change of an axis' centre or units.
 void UpdateScale(PixelScale& scale, double centre, double unitsPerPixel) {
     if constexpr (!kHasFloatingPoint) scale = MakePixelScale(centre, unitsPerPixel);
 }
@@ -84,7 +84,7 @@ void Rescale(GraphRecord& graph) {
 
 void AutoRange(GraphRecord& graph, int axis) {
     const bool isBar = graph.chartType == kBar;
-    const bool ofPoints = (axis == KORGRAPH_X) != isBar;  // the axis that counts the points
+    const bool ofPoints = (axis == KORGRAPH_X) != isBar;  // the category axis
     const double low = ofPoints ? graph.xDataMin : graph.yDataMin;
     const double high = ofPoints ? graph.xDataMax : graph.yDataMax;
     if (axis == KORGRAPH_X) {
@@ -102,8 +102,9 @@ void AutoRange(GraphRecord& graph, int axis) {
 
 namespace {
 
-// The category axis of a bar chart takes no range: it follows the largest series, of which every
-// second one is looked at.
+// Compatibility: the category axis of a bar chart ignores the requested range and follows the
+// largest series (GraphBarCategoryRange.IgnoresTheEndsAndFollowsThePoints), of which only every
+// second one counts (GraphBarCategoryRange.LooksAtEverySecondSeriesOnly).
 void SetBarCategoryRange(GraphRecord& graph) {
     int largest = 0;
     for (int i = 0; i < graph.seriesCount; i += 2) {

@@ -1,4 +1,5 @@
-// Where a chart's data stands on its surface, as its record says, and what changes that.
+// The mapping of a chart's data to its surface, as stored in its record, and the functions that
+// change it.
 #pragma once
 
 #include "graph/data/record.h"
@@ -7,7 +8,7 @@
 
 namespace kor {
 
-// The two mappings as they are now, to columns and rows of the image.
+// The two current mappings, to columns and rows of the image.
 Axis XAxis(const GraphRecord& graph);
 Axis YAxis(const GraphRecord& graph);
 
@@ -17,8 +18,8 @@ int yPixel(const GraphRecord& graph, double y);
 
 PieLayout LayoutPie(const GraphRecord& graph);
 
-// Compute an axis' mapping, tick step and bar size from its range, the zoom and the plot area; nothing
-// without a window.
+// Compute an axis' mapping, tick step and bar size from its range, the zoom and the plot area. They
+// do nothing without a window.
 void RescaleX(GraphRecord& graph);
 void RescaleY(GraphRecord& graph);
 void Rescale(GraphRecord& graph);  // both
@@ -27,15 +28,15 @@ void Rescale(GraphRecord& graph);  // both
 void MoveXCentre(GraphRecord& graph, double by);
 void MoveYCentre(GraphRecord& graph, double by);
 
-// `axis` is KORGRAPH_X or KORGRAPH_Y; another number changes nothing.
+// `axis` is KORGRAPH_X or KORGRAPH_Y; any other number changes nothing.
 void AutoRange(GraphRecord& graph, int axis);
 void SetRange(GraphRecord& graph, int axis, double low, double high);
 
-// Scales the zoom: both axes follow.
+// Sets the zoom factor, without its sign, and rescales both axes.
 void SetZoomFactor(GraphRecord& graph, double factor);
 
-// Thickness of one column or bar at the current zoom: zooming out narrows, zooming in does not
-// widen.
+// Thickness of one column or bar at the current zoom. Zooming out narrows it, zooming in does not
+// widen it.
 int ZoomedThickness(const GraphRecord& graph, int thickness);
 
 }  // namespace kor

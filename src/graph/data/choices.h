@@ -1,5 +1,5 @@
-// The chart types and zooms as they stand in combo boxes. An item's place is also its number in the
-// chart's messages.
+// The chart types and zooms in the order of their combo boxes. An item's index is also its number
+// in the chart's messages.
 #pragma once
 
 #include <iterator>
@@ -13,7 +13,7 @@ constexpr double kZoomFactors[] = {0.25, 0.5, 1.0, 2.0};
 constexpr int kZoomCount = static_cast<int>(std::size(kZoomFactors));
 static_assert(std::size(kZoomChoices) == kZoomCount);
 
-// The place of a factor; any that is not there has the last one's.
+// Index of a zoom factor; the last index when it is not in the table.
 constexpr int PlaceOfZoom(double factor) {
     int place = 0;
     while (place < kZoomCount - 1 && kZoomFactors[place] != factor) ++place;

@@ -1,4 +1,4 @@
-// What the legend may know of a chart: its entries, the series or, in a pie, the slices.
+// What the legend sees of a chart: its entries, which are the series or, in a pie, the slices.
 #pragma once
 
 #include "base/runtime.h"
@@ -12,7 +12,7 @@ bool IsPieChart(const GraphRecord& graph);
 
 int EntryCount(const GraphRecord& graph);
 
-// The entry's name, in the chart's memory or in `number`; null for an entry that has none.
+// The entry's name, either in the chart's memory or in `number`; null for an entry without a name.
 const wchar_t* EntryName(const GraphRecord& graph, int entry, wchar_t (&number)[kDecimalCapacity]);
 
 COLORREF EntryColour(const GraphRecord& graph, int entry);

@@ -9,10 +9,12 @@ namespace {
 constexpr int kSeriesColours = 19;
 constexpr int kFirstColour = 2;
 
+// Compatibility: entry 20, one past the 20 colours, is black, and the eighteenth series takes it
+// (GraphPalette.EighteenthSeriesTakesEntry20).
 constexpr COLORREF kColours[] = {
     0x000000, 0xFFFFFF, 0x0000FF, 0x00FF00, 0xFF0000, 0x00FFFF, 0xFF00FF, 0xFFFF00,
     0x000080, 0x008000, 0x800000, 0x008080, 0x800080, 0x808000, 0x8080FF, 0x80FF80,
-    0xFF8080, 0x808080, 0xC0C0C0, 0x000000, 0x000000};  // entry 20: where the grey table begins
+    0xFF8080, 0x808080, 0xC0C0C0, 0x000000, 0x000000};  // entry 20: black, see the comment above
 
 constexpr COLORREF kGreys[] = {0x000000, 0xFFFFFF, 0x808080, 0xC0C0C0, 0x000000, 0x808080,
                                0xC0C0C0, 0x000000, 0x808080, 0xC0C0C0, 0x000000, 0x808080,

@@ -5,18 +5,19 @@
 
 namespace kor {
 
-// Takes the grey table for a device of fewer than 5 bits per pixel, else the colour table. The
-// chart created last decides for all.
+// Selects the grey table for a device of fewer than 5 bits per pixel, else the colour table. The
+// chart created last decides for all charts.
 void ChoosePalette(HDC dc);
 
-// Entry 0 is the foreground, 1 the background, series colours follow. Entries past a table's end
-// are black, up to 20.
+// Entry 0 is the foreground, 1 the background; series colours follow. Entries past a table's end
+// are black.
 COLORREF PaletteEntry(int index);
 
-// So many colours a pie's slices have, one after another and then again.
+// Number of different slice colours in a pie; they repeat in order.
 constexpr int kSliceColours = 15;
 
-// Colour of a pie's slice k, and of the series added as number `count` (1 for the first).
+// Colour of a pie's slice, counted from 0, and of the series added as number `count`, 1 for the
+// first.
 COLORREF SliceColour(int slice);
 COLORREF ColourOfSeriesNumber(int count);
 

@@ -1,7 +1,11 @@
 // The state of one chart, in its window's user data from WM_CREATE to WM_DESTROY.
 //
-// Field order and sizes are binding for 32-bit targets. Pixels are those of the off-screen image,
-// whose origin is the client area's; ends of data ranges are data values.
+// Compatibility: field order and sizes are fixed on 32-bit targets, up to the library's own fields
+// at the end, since programs find the record in the window's user data
+// (GraphRecordLayout.IsTheOneOf32Bits, GraphRecordInWindow.HasItsFieldsInPlaceWith32Bits).
+//
+// Pixels are those of the off-screen image, whose origin is that of the client area. Ends of data
+// ranges are data values.
 #pragma once
 
 #include "base/records.h"
@@ -14,7 +18,7 @@ namespace kor {
 
 enum GraphType : int32_t { kLine = 0, kArea = 1, kBar = 2, kColumn = 3, kPie = 4 };
 
-// One series. Owned by the graph record, and owning its arrays and name.
+// One series. The graph record owns it; it owns its arrays and its name.
 struct GraphSeries {
     int32_t pointCount;
     double* values;  // local heap
@@ -22,7 +26,7 @@ struct GraphSeries {
     double maxValue;
     int32_t minIndex;
     int32_t maxIndex;
-    double absSum;  // of the absolute values; stale after some changes of single values
+    double absSum;  // sum of the absolute values; stale after some changes of single values
     wchar_t* name;  // local heap; null for none
     COLORREF colour;
     POINT* liveBuffer;       // local heap, live mode only; at least three points
@@ -33,11 +37,11 @@ struct Triangle {
     POINT points[3];
 };
 
-// A print under way. It runs inside one message, but its dialog lets others through.
+// The progress of a print. It runs inside one message, but its dialog dispatches others.
 enum class PrintState : int32_t {
     none,
-    underWay,  // the record is the screen's; a second print is refused
-    onPage     // the record stands for the page; only WM_DESTROY may touch it
+    underWay,  // the record describes the screen; a second print is refused
+    onPage     // the record describes the page; only WM_DESTROY may access it
 };
 
 struct GraphRecord {
@@ -56,13 +60,13 @@ struct GraphRecord {
     wchar_t* xAxisTitle;
     wchar_t* yAxisTitle;
     int32_t categoryCount;
-    wchar_t** categoryLabels;  // may be null whatever the count says
+    wchar_t** categoryLabels;  // may be null whatever the count is
     int32_t labelHalfHeight;
     int32_t xTickHalfSpacing;
     int32_t labelMaxWidth;  // half the width of the widest value label; only grows
-    HFONT hfontTitle;       // also hfontXTitle, hfontLabel and hfontAxis
+    HFONT hfontTitle;       // same as hfontXTitle, hfontLabel, hfontAxis
     HFONT hfontXTitle;
-    HFONT hfontYTitle;  // turned to read upwards
+    HFONT hfontYTitle;  // rotated to read upwards
     HFONT hfontLabel;
     HFONT hfontAxis;
     int32_t chartType;
@@ -74,7 +78,7 @@ struct GraphRecord {
     int32_t liveIndex;
     uint8_t xAutoRange;
     uint8_t yAutoRange;
-    alignas(8) double xDataMax;  // doubles lie on multiples of 8 on every target
+    alignas(8) double xDataMax;  // doubles are 8-byte aligned on every target
 
     double yDataMax;
     double xDataMin;
@@ -89,7 +93,7 @@ struct GraphRecord {
     int32_t marginRight;
     int32_t marginTop;
     int32_t xLabelHeight;
-    int32_t tipWidth;  // room for one percentage label; 0 without them
+    int32_t tipWidth;  // room for one percentage label; 0 without labels
     int32_t tipHeight;
     uint32_t panArrows;  // kPan bits of the arrows on screen
     Triangle arrowLeft;
@@ -115,13 +119,13 @@ struct GraphRecord {
     int32_t barWidth;
     int32_t barHeight;
 
-    // The library's own, behind the fields above.
-    HGDIOBJ blankBitmap;        // what hdcMem held at first; back before hbmMem is deleted
-    NumberWidths numberWidths;  // in hfontAxis
-    PixelScale xScale;          // of the mappings above; for processors without floating point
+    // The library's own fields.
+    HGDIOBJ blankBitmap;        // hdcMem's original bitmap; reselected before hbmMem is deleted
+    NumberWidths numberWidths;  // measured in hfontAxis
+    PixelScale xScale;          // the mappings above, for processors without an FPU
     PixelScale yScale;
     PrintState printing;
-    bool paintMissed;  // WM_PAINT came while the record stood for a page
+    bool paintMissed;  // WM_PAINT arrived while the record described a page
     bool sizeMissed;   // WM_SIZE likewise
     bool isMakingLegend;
     RecordLife life;
@@ -134,13 +138,13 @@ constexpr uint32_t kPanDown = 8;
 
 static_assert(sizeof(void*) != 4 || offsetof(GraphRecord, xDataMax) % 8 == 0);
 
-// A record with its initial values and pens, or null when there is no memory.
+// A record with its initial values and pens, or null for lack of memory.
 GraphRecord* CreateGraphRecord();
 
-// Frees the record and all it holds, but no window.
+// Frees the record and all that it owns, but destroys no window.
 void FreeRecord(GraphRecord* graph);
 
-// Ranges and mapping as at the start, automatic again; the zoom stays.
+// Resets ranges and mapping to their initial values, automatic again. The zoom stays.
 void ResetGraphRanges(GraphRecord& graph);
 
 // Whether a KORGRAPH_ option bit is set.
@@ -149,7 +153,7 @@ bool HasOption(const GraphRecord& graph, uint32_t option);
 // The whole image, or page.
 Rect SurfaceOf(const GraphRecord& graph);
 
-// The plot area: the image less its margins, ends exclusive as of a RECT.
+// The plot area: the image less its margins. As in any RECT, right and bottom are exclusive.
 RECT PlotArea(const GraphRecord& graph);
 
 }  // namespace kor

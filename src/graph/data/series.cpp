@@ -13,7 +13,7 @@ namespace kor {
 
 namespace {
 
-// More numbers, points or labels than this would not fit into 31 bits of bytes.
+// The bytes of more values, points or labels than this would not fit into 31 bits.
 constexpr int kMostValues = 0x7FFFFFFF / static_cast<int>(sizeof(double));
 
 constexpr int kLeastLivePoints = 3;
@@ -23,7 +23,7 @@ double* AllocateValues(int count) {
         LocalAlloc(LMEM_FIXED, static_cast<SIZE_T>(count) * sizeof(double)));
 }
 
-// What one pass over values finds. Numbers that are none, or infinite, do not count.
+// What one pass over values finds. NaNs and infinities are skipped.
 struct Extremes {
     double minValue = 0;
     double maxValue = 0;
@@ -32,8 +32,8 @@ struct Extremes {
     double absSum = 0;
 };
 
-// Copies values and finds their extremes on the way: what costs is to go through the memory. `to`
-// may be `from`. Ties keep the first index. The sum is taken in index order.
+// Copies values and finds their extremes in the same pass, because reading the memory is what costs
+// time. `to` may be `from`. Ties keep the first index. The sum is taken in index order.
 Extremes CopyFindingExtremes(double* to, const double* from, int count) {
     int i = 0;
     for (; i < count && !IsFinite(from[i]); ++i) to[i] = from[i];
@@ -47,7 +47,7 @@ Extremes CopyFindingExtremes(double* to, const double* from, int count) {
         const double value = from[i];
         const Comparable compared = ComparableOf(value);
         to[i] = value;
-        if (!(least <= compared && compared <= most)) {  // few are new extremes, or no numbers
+        if (!(least <= compared && compared <= most)) {  // few are new extremes or NaNs
             if (!IsFinite(value)) continue;
             if (compared < least) {
                 least = compared;
@@ -62,7 +62,7 @@ Extremes CopyFindingExtremes(double* to, const double* from, int count) {
     return {to[leastIndex], to[mostIndex], leastIndex, mostIndex, sum};
 }
 
-// Fills the series' array, `from` having as many values.
+// Fills the series' array from one with as many values, and finds its extremes.
 void TakeValues(GraphSeries& series, const double* from) {
     const Extremes found = CopyFindingExtremes(series.values, from, series.pointCount);
     series.minValue = found.minValue;
@@ -72,7 +72,7 @@ void TakeValues(GraphSeries& series, const double* from) {
     series.absSum = found.absSum;
 }
 
-// Copies the values; in live mode the series gets its second buffer as well.
+// Copies the values. In live mode it also allocates the series' second buffer.
 bool InitialiseSeries(GraphSeries& series, int count, const double* values, bool live) {
     series.values = AllocateValues(count);
     if (!series.values) return false;
@@ -84,7 +84,7 @@ bool InitialiseSeries(GraphSeries& series, int count, const double* values, bool
     return series.liveBuffer != nullptr;
 }
 
-// The series keeps its number of points; what is missing becomes 0.
+// The series keeps its number of points; missing values become 0.
 void OverwriteValues(GraphSeries& series, const GraphSeriesData& data) {
     const int copied = std::clamp<int>(data.pointCount, 0, series.pointCount);
     std::copy_n(data.values, copied, series.values);
@@ -122,7 +122,8 @@ bool AppendSeries(GraphRecord& graph, GraphSeries* series) {
     return true;
 }
 
-// What all series span together. The x extent never shrinks here; the least y is never above 0.
+// Finds the extremes of all series together. The x extent never shrinks here; the least y is never
+// above 0.
 void FindDataExtremes(GraphRecord& graph) {
     graph.yDataMax = graph.series[0]->maxValue;
     graph.yDataMin = std::min(graph.series[0]->minValue, 0.0);
@@ -140,7 +141,7 @@ void FollowData(GraphRecord& graph) {
     if (graph.yAutoRange) AutoRange(graph, KORGRAPH_Y);
 }
 
-// Where a rescan begins; 0 where no value counts.
+// The value that a rescan begins with; 0 if no value is finite.
 double FirstFiniteValue(const GraphSeries& series) {
     const double* begin = series.values;
     const double* end = begin + series.pointCount;
@@ -148,7 +149,8 @@ double FirstFiniteValue(const GraphSeries& series) {
     return first == end ? 0.0 : *first;
 }
 
-// The largest value anew. Its index moves only onto a larger value than the first one.
+// Finds the largest value again. Compatibility: its index changes only for a value larger than the
+// first one (GraphSetValue.IndexOfAFirstMaximumIsNotSetByTheScan).
 void RescanMaximum(GraphSeries& series) {
     series.maxValue = FirstFiniteValue(series);
     series.absSum = 0;
@@ -187,7 +189,8 @@ void StoreValue(GraphSeries& series, int index, double value) {
         series.maxValue = value;
         series.maxIndex = index;
     }
-    // A value that is neither extreme leaves the sum as it was.
+    // Compatibility: a value that is neither extreme leaves the sum stale
+    // (GraphSetValue.SumStaysStaleWhenNeitherExtremeChanges).
     if (index == series.maxIndex) {
         RescanMaximum(series);
     } else if (index == series.minIndex) {

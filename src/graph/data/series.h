@@ -1,4 +1,4 @@
-// The chart's data: copies of what the host hands over, their extremes, and category labels.
+// The chart's data: copies of what the host passes, their extremes, and category labels.
 #pragma once
 
 #include <korcontrols/graph.h>
@@ -8,29 +8,32 @@
 
 namespace kor {
 
-// Adds a series; false for null values, a count below 1 or no memory, and nothing is added then.
+// Adds a series. False, with nothing added, for null values, a count below 1 or lack of memory.
 bool AddSeries(GraphRecord& graph, const GraphSeriesData& data);
 
-// Stores one value and keeps the series' extremes. What the chart as a whole spans follows the last
-// added series only; single values do not change it.
+// Stores one value and updates the series' extremes. Compatibility: the extremes of the whole chart
+// are found only when a series is added; single values do not change them
+// (GraphDataExtremes.FollowOnlyTheLastAddedSeries).
 void SetSeriesValue(GraphRecord& graph, const GraphValue& point);
 
-// Copies new values over a series' old ones; its number of points stays.
+// Copies new values over a series' old ones. Its number of points stays.
 void ReplaceSeriesValues(GraphRecord& graph, const GraphSeriesData& data);
 
-// Frees all series and labels. The number of categories stays as it was, although there are none.
+// Frees all series and labels. Compatibility: the number of categories stays, although there are
+// none any more (GraphCategories.CountStaysWhenAllSeriesAreRemoved).
 void RemoveAllSeries(GraphRecord& graph);
 
-// Replaces the category labels; false without memory, with the labels copied so far kept.
+// Replaces the category labels. False for lack of memory; the labels copied so far stay.
 bool SetCategories(GraphRecord& graph, int count, const wchar_t* const* labels);
 
-// The series of an index, or null.
+// The series at an index, or null.
 GraphSeries* SeriesAt(const GraphRecord& graph, int index);
 
 // Colour of a series, or of a slice while the chart is a pie; 0 for a bad index.
 COLORREF SeriesColour(const GraphRecord& graph, int index);
 
-// Whether the series makes a pie: it has values, and they are not all 0.
+// Whether the series makes a pie: it has values, and the sum of their absolute values is above 0
+// and finite.
 bool HasSlices(const GraphSeries* series);
 
 // The slices of a series that has some.

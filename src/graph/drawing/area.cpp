@@ -1,7 +1,7 @@
-// Polygon costs time with each row that any corner spans, seen or not, times the corners. Here each
-// column in view is filled on its own. That gives the same pixels, as the outline is drawn over the
-// fill: it covers each pixel whose centre is nearer than half a pixel to an edge, and the others
-// lie inside or outside by any rule of rounding.
+// Polygon's time grows with the rows that its corners span, visible or not, and with their number.
+// Here each column in view is filled on its own. That gives the same pixels, because the outline is
+// drawn over the fill: it covers each pixel whose centre is less than half a pixel from an edge,
+// and all other pixels lie inside or outside by any rounding rule.
 #include "graph/drawing/area.h"
 
 #include <algorithm>
@@ -10,12 +10,12 @@ namespace kor {
 
 namespace {
 
-// Polygon's time grows with the rows that its corners span, times the square of their number: up to
-// about so many it is the faster way.
+// Polygon's time grows with the rows that its corners span, times the square of their number. Up to
+// about this product it is faster.
 constexpr double kPolygonWork = 5e6;
 
 bool SuitsPolygon(HDC dc, const AreaOutline& outline) {
-    // A printer's driver takes a whole polygon, and its page has very many columns.
+    // A printer driver takes a whole polygon, and a page has very many columns.
     if (GetDeviceCaps(dc, TECHNOLOGY) != DT_RASDISPLAY) return true;
     const auto isHigher = [](const POINT& a, const POINT& b) { return a.y < b.y; };
     const auto [highest, lowest] =
@@ -30,8 +30,8 @@ struct Rows {
     int bottom;
 };
 
-// The rows strictly between the zero line and what the outline covers of a column, which is at
-// least the rows from `highest` down to `lowest`.
+// The rows strictly between the zero line and the outline in one column, where the outline covers
+// at least the rows from `highest` down to `lowest`.
 Rows RowsBetween(int base, int highest, int lowest) {
     if (lowest < base) return {lowest + 1, base};
     if (highest > base) return {base + 1, highest};
@@ -43,7 +43,7 @@ int FloorOf(INT64 numerator, INT64 denominator) {
     return static_cast<int>(quotient * denominator > numerator ? quotient - 1 : quotient);
 }
 
-// Fills columns of a view, joining neighbours of the same rows into one rectangle.
+// Fills columns of a view. Neighbouring columns with the same rows become one rectangle.
 class ColumnFiller {
 public:
     ColumnFiller(HDC dc, const RECT& view) : dc_(dc), view_(view) {}
@@ -51,7 +51,7 @@ public:
     ColumnFiller(const ColumnFiller&) = delete;
     ColumnFiller& operator=(const ColumnFiller&) = delete;
 
-    // Columns come from left to right, none is left out.
+    // Columns must come from left to right, without gaps.
     void Fill(int column, Rows rows) {
         rows.top = std::max(rows.top, static_cast<int>(view_.top));
         rows.bottom = std::min(rows.bottom, static_cast<int>(view_.bottom));
@@ -77,7 +77,7 @@ private:
     int end_ = 0;
 };
 
-// The columns between two corners, both left out: there the outline is a single line.
+// Fills the columns strictly between two corners, where the outline is a single line.
 void FillBetween(ColumnFiller& filler, const RECT& view, int base, POINT from, POINT to) {
     const INT64 run = static_cast<INT64>(to.x) - from.x;
     const INT64 rise = static_cast<INT64>(to.y) - from.y;

@@ -5,13 +5,13 @@
 
 namespace kor {
 
-// A polygon whose first and last corners lie on one row and whose columns never fall.
+// A polygon whose first and last corners lie on one row and whose columns never decrease.
 struct AreaOutline {
-    POINT* corners;  // with one spare place behind them, which is overwritten
+    POINT* corners;  // followed by one spare element, which is overwritten
     int count;
 };
 
-// Fills with the DC's brush and outlines with its pen, pixel for pixel as Polygon does, in time
+// Fills with the DC's brush and outlines with its pen, pixel for pixel as Polygon does. The time is
 // bounded by the pixels of `view`, however many corners there are and however far away they lie.
 void DrawArea(HDC dc, const RECT& view, const AreaOutline& outline);
 

@@ -1,6 +1,6 @@
-// A column is a polygon from the zero line to its value; a bar is the same turned a quarter. Where
-// they have become so thin that several share a pixel, a line from the lowest end to the highest
-// has the pixels of them all.
+// A column is a polygon from the zero line to its value; a bar is the same rotated by 90 degrees.
+// Where they are so thin that several share a pixel position, one line from the lowest end to the
+// highest has the pixels of them all.
 #include "graph/drawing/bars.h"
 
 #include <algorithm>
@@ -16,21 +16,21 @@ namespace kor {
 
 namespace {
 
-// So far outside the view that nothing of a pen is seen.
+// Pixels outside the view, enough that no part of a pen is visible.
 constexpr LONG kBeyond = 2;
 
 // The bars of a chart on its surface.
 struct BarLayout {
     BarAxes axes;
     RECT view;
-    int lowPixel;  // the view along the axis that counts the points
+    int lowPixel;  // the view along the category axis
     int highPixel;
     int thickness;
 };
 
-// A bar from one pixel of the values' axis to another, beginning at a position on the categories'.
-// Sides that lie out of view are moved to just outside it: Polygon's time grows with each row that
-// it spans, seen or not.
+// A bar from one pixel of the value axis to another, starting at a position on the category axis.
+// Sides out of view are clamped to just outside it, because Polygon's time grows with each row that
+// it spans, visible or not.
 void DrawOneBar(HDC dc, const BarLayout& layout, int position, int from, int to) {
     const RECT& view = layout.view;
     const auto corner = [&](int along, int value) -> POINT {
@@ -53,7 +53,7 @@ void DrawThinBarsTogether(HDC dc, const GraphSeries& series, const BarLayout& la
     const double most = series.values[found.highest];
     const int lowEnd = PixelAt(layout.axes.value, std::min(least, 0.0));
     const int highEnd = PixelAt(layout.axes.value, std::max(most, 0.0));
-    if (lowEnd == highEnd) {  // a point; the platform says what that looks like
+    if (lowEnd == highEnd) {  // a single point: the platform decides how it looks
         DrawOneBar(dc, layout, position, lowEnd, highEnd);
         return;
     }
@@ -83,7 +83,7 @@ void DrawThickBars(HDC dc, const GraphSeries& series, const BarLayout& layout, P
 void DrawBarSeries(HDC dc, const GraphSeries& series, const BarLayout& layout, int offset) {
     LocalGdiObject<HBRUSH> brush(CreateSolidBrush(series.colour));
     SelectScope selected(dc, brush.get());
-    // A bar reaches from its offset over its thickness: widen the view by both.
+    // A bar extends from its offset by its thickness, so the view is widened by both.
     const int reach = (offset < 0 ? -offset : offset) +
                       (layout.thickness < 0 ? -layout.thickness : layout.thickness) + 1;
     const PointRange range = PointsBetween(layout.axes.along, series.pointCount,
@@ -95,7 +95,7 @@ void DrawBarSeries(HDC dc, const GraphSeries& series, const BarLayout& layout, i
     }
 }
 
-// A series without values keeps its place in the groups.
+// A series without values keeps its position in the groups.
 void DrawBarsInFrame(GraphRecord& graph, HDC dc, const BarAxes& axes, int thickness) {
     BeginFrame(graph, dc);
     const RECT view = PlotClip(graph);

@@ -21,7 +21,7 @@ void DrawLine(HDC dc, int fromX, int fromY, int toX, int toY) {
     Polyline(dc, ends, 2);
 }
 
-// Draws a pan arrow where there is something to pan to, and remembers it.
+// Draws a pan arrow if there is something to pan to, and records it.
 void DrawArrow(GraphRecord& graph, HDC dc, uint32_t bit, bool shown, Triangle& place,
                const Triangle& triangle) {
     if (!shown) {

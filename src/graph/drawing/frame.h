@@ -1,6 +1,6 @@
-// What all chart types but the pie share around their series: axes with ticks and pan arrows, grid
-// lines, labels, titles, and the clip. Each function draws one element and restores what it
-// selected.
+// What all chart types except the pie draw around their series: axes with ticks and pan arrows,
+// grid lines, labels and titles, and the clipping. Each function draws one element and restores
+// what it selected.
 #pragma once
 
 #include "graph/data/record.h"
@@ -15,7 +15,7 @@ void DrawGraphTitle(const GraphRecord& graph, HDC dc);
 // `bounds` limits the lines; null means the plot area.
 void DrawGridLines(const GraphRecord& graph, HDC dc, const RECT* bounds);
 
-// These two also remember which pan arrows they drew, and where.
+// These two also record which pan arrows they drew, and where.
 void DrawXAxis(GraphRecord& graph, HDC dc);
 void DrawYAxis(GraphRecord& graph, HDC dc);
 
@@ -24,17 +24,17 @@ void DrawYAxisLabels(const GraphRecord& graph, HDC dc);
 void DrawXAxisTitle(const GraphRecord& graph, HDC dc);
 void DrawYAxisTitle(const GraphRecord& graph, HDC dc);
 
-// Clip to an area, and to the whole surface again, with the record's one region.
+// Clip to an area, and to the whole surface again. All use the record's one region.
 void ClipToArea(const GraphRecord& graph, HDC dc, const RECT& area);
 void ClipToPlot(const GraphRecord& graph, HDC dc);
 void ClipToSurface(const GraphRecord& graph, HDC dc);
 
-// What ClipToPlot lets through. In a window smaller than its margins the plot area's sides have
-// changed places; a region's never do.
+// The rectangle that ClipToPlot clips to. When the window is smaller than its margins the plot
+// rectangle is inverted; regions are always normalised.
 RECT PlotClip(const GraphRecord& graph);
 
-// Before the series: background, title and grid lines, and the clip of the plot area. After them:
-// all that lies over them; the window shows it at its next paint.
+// BeginFrame draws what lies below the series (background, title and grid lines) and clips to the
+// plot area. EndFrame draws all that lies over them and invalidates the window.
 void BeginFrame(const GraphRecord& graph, HDC dc);
 void EndFrame(GraphRecord& graph, HDC dc);
 

@@ -28,7 +28,8 @@ void ReplaceBitmap(GraphRecord& graph, int width, int height) {
     graph.hbmMem = bitmap;
 }
 
-// In live mode a part of the width is drawn anew in the window itself.
+// In live mode an area that touches neither the left nor the right edge is drawn in the window
+// itself.
 bool IsLivePart(const GraphRecord& graph, const RECT& area) {
     return HasOption(graph, KORGRAPH_LIVE) && area.left != 0 && area.right != graph.rcPlot.right;
 }
@@ -53,7 +54,7 @@ void PaintFromImage(GraphRecord& graph) {
     } else if (IsLivePart(graph, area)) {
         PaintLiveRect(graph, paint.dc(), area);
     } else {
-        // More than the rectangle; the update region clips what is too much.
+        // This copies more than the rectangle; the update region clips the excess.
         BitBlt(paint.dc(), area.left, area.top, area.right, area.bottom, graph.hdcMem, area.left,
                area.top, SRCCOPY);
     }

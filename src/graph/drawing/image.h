@@ -1,4 +1,4 @@
-// The off-screen image: made in the window's size, copied to the window.
+// The off-screen image: created in the window's size, copied to the window.
 #pragma once
 
 #include "graph/data/record.h"
@@ -8,10 +8,10 @@ namespace kor {
 // Both sizes of the image's bitmap are multiples of 4.
 constexpr int RoundedUpTo4(int pixels) { return (pixels + 3) / 4 * 4; }
 
-// Makes the image for a client size, scales both axes and draws.
+// Creates the image for a client size, rescales both axes and draws.
 void ResizeImage(GraphRecord& graph, int width, int height);
 
-// WM_PAINT's part of the work.
+// Paints the window on WM_PAINT.
 void PaintFromImage(GraphRecord& graph);
 
 }  // namespace kor

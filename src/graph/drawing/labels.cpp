@@ -31,7 +31,7 @@ void DrawNumber(const GraphRecord& graph, HDC dc, double value, const RECT& cell
     DrawNumberText(dc, graph.numberWidths, text, cell, DT_CENTER);
 }
 
-// The categories whose pixels may lie in view: labels stand at whole numbers from 1 on.
+// The categories whose pixels may lie in view: labels stand at the integers from 1 up.
 struct CategoryRange {
     int first;
     int last;
@@ -128,7 +128,8 @@ void DrawXAxisTitle(const GraphRecord& graph, HDC dc) {
         {plot.left, plot.bottom + graph.xLabelHeight + kTitleGap, plot.right, graph.rcPlot.bottom});
 }
 
-// Begins at the middle of the plot and runs upwards; it is not centred.
+// Compatibility: the title begins at the middle of the plot and runs upwards, instead of being
+// centred (GraphTitles.OfTheYAxisBeginsAtTheMiddleAndRunsUp).
 void DrawYAxisTitle(const GraphRecord& graph, HDC dc) {
     if (!HasOption(graph, KORGRAPH_YTITLE) || !graph.yAxisTitle) return;
     SelectScope font(dc, graph.hfontYTitle);

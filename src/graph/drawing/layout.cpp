@@ -42,7 +42,8 @@ int BottomMargin(GraphRecord& graph, HDC dc) {
     return std::max(margin, kLeastMargin);
 }
 
-// Only the upper end of the range is measured: a longer label at the lower end may be clipped.
+// Compatibility: only the upper end of the range is measured, so a longer label at the lower end
+// may be clipped (GraphMargins.OfTheLeftAreMeasuredByTheUpperEndAlone).
 int LeftMargin(GraphRecord& graph, HDC dc) {
     int margin = kTextGap;
     if (HasOption(graph, KORGRAPH_YTITLE) && graph.yAxisTitle) {

@@ -1,11 +1,11 @@
-// Fonts and margins: how much room titles and labels take around the plot area.
+// Fonts and margins: how much room titles and labels need around the plot area.
 #pragma once
 
 #include "graph/data/record.h"
 
 namespace kor {
 
-// Makes the chart's fonts for a device: 10 points high, one of them turned to read upwards.
+// Creates the chart's fonts for a device: 10 points high, one of them rotated to read upwards.
 void CreateGraphFonts(GraphRecord& graph, HDC dc);
 
 // Measures titles and labels on `dc` and sets the margins. The right one never changes.

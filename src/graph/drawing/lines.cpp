@@ -23,7 +23,7 @@ void DrawLineSeries(const GraphRecord& graph, HDC dc, const GraphSeries& series)
     if (graph.chartType == kLine) DrawSeriesMarkers(graph, dc, series);
 }
 
-// The polygon goes down to the zero line below the first and the last point.
+// The polygon begins and ends on the zero line, at the first and the last point.
 void DrawAreaSeries(const GraphRecord& graph, HDC dc, const GraphSeries& series) {
     LocalGdiObject<HBRUSH> brush(CreateSolidBrush(series.colour));
     SelectScope selected(dc, brush.get());
@@ -40,7 +40,7 @@ void DrawAreaSeries(const GraphRecord& graph, HDC dc, const GraphSeries& series)
     const int count = points.count() + 2 * kBasePoint;
     corners[0] = {xPixel(graph, 1), base};
     corners[count - 1] = {xPixel(graph, series.pointCount), base};
-    // DrawArea closes the outline behind its last corner: the second of the spare places there.
+    // DrawArea closes the outline after its last corner, in the second spare element there.
     DrawArea(dc, view, {corners, count});
 }
 
@@ -54,7 +54,7 @@ void DrawLineChart(GraphRecord& graph, HDC dc) {
     EndFrame(graph, dc);
 }
 
-// The first series lies on top.
+// The first series lies on top, so it is drawn last.
 void DrawAreaChart(GraphRecord& graph, HDC dc) {
     BeginFrame(graph, dc);
     for (int i = graph.seriesCount - 1; i >= 0; --i) {

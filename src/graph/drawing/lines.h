@@ -8,7 +8,7 @@ namespace kor {
 void DrawLineChart(GraphRecord& graph, HDC dc);
 void DrawAreaChart(GraphRecord& graph, HDC dc);
 
-// A filled circle on each point, with the pen that is selected and a brush in the series' colour.
+// Draws a filled circle on each point, with the selected pen and a brush in the series' colour.
 void DrawSeriesMarkers(const GraphRecord& graph, HDC dc, const GraphSeries& series);
 
 }  // namespace kor

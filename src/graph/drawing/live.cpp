@@ -16,8 +16,8 @@ namespace {
 constexpr int kSweepPoints = 3;
 enum SweepPoint { kPrevious, kCurrent, kNewest };
 
-// How far the traces reached in the last step of replace mode, for all charts of the process; each
-// is set on its first use.
+// How far the traces reached in the last step of replace mode, one for all charts of the process.
+// `known` is false until the first step.
 struct LastReach {
     bool known;
     LONG top;
@@ -27,7 +27,7 @@ struct LastReach {
 
 constinit LastReach lastReach = {};
 
-// A sweep can begin on an empty chart.
+// A sweep can start on an empty chart, to which this adds a series.
 bool EnsureSeries(GraphRecord& graph) {
     if (graph.seriesCount > 0) return true;
     const double zeros[kSweepPoints] = {};
@@ -53,7 +53,7 @@ void Sweep(GraphRecord& graph) {
     ++graph.liveIndex;
 }
 
-// What the traces of all series reach: largest x and y, smallest y.
+// The extent of the traces of all series: largest x and y, smallest y.
 struct Reach {
     LONG right = -1000000;
     LONG bottom = -1000000;
@@ -61,7 +61,7 @@ struct Reach {
 };
 
 void TraceSeries(const GraphRecord& graph, GraphSeries& series, Reach& reach) {
-    series.livePointCount = series.pointCount;  // liveBuffer was made for as many, or more
+    series.livePointCount = series.pointCount;  // liveBuffer has room for at least this many
     for (int i = 1; i <= series.pointCount; ++i) {
         const POINT point = {xPixel(graph, i), yPixel(graph, series.values[i - 1])};
         series.liveBuffer[i - 1] = point;

@@ -1,5 +1,6 @@
-// The markers of a line. The platform draws one circle; where there are many, its pixels are learnt
-// once, united over all points, and filled as horizontal runs: the same pixels for far fewer calls.
+// The markers of a line. The platform draws single circles. Where there are many, one circle is
+// rasterised once, its pixels are merged over all points, and the result is filled as horizontal
+// runs: the same pixels with far fewer calls.
 #include <algorithm>
 #include <iterator>
 
@@ -18,14 +19,14 @@ namespace {
 
 constexpr int kRadius = 4;
 constexpr int kSide = 2 * kRadius;
-constexpr int kFewPoints = 600;  // up to here the platform's own circles are as quick
+constexpr int kFewPoints = 600;  // up to this many, the platform's own circles are as fast
 
 void DrawCircle(HDC dc, int x, int y) {
     Ellipse(dc, x - kRadius, y - kRadius, x + kRadius, y + kRadius);
 }
 
-// Of each row of the circle's square, the columns that it covers: a bit for each, the lowest for
-// the leftmost. They are neighbours.
+// One mask per row of the marker's bounding box, bit 0 the leftmost column; the set bits are
+// contiguous.
 struct CircleRows {
     uint32_t bits[kSide];
 };
@@ -40,18 +41,18 @@ bool ReadCircleRow(HDC dc, int y, uint32_t& bits) {
     return true;
 }
 
-// Whether the bits that are set are neighbours, or none is.
+// Whether the set bits are contiguous, or none is set.
 constexpr bool IsOneRun(uint32_t bits) { return (bits & (bits + (bits & (0u - bits)))) == 0; }
 static_assert(IsOneRun(0) && IsOneRun(0x3C) && IsOneRun(0xFF) && !IsOneRun(0x42));
 
-// Whether that is a filled circle: what a call that failed leaves is a blank bitmap, a full one or
+// Whether the rows are those of a filled circle. A failed call leaves a blank bitmap, a full one or
 // an outline.
 bool IsCircle(const CircleRows& rows) {
     if (rows.bits[0] == 0 || (rows.bits[0] & 1) != 0) return false;
     return std::all_of(std::begin(rows.bits), std::end(rows.bits), IsOneRun);
 }
 
-// Draws one circle on a scratch bitmap and reads which pixels it has.
+// Draws one circle on a scratch bitmap and reads its pixels back.
 bool ReadCircle(HDC like, CircleRows& rows) {
     MemoryDC dc(like);
     LocalGdiObject<HBITMAP> bitmap(dc.get() ? CreateCompatibleBitmap(like, kSide, kSide) : nullptr);
@@ -67,8 +68,8 @@ bool ReadCircle(HDC like, CircleRows& rows) {
     return IsCircle(rows);
 }
 
-// The result is the same for every screen, so it is learnt once in the process: by the first chart
-// for which nothing fails.
+// The result is the same for every screen, so the circle is rasterised once per process, by the
+// first chart for which no call fails.
 const CircleRows* LearnCircle(HDC like) {
     static constinit CircleRows rows = {};
     static constinit bool learnt = false;
@@ -76,7 +77,7 @@ const CircleRows* LearnCircle(HDC like) {
     return learnt ? &rows : nullptr;
 }
 
-// The pixels of an area that circles cover, a bit for each.
+// The pixels of an area that circles cover, one bit per pixel.
 class Coverage {
 public:
     explicit Coverage(const RECT& area)
@@ -96,7 +97,7 @@ public:
         const uint32_t shift = place % kWordBits;
         const int first = std::max(y - kRadius, static_cast<int>(area_.top));
         const int past = std::min(y - kRadius + kSide, static_cast<int>(area_.bottom));
-        // A circle reaches less than a word out of the area, which has a spare word on each side.
+        // A circle extends less than a word beyond the area, which has a spare word on each side.
         KOR_ASSERT(place / kWordBits + 1 < static_cast<uint32_t>(words_));
         for (int row = first; row < past; ++row) {
             const uint32_t covered = circle.bits[row - (y - kRadius)];
@@ -121,9 +122,10 @@ public:
 
 private:
     static constexpr int kWordBits = 32;
-    static constexpr int kSpareWords = 1;  // on both sides, for circles that reach out of the area
+    static constexpr int kSpareWords = 1;  // on each side, for circles that extend beyond the area
 
-    // The first column from x on that is covered, or is not; the area's end when there is none.
+    // The first column from x on that is covered, or is not covered; the area's right edge if there
+    // is none.
     int FindColumn(const uint32_t* row, int x, bool covered) const {
         const uint32_t other = covered ? 0 : ~0u;
         while (x < area_.right) {
@@ -140,12 +142,12 @@ private:
     }
 
     RECT area_;
-    int words_;  // of each row
+    int words_;  // per row
     uint32_t* bits_;
 };
 
-// Rows of one image column that hold a point: each point counts once however often it comes, and
-// none is looked at when there can be no new one.
+// The rows of one image column that hold a point. Each row counts once, however many points share
+// it, and the search ends when there can be no new row.
 class RowSet {
 public:
     RowSet(int top, int height)
@@ -157,7 +159,7 @@ public:
 
     bool IsMade() const { return rows_ != nullptr; }
 
-    // Begins a column whose points lie between two rows, both included.
+    // Starts a column whose points lie between two rows, both included.
     void Begin(int highest, int lowest) {
         const int first = std::max(highest - top_, 0);
         missing_ = std::min(lowest - top_, height_ - 1) - first + 1;
@@ -180,11 +182,11 @@ public:
 private:
     int top_;
     int height_;
-    int missing_ = 0;  // rows that the column's points can still come to
+    int missing_ = 0;  // rows that the column's points may still reach
     uint8_t* rows_;
 };
 
-// found(y) for each row that holds one of the points [number, end) of a column.
+// Calls found(y) for each row that holds one of the points [number, end) of a column.
 template <typename Found>
 void ForEachNewRow(const ValueTrace& trace, int number, int end, RowSet& rows, Found found) {
     const PositionSummary summary = Summarise(trace.values, number, end);
@@ -213,7 +215,7 @@ bool DrawUnited(HDC dc, const ValueTrace& trace, PointRange range, const RECT& v
     return true;
 }
 
-// Circles are learnt on a screen; a printer draws its own.
+// Circles are rasterised for a screen; a printer draws its own.
 bool IsRasterImage(HDC dc) { return GetDeviceCaps(dc, TECHNOLOGY) == DT_RASDISPLAY; }
 
 }  // namespace

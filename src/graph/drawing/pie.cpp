@@ -29,7 +29,7 @@ void DrawRadius(HDC dc, Point centre, int dx, int dy) {
 
 bool IsSamePoint(Point a, Point b) { return a.x == b.x && a.y == b.y; }
 
-// A pen for each colour of the slices, made when it is first asked for.
+// One pen per slice colour, created on first use.
 class SlicePens {
 public:
     SlicePens() = default;
@@ -51,8 +51,8 @@ private:
     HPEN pens_[kSliceColours] = {};
 };
 
-// The disc of a pie, to be filled slice by slice with horizontal runs. Slices that meet at an angle
-// share no pixel and leave none out.
+// Fills the disc of a pie slice by slice with horizontal runs. Slices that meet at an angle share
+// no pixel and leave no gap.
 class DiscFiller {
 public:
     DiscFiller(HDC dc, const PieLayout& pie) : dc_(dc), pie_(pie) {
@@ -84,9 +84,9 @@ private:
     int32_t* halfWidths_ = nullptr;
 };
 
-// The radius where a slice begins is drawn when the slice is filled, as the fill may have covered
-// it. While slices are so thin that the next one begins at the same pixel, the last of them does
-// that for all: the number of lines depends on the radius, not on the slices.
+// The radius where a slice begins is drawn after the slice is filled, because the fill may have
+// covered it. Where slices are so thin that the next one begins at the same pixel, the last of them
+// draws it for all, so the number of lines depends on the radius, not on the number of slices.
 void DrawSlices(const Slices& slices, HDC dc, const PieLayout& pie) {
     SlicePens pens;
     const DiscFiller disc(dc, pie);
@@ -108,7 +108,7 @@ struct LabelPlace {
     UINT alignment;
 };
 
-// Outwards of the label's point, by the quarter it lies in.
+// A label lies outwards of its point, depending on the quadrant.
 LabelPlace PlaceLabel(const GraphRecord& graph, Point centre, Point at) {
     const int width = graph.tipWidth;
     const int height = graph.tipHeight;
@@ -122,17 +122,17 @@ LabelPlace PlaceLabel(const GraphRecord& graph, Point centre, Point at) {
     return {{at.x, at.y, at.x + width, at.y + height}, DT_LEFT};
 }
 
-// Where labels of thin slices fall on one another. A text that is drawn again on the very same
-// place changes nothing more: at once where pixels have its colour or are left alone, and where
-// they are blended with it after as many times as a channel has values, since each time that
-// changes a pixel darkens it. So what is drawn depends on the places around the pie, not on the
-// slices.
+// Labels of thin slices may fall on one another. Drawing the same text again at the same position
+// soon changes nothing. Where pixels either take the text's colour or are left alone, once is
+// enough. Where they are blended with it, each change darkens a pixel, so there are at most as many
+// changes as a channel has values. So what is drawn depends on the positions around the pie, not on
+// the number of slices.
 class RepeatedLabels {
 public:
     explicit RepeatedLabels(const NumberWidths& widths)
         : limit_(widths.stencil ? 1 : kChannelValues) {}
 
-    // Whether to draw a percentage at a place. Places come in the order of their angles.
+    // Whether to draw a percentage at a position. Positions come in the order of their angles.
     bool IsNeeded(Point at, int percentage) {
         if (percentage < 0 || percentage > kWhole) return true;
         if (!isStarted_ || !IsSamePoint(at, at_)) {
@@ -152,7 +152,7 @@ private:
     int limit_;
     bool isStarted_ = false;
     Point at_ = {};
-    uint8_t drawn_[kWhole + 1] = {};  // of each percentage at this place
+    uint8_t drawn_[kWhole + 1] = {};  // times that each percentage was drawn here
 };
 
 void DrawPercentages(const GraphRecord& graph, const Slices& slices, HDC dc, int radius) {

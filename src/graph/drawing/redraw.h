@@ -1,11 +1,11 @@
-// Drawing the whole chart into its off-screen image.
+// Draws the whole chart into its off-screen image.
 #pragma once
 
 #include "graph/data/record.h"
 
 namespace kor {
 
-// By chart type, into hdcMem; a type there is not draws nothing.
+// By chart type, into hdcMem; an unknown type draws nothing.
 void DrawGraph(GraphRecord& graph);
 
 // The same; does nothing for a chart without a window.

@@ -8,7 +8,7 @@
 
 namespace kor {
 
-// A series as its picture's axes see it; valid as long as its values.
+// A series with the axes of its chart. Valid as long as the series' values.
 ValueTrace TraceOf(const GraphRecord& graph, const GraphSeries& series);
 
 class SeriesPoints {
@@ -18,8 +18,8 @@ public:
     SeriesPoints(const SeriesPoints&) = delete;
     SeriesPoints& operator=(const SeriesPoints&) = delete;
 
-    // Makes the points of a trace for the view between two columns, with `spare` places before and
-    // after them; false without memory.
+    // Makes the points of a trace for the view between two columns, with `spare` elements before
+    // and after them. False for lack of memory.
     bool Make(const ValueTrace& trace, int left, int right, PointsOf shape, int spare);
 
     POINT* begin() { return PlatformPoints(points_ + spare_); }

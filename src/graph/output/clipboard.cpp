@@ -22,7 +22,7 @@ struct PackedDibHead {
 };
 static_assert(sizeof(BITMAPINFOHEADER) == 40 && sizeof(PackedDibHead) == 116);
 
-// Bytes of the rows, each of which is padded to 4.
+// Bytes of the rows, each padded to a multiple of 4.
 constexpr uint32_t ImageBytes(int width, int height) {
     const auto bits = static_cast<uint32_t>(width) * kBitsPerPixel;
     return ((bits + 31) >> 5) * 4 * static_cast<uint32_t>(height);
@@ -46,8 +46,8 @@ RGBQUAD DibColour(COLORREF colour) {
     return {GetBValue(colour), GetGValue(colour), GetRValue(colour), 0};
 }
 
-// The image in the colours of the table; the platform finds the nearest ones. Without a section the
-// bits stay as they are.
+// Copies the image in the colours of the table; the platform picks the nearest ones. If no DIB
+// section can be created the pixels stay zero.
 void ReadImage(HDC image, const BITMAPINFO& info, void* destination, uint32_t bytes) {
     void* bits = nullptr;
     LocalGdiObject<HBITMAP> section(
@@ -78,7 +78,7 @@ uint8_t* MakePackedDib(HDC image, int width, int height, uint32_t size) {
     return dib;
 }
 
-// Null empties the clipboard. It may be in the hands of another program.
+// A null block only empties the clipboard. If another program has it open, nothing changes.
 void PutOnClipboard(HANDLE block) {
     HANDLE taken = nullptr;
     if (OpenClipboard(nullptr)) {

@@ -1,4 +1,4 @@
-// The chart's image for other programs.
+// Copies the chart's image for other programs.
 #pragma once
 
 #include "graph/data/record.h"

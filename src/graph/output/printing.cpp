@@ -1,7 +1,7 @@
-// Drawing is the screen's, so for the time of a page the record stands for the page: hdcMem and
-// rcPlot are the printer's, and fonts, margins and scaling follow from them. Meanwhile the window
-// procedure keeps all messages away from the record; a paint and a new size are made up for after
-// it.
+// A page is drawn with the code that draws the screen. While it is printed, the record describes
+// the page: hdcMem and rcPlot are the printer's, and fonts, margins and scaling follow from them.
+// Meanwhile the window procedure keeps all messages away from the record; a missed paint or change
+// of size is made up for afterwards.
 #include "graph/output/printing.h"
 
 #include "base/windows_helpers.h"
@@ -16,20 +16,21 @@ namespace kor {
 
 namespace {
 
-// Only the fonts follow the printer's resolution. Pens, markers, least margins and ticks are so
-// many pixels here as on the screen, and come out small.
+// Only the fonts follow the printer's resolution. Pens, markers, minimum margins and ticks have the
+// same number of pixels as on the screen, and come out small.
 void BecomePage(GraphRecord& graph, HDC printer) {
     graph.rcPlot = {0, 0, GetDeviceCaps(printer, HORZRES), GetDeviceCaps(printer, VERTRES)};
     graph.hdcMem = printer;
     ClipToSurface(graph, printer);
-    SetBkMode(printer, TRANSPARENT);  // as the off-screen image has it
+    SetBkMode(printer, TRANSPARENT);  // like the off-screen image
     CreateGraphFonts(graph, printer);
     LayoutGraphMargins(graph, printer);
     Rescale(graph);
 }
 
-// Everything is as it was for the screen, whatever a layout or a scaling would give by now: a
-// redraw gives the picture from before. Only the fonts have to be made again.
+// Restores everything as it was for the screen, even where a new layout or scaling would give other
+// values, so that a redraw gives the same picture as before. Only the fonts have to be created
+// again.
 void BecomeScreen(GraphRecord& graph, const GraphRecord& screen) {
     CreateGraphFonts(graph, screen.hdcMem);
     const GraphRecord page = graph;
@@ -46,7 +47,7 @@ void BecomeScreen(GraphRecord& graph, const GraphRecord& screen) {
     ClipToSurface(graph, graph.hdcMem);
 }
 
-// Default processing has validated the window and left the image in its old size.
+// Meanwhile default processing has validated the window and left the image in its old size.
 void CatchUp(GraphRecord& graph) {
     graph.printing = PrintState::underWay;
     if (graph.life.retired) return;
@@ -60,7 +61,8 @@ void CatchUp(GraphRecord& graph) {
 }
 
 void PrintOn(GraphRecord& graph, HDC printer) {
-    // The host enables the window again, when it likes.
+    // Compatibility: the window stays disabled until the host enables it
+    // (PrintProtocol.WindowStaysDisabledUntilTheHostEnablesIt).
     if (graph.hwnd) EnableWindow(graph.hwnd, FALSE);
     BeginPrintJob(printer);
     const GraphRecord screen = graph;
@@ -82,7 +84,7 @@ void PrintGraph(GraphRecord& graph) {
     if (printer && !graph.life.retired) {
         PrintOn(graph, printer);
     } else if (printer) {
-        DeleteDC(printer);  // chosen for a chart that is gone
+        DeleteDC(printer);  // the chart was destroyed meanwhile
     }
     graph.printing = PrintState::none;
 }

@@ -1,12 +1,12 @@
-// A chart on paper.
+// Prints a chart.
 #pragma once
 
 #include "graph/data/record.h"
 
 namespace kor {
 
-// Asks for a printer, draws the chart on one page of it, and leaves the record as it was and the
-// window disabled. The window may go meanwhile.
+// Asks for a printer, prints the chart on one page, and leaves the record as it was and the window
+// disabled. The window may be destroyed meanwhile.
 void PrintGraph(GraphRecord& graph);
 
 }  // namespace kor

@@ -11,7 +11,7 @@ namespace kor {
 
 namespace {
 
-// A range as wide as numbers go has no width that is one; half of it has.
+// The width of a very large range overflows; half of it does not.
 double HalfRange(double low, double high) { return high * 0.5 - low * 0.5; }
 
 double TickStep(double range, double unitsPerPixelBase, double zoom, double tickPixels) {
@@ -50,7 +50,7 @@ Axis Reversed(const Axis& axis) {
 AxisScale ScaleAxis(double low, double high, int extent, double zoom, int seriesCount,
                     double tickPixels) {
     const double range = high - low;
-    const int pixels = std::max(extent, 1);  // a window smaller than its margins
+    const int pixels = std::max(extent, 1);  // a window may be smaller than its margins
     AxisScale scale;
     if (IsFinite(range)) {
         scale.centre = range * 0.5 + low;

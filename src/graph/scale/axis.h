@@ -1,5 +1,5 @@
 // One axis of a chart: a linear mapping of values to pixels, centred on the plot area and scaled by
-// the zoom. Numbers only.
+// the zoom. Arithmetic only.
 #pragma once
 
 #include <cstdint>
@@ -14,7 +14,7 @@ struct Axis {
     double unitsPerPixel;  // above 0, finite
     int32_t centrePixel;
     int32_t sign;
-    const PixelScale* quick;  // of the same mapping, for processors without floating point
+    const PixelScale* quick;  // the same mapping, for processors without an FPU
 };
 
 // The pixel of a value. Monotone, whatever the value.
@@ -26,13 +26,13 @@ double ValueAt(const Axis& axis, int pixel);
 // The axis with all pixels negated: on a reversed y axis pixels grow with the values.
 Axis Reversed(const Axis& axis);
 
-// What follows from a range of values, an extent in pixels and the zoom.
+// The scale that follows from a range of values, an extent in pixels and the zoom.
 struct AxisScale {
     double centre;
     double unitsPerPixelBase;  // at 100 %
     double unitsPerPixel;
     double tickStep;  // may be 0
-    int barSize;      // pixels of one of `seriesCount` bars side by side
+    int barSize;      // thickness in pixels of one of `seriesCount` bars side by side
 };
 
 AxisScale ScaleAxis(double low, double high, int extent, double zoom, int seriesCount,

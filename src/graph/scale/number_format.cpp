@@ -7,7 +7,7 @@ namespace kor {
 
 namespace {
 
-// Platforms print exponents with two digits or three: of three the first goes if it is 0.
+// Platforms print exponents with two or three digits. Removes the first of three if it is 0.
 void ShortenExponent(wchar_t* text) {
     wchar_t* exponent = wcschr(text, L'E');
     if (!exponent) return;

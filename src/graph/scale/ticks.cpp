@@ -9,9 +9,9 @@ namespace kor {
 
 namespace {
 
-// Beyond it neighbouring multiples are one number, and a walk would not move.
+// Beyond it neighbouring multiples are the same double, and a walk would not advance.
 constexpr double kLargestMultiple = 4503599627370496.0;  // 2 to the 52nd
-// No axis shows as many; a step that small against the view draws nothing.
+// No axis shows this many; a step this small relative to the view draws nothing.
 constexpr double kMostTicks = 100000.0;
 constexpr TickRange kNoTicks = {1, 0};
 

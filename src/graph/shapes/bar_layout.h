@@ -1,4 +1,4 @@
-// Where the bars of a column or bar chart stand, for drawing and for the pointer. Numbers only.
+// The geometry of the bars of a column or bar chart, for drawing and hit-testing. Arithmetic only.
 #pragma once
 
 #include "graph/scale/axis.h"
@@ -7,29 +7,29 @@
 
 namespace kor {
 
-// The two axes in the sense of a bar, so that columns and bars are the same: pixels grow with the
-// numbers of the points along one and with the values along the other.
+// The two axes as a bar sees them, so that the same code serves columns and bars. Pixels grow with
+// the point numbers along one axis and with the values along the other.
 struct BarAxes {
     Axis along;
     Axis value;
-    bool upright;  // columns: `along` counts columns, and `value` rows upwards; bars: the reverse
+    bool upright;  // columns: `along` runs right and `value` up; bars: the other way round
 };
 
 inline BarAxes AxesOfColumns(const Axis& x, const Axis& y) { return {x, Reversed(y), true}; }
 inline BarAxes AxesOfBars(const Axis& x, const Axis& y) { return {Reversed(y), x, false}; }
 
-// The image position of a pixel of each axis.
+// The image position of one pixel on each axis.
 constexpr Point PlaceOf(const BarAxes& axes, int along, int value) {
     return axes.upright ? Point{along, -value} : Point{value, -along};
 }
 
-// Where series number `index`, from 0, stands across a group that is centred on its category, in
-// pixels from the category's own.
+// Offset in pixels of the bar of series `index`, counted from 0, from the position of its category,
+// on which the group of bars is centred.
 constexpr int OffsetInGroup(int index, int seriesCount, int thickness) {
     return index * thickness - (seriesCount * thickness) / 2;
 }
 
-// Index of the value whose bar holds an image position, its edges included, or -1.
+// Index of the value whose bar contains an image position, edges included, or -1.
 int FindBar(const BarAxes& axes, const double* values, int count, int offset, int thickness,
             Point at);
 

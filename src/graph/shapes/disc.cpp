@@ -1,9 +1,9 @@
-// Going round counter-clockwise from 12 o'clock, a row above the centre is met twice: its left half
-// on the way to 90 degrees, its right half from 270 on, both from right to left. A row below is met
-// once, from 90 to 270, from left to right. So on each row an angle has one place, a column edge,
-// and a slice is what lies between the places of its two angles. The column of a boundary belongs
-// to the slice on its right, and the circle's own point on the right to none, as spans leave out
-// their last pixel.
+// Counter-clockwise from 12 o'clock, a row above the centre is crossed twice: its left half before
+// 90 degrees, its right half after 270, both from right to left. A row below is crossed once,
+// between 90 and 270 degrees, from left to right. So on each row an angle has one position, a
+// column edge, and a slice is what lies between the positions of its two angles. The column of a
+// boundary belongs to the slice on its right. The circle's own point on the right belongs to no
+// slice, because spans omit their last pixel.
 #include "graph/shapes/disc.h"
 
 #include <algorithm>
@@ -16,7 +16,7 @@ namespace kor {
 namespace {
 
 constexpr double kRadiansPerDegree = 0.017453292519943295;
-constexpr int kSteepExponent = 15;  // such slopes leave every disc on the first row, or nearly so
+constexpr int kSteepExponent = 15;  // so steep that an edge leaves any disc on about the first row
 
 int RoundHalfAway(double value) {
     if (value >= kBeyondDisc) return kBeyondDisc;
@@ -24,8 +24,8 @@ int RoundHalfAway(double value) {
     return static_cast<int>(value >= 0 ? value + 0.5 : value - 0.5);
 }
 
-// Left half of a row above the centre, angles 0 to 90: the first column left of the edge's pixels,
-// as a bound that is exclusive on the right.
+// Left half of a row above the centre, angles 0 to 90: the column of the edge, which is the
+// exclusive right bound of the run to its left.
 int LeftBoundAbove(const SliceEdge& edge, int dy) {
     if (edge.degrees <= 0) return 0;
     if (edge.degrees >= kQuarterTurn) return -kBeyondDisc;
@@ -39,14 +39,14 @@ int RightBoundAbove(const SliceEdge& edge, int dy) {
     return std::max(CrossingOf(edge, dy), 0);
 }
 
-// A row below, angles 90 to 270: the first column that is not before the edge.
+// A row below, angles 90 to 270: the first column at or after the edge.
 int BoundBelow(const SliceEdge& edge, int dy) {
     if (edge.degrees <= kQuarterTurn) return -kBeyondDisc;
     if (edge.degrees >= kThreeQuarterTurns) return kBeyondDisc;
     return CrossingOf(edge, dy);
 }
 
-// The centre's own row: left of the centre at 90 degrees, the rest at 270.
+// The centre's own row: its left half lies at 90 degrees, the rest at 270.
 SliceRow SliceOnCentreRow(const SliceEdge& start, const SliceEdge& end, int halfWidth) {
     const auto holds = [&](double degrees) {
         return start.degrees <= degrees && degrees < end.degrees;

@@ -15,29 +15,29 @@ struct DiscRun {
     int to;
 };
 
-// Half the width of each row of a disc, by a midpoint circle walk: the row `dy` from the centre
-// covers the columns from -halfWidths[|dy|] up to, not including, +halfWidths[|dy|]. The array has
-// room for radius + 1 numbers.
+// Half the width of each row of a disc, by the midpoint circle algorithm. The row `dy` from the
+// centre covers the columns from -halfWidths[|dy|], inclusive, to +halfWidths[|dy|], exclusive. The
+// array has radius + 1 elements.
 void WalkCircle(int radius, int32_t* halfWidths);
 
-// The runs of one slice on one row: two at the most, when a slice lies on both sides of the centre.
+// The runs of one slice on one row: at most two, if the slice lies on both sides of the centre.
 struct SliceRow {
     DiscRun runs[2];
 };
 
-// One edge of a slice: an angle in degrees, from 12 o'clock counter-clockwise, with its slope.
+// One edge of a slice: an angle in degrees, counter-clockwise from 12 o'clock, with its slope.
 struct SliceEdge {
     double degrees;
     double columnsPerRow;  // dx / dy of the radius at that angle
-    int64_t step;          // the same in 2^-32 columns, cut off, or kTooSteep
+    int64_t step;          // the same in units of 2^-32 columns, truncated, or kTooSteep
 };
 
 constexpr int64_t kTooSteep = INT64_MIN;
 
 SliceEdge MakeSliceEdge(double degrees);
 
-// The row `dy` of the slice from one edge to the other within the half width. Every pixel of a disc
-// belongs to exactly one of several slices that follow one another from 0 to 360 degrees.
+// The runs of a slice on row `dy`, from one edge to the other, within the half width. If slices
+// follow one another from 0 to 360 degrees, every pixel of the disc belongs to exactly one of them.
 SliceRow SliceOnRow(const SliceEdge& start, const SliceEdge& end, int dy, int halfWidth);
 
 // Column of the last pixel on the near side of an edge where it crosses the row `dy`, which must

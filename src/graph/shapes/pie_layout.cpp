@@ -13,7 +13,8 @@ constexpr int kBoxGap = 4;
 constexpr double kRadiansPerDegree = 0.017453292519943295;
 constexpr double kDegreesPerRadian = 57.29577951308232;
 
-// The angle is rounded to a double before it is compared, whatever the processor computes with.
+// Angles are rounded to doubles before they are compared, whatever precision the processor computes
+// with.
 double Rounded(double value) {
     volatile double stored = value;
     return stored;

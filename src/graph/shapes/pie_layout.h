@@ -1,4 +1,4 @@
-// Where a pie and its slices stand, for drawing and for the pointer. Numbers only.
+// The geometry of a pie and its slices, for drawing and hit-testing. Arithmetic only.
 #pragma once
 
 #include "graph/shapes/slice_walk.h"
@@ -8,16 +8,17 @@ namespace kor {
 
 // In image pixels.
 struct PieLayout {
-    Rect box;      // square; the outline's
+    Rect box;      // square, around the outline
     Point centre;  // of the pie
     int radius;
 };
 
-// What surrounds the pie takes room from the surface: percentage labels of a size on all sides, and
-// a title above; 0 for none.
+// Fits a pie into the surface, less the room for percentage labels of a given size on all sides and
+// for a title above. 0 stands for none.
 PieLayout LayoutPie(const Rect& surface, Size label, int titleHeight);
 
-// Centre of the surface. Percentage labels are measured from it, not from the pie's own centre.
+// Centre of the surface. Compatibility: percentage labels and hits are measured from it, not from
+// the pie's own centre (GraphPie.LabelsAreMeasuredFromTheClientCentre).
 constexpr Point CentreOf(const Rect& surface) {
     return {(surface.left + surface.right) >> 1, (surface.top + surface.bottom) >> 1};
 }
@@ -26,7 +27,7 @@ constexpr Point CentreOf(const Rect& surface) {
 struct Slices {
     const double* values;
     int count;
-    double absSum;  // of the absolute values; above 0 and finite
+    double absSum;  // sum of the absolute values; above 0 and finite
 };
 
 // A slice's share of the pie, 0 to 1.
@@ -35,22 +36,23 @@ double ShareOf(const Slices& slices, int slice);
 // Index of the slice at an image position, or -1. `radius` is the pie's.
 int FindSlice(const Slices& slices, Point surfaceCentre, int radius, Point at);
 
-// Rotates a vector, in place: at 90 degrees (0, -1), straight up, points to the left.
+// Rotates a vector in place. 90 degrees turn (0, -1), straight up, to the left.
 void RotateVector(double& dx, double& dy, double degrees);
 
-// The end of a radius, from the centre, in whole pixels.
+// The end of a radius relative to the centre, truncated to whole pixels.
 Point RadiusEnd(int radius, double degrees);
 
 // Where one slice ends and the next one begins. sin, cos and tan are expensive without a
 // floating-point unit, so adjacent slices share a Boundary.
 struct Boundary {
     SliceEdge edge;
-    Point end;  // of its radius, from the centre
+    Point end;  // of its radius, relative to the centre
 };
 
 Boundary BoundaryAt(int radius, double degrees);
 
-// Rows that hold pixels of a slice, and some more: from the centre to its arc, within the radius.
+// The rows that contain pixels of a slice, plus a few spare ones: from the centre to its arc,
+// clamped to the radius.
 RowRange RowsOfSlice(int radius, const Boundary& start, const Boundary& end);
 
 }  // namespace kor

@@ -9,7 +9,7 @@ namespace kor {
 
 namespace {
 
-// The first number in [low, high) whose position is at least `pixel`; high when there is none.
+// The first point number in [low, high) whose position is at least `pixel`, or high.
 int FirstAtOrPast(const Axis& along, int low, int high, int pixel) {
     while (low < high) {
         const int middle = low + (high - low) / 2;
@@ -22,8 +22,8 @@ int FirstAtOrPast(const Axis& along, int low, int high, int pixel) {
     return low;
 }
 
-// NaNs and infinities have no point: the line goes on to the next finite value, even far outside
-// the view, and ends at the last.
+// NaNs and infinities have no point. A line runs on to the next finite value, even far outside the
+// view, and ends at the last one.
 PointRange WithNumbersAtEnds(const ValueTrace& trace, PointRange range) {
     const double* values = trace.values;
     while (range.first > 1 && !IsFinite(values[range.first - 1])) --range.first;
@@ -54,7 +54,8 @@ void PositionWalk::Next() {
     if (!IsAtEnd()) FindEnd(number_ + length);
 }
 
-// Positions are evenly spread, so each has as many points as the one before, or one more or less.
+// Points are evenly spaced, so each position has as many points as the one before it, or one more
+// or less.
 void PositionWalk::FindEnd(int expected) {
     low_ = number_;
     end_ = range_.last + 1;
@@ -67,7 +68,7 @@ void PositionWalk::FindEnd(int expected) {
     while (end_ - low_ > 1) Try(low_ + (end_ - low_) / 2);
 }
 
-// Narrows the place of the end by a point between the two that are known.
+// Narrows the search for the end by a point between the two known ones.
 void PositionWalk::Try(int number) {
     const int pixel = PixelAt(along_, number);
     if (pixel == pixel_) {
@@ -87,7 +88,7 @@ PositionSummary Summarise(const double* values, int number, int end) {
     PositionSummary found = {i, i, i, end - 2};
     for (++i; i < end - 1; ++i) {
         const Comparable value = ComparableOf(values[i]);
-        if (least <= value && value <= most) continue;  // nearly always, so nothing else is asked
+        if (least <= value && value <= most) continue;  // nearly always, so it comes first
         if (!IsFinite(values[i])) continue;
         if (value < least) {
             least = value;
@@ -103,7 +104,7 @@ PositionSummary Summarise(const double* values, int number, int end) {
 
 namespace {
 
-// Appends to an array that has room for all.
+// Appends points to an array that has room for all of them.
 class PointWriter {
 public:
     PointWriter(const ValueTrace& trace, Point* points, int capacity)
@@ -126,8 +127,9 @@ private:
     int count_ = 0;
 };
 
-// The first and the last point, and between them each extreme that lies beyond both. Those are all
-// different points, even where values tie: so at most four, and never more than there are.
+// The first and the last point, and between them each extreme that lies beyond both. These are
+// distinct points even where values tie, so there are at most four, and never more than the
+// position has.
 void PointWriter::AppendPosition(int column, int number, int end) {
     const PositionSummary found = Summarise(trace_.values, number, end);
     if (found.first < 0) return;
@@ -136,7 +138,7 @@ void PointWriter::AppendPosition(int column, int number, int end) {
     const Comparable last = valueOf(found.last);
     const bool reachesLower = valueOf(found.lowest) < std::min(first, last);
     const bool reachesHigher = valueOf(found.highest) > std::max(first, last);
-    // Either way over both extremes has the same pixels; this is the shorter one.
+    // Both orders of the extremes give the same pixels; this one is the shorter path.
     const bool highestFirst = first > last;
     Append(column, found.first);
     if (reachesHigher && highestFirst) Append(column, found.highest);
@@ -171,9 +173,9 @@ PointRange RangeInView(const ValueTrace& trace, int left, int right) {
 
 int PointCapacity(PointRange range, int left, int right) {
     constexpr int kPointsPerPosition = 4;  // see AppendPosition
-    constexpr int kPointsAtTheEnd = 2;     // those that AppendLastPosition appends itself
+    constexpr int kPointsAtTheEnd = 2;     // appended by AppendLastPosition itself
     const int all = std::max(range.last - range.first + 1, 0);
-    // Positions with values: those from `left` to `right`, and one on either side.
+    // Positions with points: those from `left` to `right`, and one on either side.
     const int positions = std::max(right - left, 0) + 1 + 2;
     return std::min(all, positions * kPointsPerPosition + kPointsAtTheEnd);
 }

@@ -1,6 +1,6 @@
-// A series as the points that its picture needs. A picture has only so many pixels, so of the
-// points in one pixel column only four matter: the first, the lowest, the highest and the last.
-// NaNs and infinities have no point. Numbers only.
+// Reduces a series to the points that its picture needs. Of the points in one pixel column only
+// four matter: the first, the lowest, the highest and the last. NaNs and infinities have no point.
+// Arithmetic only.
 #pragma once
 
 #include "graph/scale/axis.h"
@@ -8,17 +8,18 @@
 
 namespace kor {
 
-// Points by number, from 1, both ends included; empty when last < first.
+// A range of point numbers, counted from 1, both ends included; empty when last < first.
 struct PointRange {
     int first;
     int last;
 };
 
-// The points of `count` whose positions lie between two pixels of the axis that counts the points,
-// and one more on each side. Pixels grow with the numbers; for rows give the axis reversed.
+// The points, of `count`, whose positions lie between two pixels of the category axis, and one more
+// on each side. Pixels must grow with the point numbers: for rows pass the reversed axis.
 PointRange PointsBetween(const Axis& along, int count, int lowPixel, int highPixel);
 
-// The points of a range that share a position, one position after the other.
+// Visits the pixel positions of a range of points, one after the other, each with the points that
+// share it.
 class PositionWalk {
 public:
     PositionWalk(const Axis& along, PointRange range);
@@ -39,12 +40,11 @@ private:
     int pixel_ = 0;
     int number_;
     int end_;
-    int low_ = 0;       // while the end is looked for: a point of this position,
-    int endPixel_ = 0;  // and the position of the point at the end
+    int low_ = 0;       // during the search for the end: a point of this position,
+    int endPixel_ = 0;  // and the pixel of the point at the end
 };
 
-// Points with numbers [number, end) that stand for all of them, by index into the values; -1 for
-// none.
+// The points that represent all points [number, end), as indexes into the values; -1 for none.
 struct PositionSummary {
     int first;
     int lowest;
@@ -54,11 +54,11 @@ struct PositionSummary {
 
 PositionSummary Summarise(const double* values, int number, int end);
 
-// What is drawn with the points. A polyline leaves out its very last pixel, unless it has been
-// there before; a polygon is closed.
+// What is drawn with the points. A polyline omits its final pixel unless an earlier segment has
+// drawn it; a polygon is closed.
 enum class PointsOf { polyline, polygon };
 
-// Values against their numbers, from 1. Owns nothing.
+// Values against their point numbers, counted from 1. Owns nothing.
 struct ValueTrace {
     Axis x;
     Axis y;
@@ -66,11 +66,11 @@ struct ValueTrace {
     int count;
 };
 
-// The points for a view between two columns: from the one before the view to the one behind it, the
-// ends being finite.
+// The points for a view between two columns: from the one before the view to the one after it, both
+// with finite values.
 PointRange RangeInView(const ValueTrace& trace, int left, int right);
 
-// The most points that FillPoints makes of the range.
+// The maximum number of points that FillPoints writes for the range.
 int PointCapacity(PointRange range, int left, int right);
 
 // Writes the points of a line or an area in image pixels, in order, and returns how many.

@@ -1,4 +1,4 @@
-// A slice of a disc on consecutive rows, as SliceOnRow has it, by additions of whole numbers.
+// A slice of a disc on consecutive rows, with the results of SliceOnRow, by integer additions.
 #pragma once
 
 #include <algorithm>
@@ -15,10 +15,10 @@ struct RowRange {
 
 // The columns in which an edge crosses one row after another, downwards.
 //
-// CrossingOf multiplies doubles. Adding the slope up in whole numbers gives the same except next to
-// a half, where the rounding of the doubles decides: there, once in 30,000 rows, they are asked.
-// The sum is off by at most one unit of 2^-32 columns for each row, and the doubles by less than
-// 2^10.
+// CrossingOf multiplies doubles. Adding up the slope in integers gives the same results except next
+// to a half, where the rounding of the doubles decides. There, once in 30,000 rows, CrossingOf is
+// called. The sum is off by at most one unit of 2^-32 columns per row, and the double by less than
+// 2^10 units.
 class EdgeWalk {
 public:
     EdgeWalk(const SliceEdge& edge, RowRange rows) : edge_(&edge), row_(rows.first) {
@@ -50,18 +50,19 @@ private:
     const SliceEdge* edge_ = nullptr;
     int row_ = 0;
     int64_t step_ = 0;
-    int64_t position_ = 0;  // plus a half; as 0 it has the doubles asked
+    int64_t position_ = 0;  // fixed point, 32.32, plus one half; 0 forces the floating-point path
 };
 
 // Which part of a row: all of it, or one side of the centre.
 enum class RowPart { whole, left, right };
 
-// take(dy, run) for what lies between two edges on part of each row and within the half widths.
+// Calls take(dy, run) for what lies between two edges on one part of each row, within the half
+// widths.
 template <typename Take>
 void WalkBetween(EdgeWalk from, EdgeWalk to, RowRange rows, const int32_t* halfWidths, RowPart part,
                  Take take) {
     for (int dy = rows.first; dy <= rows.last; ++dy) {
-        // `halfWidths` reaches as far as the rows, which RowsOfSlice keeps within the radius.
+        // `halfWidths` covers all rows, because RowsOfSlice keeps them within the radius.
         const int halfWidth = halfWidths[dy < 0 ? -dy : dy];
         const DiscRun run = {std::max(from.column(), part == RowPart::right ? 0 : -halfWidth),
                              std::min(to.column(), part == RowPart::left ? 0 : halfWidth)};
@@ -71,7 +72,7 @@ void WalkBetween(EdgeWalk from, EdgeWalk to, RowRange rows, const int32_t* halfW
     }
 }
 
-// take(dy, run) for the runs of the slice on these rows that are not empty.
+// Calls take(dy, run) for each run of the slice on these rows that is not empty.
 template <typename Take>
 void WalkSlice(const SliceEdge& start, const SliceEdge& end, RowRange rows,
                const int32_t* halfWidths, Take take) {

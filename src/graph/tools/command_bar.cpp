@@ -41,7 +41,7 @@ void HandOverToolTips(HWND bar) {
     SetCommandBarToolTips(bar, kToolTipCount, toolTips);
 }
 
-// An item's data is its place.
+// An item's data is its index in the array.
 template <int count>
 void AddItems(HWND combo, const wchar_t* const (&texts)[count]) {
     for (int i = 0; i < count; ++i) {
@@ -91,7 +91,7 @@ extern "C" DWORD KORCONTROLS_API SetupGraphCommandBar(HINSTANCE instance, HWND c
     if (added) AddCommandBarButtons(commandBar, buttons, added);
     HWND typeCombo = InsertTypeCombo(commandBar, instance, typeComboId, added);
     if (typeComboOut) *typeComboOut = typeCombo;
-    // At the same position, so that it comes to stand before the chart types.
+    // Inserted at the same position, so that it ends up before the chart types.
     HWND zoomCombo = InsertZoomCombo(commandBar, instance, zoomComboId, added);
     if (zoomComboOut) *zoomComboOut = zoomCombo;
     HandOverToolTips(commandBar);

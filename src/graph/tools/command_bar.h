@@ -3,7 +3,8 @@
 
 namespace kor {
 
-// The first button shows the chart or, while that is to be seen, the grid; its tooltip says so.
+// The first button shows the chart or, while the chart is visible, the grid. Its tooltip says
+// which.
 void ReloadShowGraphToolTip(bool isGraphShown);
 
 }  // namespace kor

@@ -1,4 +1,4 @@
-// The page of the shown ranges, the chart type and the zoom.
+// The property page for the shown ranges, the chart type and the zoom.
 #include <korcontrols/graph.h>
 
 #include "graph/data/choices.h"
@@ -16,8 +16,9 @@ constexpr int kXMaxEdit = 1008;
 constexpr int kTypeCombo = 1010;
 constexpr int kZoomCombo = 1011;
 
-// The selection that was applied last, of either combo box. With one value for both, the type and
-// the zoom are sent again on most applies; hosts see and expect that.
+// The selection that was applied last, of either combo box. Compatibility: there is one value for
+// both, so the type and the zoom are sent again on most applies
+// (TypeAndZoom.AreSentAgainWheneverTheyDiffer).
 constinit int lastSelection = 0;
 
 void FillNumber(HWND page, int editId, double value) {
@@ -52,9 +53,9 @@ double NumberIn(HWND page, int editId) {
     return NumberFromText(text);
 }
 
-// True when one of the two edits was changed, also when the range is then refused. An end that was
-// not typed is taken from the x range whatever the axis: typing only the upper end of y sends the
-// x range's lower end with it, which hosts rely on.
+// True if one of the two edits was changed, even if the range is then refused. Compatibility: an
+// end that was not typed is taken from the x range, whatever the axis, so typing only the upper end
+// of y sends the x range's lower end with it (RangeEdits.AYEndThatWasNotTypedIsTheXRanges).
 bool ApplyRange(HWND page, HWND graph, LONG axis, int minEdit, int maxEdit) {
     const bool isMinTyped = IsEdited(page, minEdit);
     const bool isMaxTyped = IsEdited(page, maxEdit);
@@ -69,7 +70,7 @@ bool ApplyRange(HWND page, HWND graph, LONG axis, int minEdit, int maxEdit) {
     return true;
 }
 
-// Sends a combo box's selection if it is another than the one applied last.
+// Sends a combo box's selection if it differs from the one applied last.
 bool ApplyChoice(HWND page, HWND graph, int comboId, UINT setter) {
     const auto selection = static_cast<int>(SendDlgItemMessageW(page, comboId, CB_GETCURSEL, 0, 0));
     if (selection == CB_ERR || selection == lastSelection) return false;
@@ -82,7 +83,7 @@ void Apply(HWND page) {
     HWND graph = GraphOfPage(page);
     bool isChanged = ApplyRange(page, graph, KORGRAPH_X, kXMinEdit, kXMaxEdit);
     isChanged |= ApplyRange(page, graph, KORGRAPH_Y, kYMinEdit, kYMaxEdit);
-    if (!IsWindow(page)) return;  // gone while a range was refused in a box
+    if (!IsWindow(page)) return;  // destroyed while a message box was open
     isChanged |= ApplyChoice(page, graph, kTypeCombo, GM_SETTYPE);
     isChanged |= ApplyChoice(page, graph, kZoomCombo, GM_SETZOOM);
     if (isChanged) KorGraph_Redraw(graph);

@@ -25,7 +25,7 @@ GraphRange RangeOf(HWND graph, LONG axis) {
     return range;
 }
 
-// Without flags the tab shows the dialog's caption, not the title.
+// Because no flags are set, the tab shows the dialog's caption, not the title.
 HPROPSHEETPAGE CreatePage(int dialog, const wchar_t* title, DLGPROC procedure, HWND graph) {
     PROPSHEETPAGEW page = {};
     page.dwSize = PROPSHEETPAGEW_V1_SIZE;

@@ -1,18 +1,18 @@
-// The property sheet "Graph Properties" and what its two pages share. The pages know a chart by its
-// window alone and talk to it in its messages, as a host does.
+// The property sheet "Graph Properties" and what its two pages share. The pages know a chart only
+// by its window and control it with its messages, as a host does.
 #pragma once
 
 #include "platform/platform.h"
 
 namespace kor {
 
-// Runs the sheet until the user closes it. The chart may be gone by then.
+// Runs the sheet until the user closes it. The chart may be destroyed by then.
 void RunGraphProperties(HWND graph);
 
 INT_PTR CALLBACK TitlesPageProc(HWND page, UINT message, WPARAM wParam, LPARAM lParam);
 INT_PTR CALLBACK DataPageProc(HWND page, UINT message, WPARAM wParam, LPARAM lParam);
 
-// Room for what is read from an edit control.
+// Capacity of a buffer for an edit control's text, terminator included.
 constexpr int kEditTextCapacity = 512 + 1;
 
 bool IsEdited(HWND page, int editId);
@@ -30,7 +30,7 @@ struct PageActions {
 // The dialog procedure of every page.
 INT_PTR AnswerPage(const PageActions& actions, HWND page, UINT message, LPARAM lParam);
 
-// What the chart shows, from its messages; 0.0 from a window that does not answer them.
+// What the chart shows, read with its messages; 0.0 from a window that does not handle them.
 double GraphXMin(HWND graph);
 double GraphXMax(HWND graph);
 double GraphYMin(HWND graph);

@@ -1,4 +1,4 @@
-// The page of the chart's and the axes' titles.
+// The property page for the titles of the chart and the axes.
 #include <korcontrols/graph.h>
 
 #include "base/gdi_scopes.h"
@@ -18,9 +18,10 @@ constexpr TitleEdit kTitleEdits[] = {{1002, GM_GETTITLE, GM_SETTITLE},
                                      {1003, GM_GETXTITLE, GM_SETXTITLE},
                                      {1004, GM_GETYTITLE, GM_SETYTITLE}};
 
-constexpr WPARAM kTypedCharacters = 20;  // at most; a longer title of the host is shown whole
+constexpr WPARAM kTypedCharacters = 20;  // at most; a longer title set by the host is shown whole
 
-// In the middle of the screen's upper edge, clear of an input panel at the lower one.
+// Moves the sheet to the middle of the screen's upper edge, clear of an input panel at the lower
+// edge.
 void PlaceSheet(HWND page) {
     WindowDC dc(page);
     if (!dc.get()) return;

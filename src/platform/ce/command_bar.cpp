@@ -1,4 +1,4 @@
-// The command bar of the common controls, which answers each of the calls by itself.
+// The command bar of the common controls, which supports each of the calls itself.
 #include "platform/command_bar.h"
 
 namespace kor {
@@ -6,14 +6,14 @@ namespace kor {
 namespace {
 
 extern "C" {
-// The last two are the size of an image; 0 for the default, 16.
+// The last two are the size of an image in pixels; 0 for the default, 16.
 int CommandBar_AddBitmap(HWND bar, HINSTANCE instance, int bitmapId, int imageCount, int width,
                          int height);
 HWND CommandBar_InsertComboBox(HWND bar, HINSTANCE instance, int width, UINT style, WORD id,
                                WORD position);
 }
 
-constexpr UINT kAddButtons = WM_USER + 20;   // TB_ADDBUTTONS, which has one number here
+constexpr UINT kAddButtons = WM_USER + 20;   // TB_ADDBUTTONS, which has only this number here
 constexpr UINT kSetToolTips = WM_USER + 81;  // TB_SETTOOLTIPS, another message on the desktop
 
 }  // namespace

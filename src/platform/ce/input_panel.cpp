@@ -1,4 +1,4 @@
-// The soft input panel, by the shell library.
+// The soft input panel, through the shell library.
 #include "platform/input_panel.h"
 
 #include "platform/platform.h"

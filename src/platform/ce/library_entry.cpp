@@ -1,5 +1,5 @@
-// What Windows CE's loader calls. There is no start-up code in between: the library has nothing
-// that must run at load but what OnLibraryEvent does.
+// The entry point that Windows CE's loader calls. There is no start-up code in between: nothing
+// must run at load except OnLibraryEvent.
 #include "base/module.h"
 
 extern "C" BOOL DllEntry(HINSTANCE instance, DWORD reason, void*) {

@@ -1,6 +1,6 @@
-// Numbers as text by the core library. Its swprintf takes no capacity, unlike the one that the
-// headers declare, and its wcstod has a replacement there; so both are declared here by their
-// names.
+// Number formatting and parsing by the core library. Its swprintf takes no capacity, unlike the one
+// that the headers declare, and the headers replace its wcstod. So both are declared here by their
+// symbol names.
 #include "platform/number_text.h"
 
 namespace kor {
@@ -12,7 +12,7 @@ int CoreFormat(wchar_t* text, const wchar_t* format, ...) __asm__("swprintf");
 double CoreNumber(const wchar_t* text, wchar_t** rest) __asm__("wcstod");
 }
 
-// A sign, the digits with a point, "E", and a signed exponent of three digits.
+// Leaves room for a sign, a point, "E", a signed exponent of three digits and the terminator.
 constexpr int kDigitsLimit = kNumberTextCapacity - 8;
 
 }  // namespace

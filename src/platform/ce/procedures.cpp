@@ -4,7 +4,7 @@ namespace kor {
 
 namespace {
 
-// The desktop's headers lack it: there, names of functions are narrow.
+// The desktop's headers lack it: function names are narrow there.
 extern "C" FARPROC GetProcAddressW(HMODULE module, const wchar_t* name);
 
 }  // namespace

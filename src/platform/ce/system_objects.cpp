@@ -1,4 +1,4 @@
-// System colours on Windows CE, whose calls know the flag; drawing is never put off.
+// System colours on Windows CE, whose calls take the flag; drawing is never deferred.
 #include "platform/platform.h"
 
 namespace kor {

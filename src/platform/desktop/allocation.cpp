@@ -1,5 +1,5 @@
-// The DLL's own global allocation operators, over the platform's C runtime. Out of memory they
-// answer null; sources are compiled with -fcheck-new, so that callers may test for it.
+// The DLL's own global allocation operators, on top of the platform's C runtime. They return null
+// when there is no memory; sources are compiled with -fcheck-new, so that callers may test for it.
 #include <cstddef>
 #include <cstdlib>
 #include <new>

@@ -1,5 +1,5 @@
-// A command bar in terms of the desktop's toolbar: a combo box stands over a separator of its
-// width, which carries its id and, as data, its window.
+// A command bar on the desktop's toolbar: a combo box lies over a separator that leaves room for
+// it. The separator carries the combo box's id and, as its data, the window handle.
 #include "platform/command_bar.h"
 
 namespace kor {
@@ -7,14 +7,14 @@ namespace kor {
 namespace {
 
 constexpr int kGapBesideCombo = 4;   // pixels between a combo box and each of its neighbours
-constexpr int kDroppedHeight = 150;  // of a combo box with its open list
+constexpr int kDroppedHeight = 150;  // pixels, of a combo box with its list open
 constexpr UINT kSetToolTips = WM_USER + 81;
 constexpr wchar_t kToolTipsProperty[] = L"korcontrols tooltips";
 constexpr int kClassNameCapacity = 32;
 
 int ButtonCount(HWND bar) { return static_cast<int>(SendMessageW(bar, TB_BUTTONCOUNT, 0, 0)); }
 
-// The combo box that stands over a button, null over any but its separator.
+// The combo box over a separator; null for any other button.
 HWND ComboOver(HWND bar, int position) {
     TBBUTTON button = {};
     if (!SendMessageW(bar, TB_GETBUTTON, static_cast<WPARAM>(position),
@@ -37,7 +37,7 @@ void PlaceOver(HWND bar, int position, HWND combo) {
                  SWP_NOSIZE | SWP_NOZORDER | SWP_NOACTIVATE);
 }
 
-// An insertion moves everything behind it.
+// An insertion moves everything to the right of it.
 void PlaceAllCombos(HWND bar) {
     const int count = ButtonCount(bar);
     for (int position = 0; position < count; ++position) {
@@ -93,9 +93,9 @@ HWND InsertCommandBarComboBox(HWND bar, HINSTANCE instance, int width, DWORD sty
     return combo;
 }
 
-// The toolbar's own procedure takes the number for TB_INSERTMARKHITTEST and the count for a pointer
-// that it reads through. Whether a host's procedure before it keeps the message from it cannot be
-// seen, so the host says it by a window property.
+// The toolbar's own procedure takes the number for TB_INSERTMARKHITTEST and the count for a
+// pointer, which it reads through. Whether a host's subclass intercepts the message before that
+// cannot be seen, so the host says so with a window property.
 void SetCommandBarToolTips(HWND bar, int count, const wchar_t* const* texts) {
     if (IsToolbar(bar) && !GetPropW(bar, kToolTipsProperty)) return;
     SendMessageW(bar, kSetToolTips, static_cast<WPARAM>(count), reinterpret_cast<LPARAM>(texts));

@@ -1,4 +1,4 @@
-// What the desktop's loader calls, by way of the compiler's start-up code.
+// The entry point that the desktop's loader calls, through the compiler's start-up code.
 #include "base/module.h"
 
 extern "C" BOOL WINAPI DllMain(HINSTANCE instance, DWORD reason, void*) {

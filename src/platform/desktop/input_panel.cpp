@@ -1,4 +1,4 @@
-// A desktop has a keyboard.
+// No input panel: a desktop has a keyboard.
 #include "platform/input_panel.h"
 
 namespace kor {

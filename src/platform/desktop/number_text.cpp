@@ -9,7 +9,7 @@ void FormatSignificant(double value, int digits, wchar_t (&text)[kNumberTextCapa
     text[kNumberTextCapacity - 1] = L'\0';
 }
 
-// The runtime's own reading: the compiler would put its replacement in place of wcstod.
+// Parsed by the platform's runtime: the compiler would replace wcstod with its own.
 double NumberFromText(const wchar_t* text) { return _wtof(text); }
 
 }  // namespace kor

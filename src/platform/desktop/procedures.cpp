@@ -9,12 +9,12 @@ namespace {
 
 constexpr DWORD kPathCapacity = MAX_PATH;
 
-// The folder of a module, or of the program for null, with its last backslash.
+// The folder of a module with its trailing backslash; that of the program for a null module.
 class ModuleFolder {
 public:
     explicit ModuleFolder(HMODULE module) noexcept {
         const DWORD length = GetModuleFileNameW(module, path_, kPathCapacity);
-        if (length < kPathCapacity) length_ = length;  // a longer path has been cut off
+        if (length < kPathCapacity) length_ = length;  // a longer path has been truncated
         while (length_ > 0 && path_[length_ - 1] != L'\\') --length_;
         path_[length_] = L'\0';
     }

@@ -1,5 +1,5 @@
-// System colours on the desktop, whose calls do not know the flag; drawing is collected and may be
-// put off.
+// System colours on the desktop, whose calls do not take the flag; drawing is batched and may be
+// deferred.
 #include "platform/platform.h"
 
 namespace kor {

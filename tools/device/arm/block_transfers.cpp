@@ -1,4 +1,4 @@
-// Loads and stores of several registers.
+// Block transfers: loads and stores of several registers.
 #include "arm/decode.h"
 #include "arm/operands.h"
 
@@ -7,14 +7,15 @@
 namespace arm {
 namespace {
 
-// Of the lowest word that is transferred: the lowest register always has the lowest address.
+// Address of the lowest word that is transferred: the lowest register always has the lowest
+// address.
 constexpr uint32_t LowestAddress(uint32_t base, uint32_t bytes, bool isUp, bool isBefore) {
     if (isUp) return isBefore ? base + 4 : base;
     return isBefore ? base - bytes : base - bytes + 4;
 }
 
-// A base register that is loaded or stored as well and changes: what it holds is predictable only
-// where it is the first that is stored.
+// A base register that is in the list and is written back: its value is predictable only when it is
+// the first one that is stored.
 constexpr bool IsPredictable(uint32_t list, unsigned n, bool isLoad, bool writesBack) {
     if (!list || n == kPc) return false;
     if (!writesBack || !(list >> n & 1)) return true;
@@ -67,7 +68,7 @@ Handler Choose(bool writesBack, bool isLoad) {
 }  // namespace
 
 Handler BlockTransferHandler(unsigned high) {
-    if (high & 4) return nullptr;  // of another mode's registers
+    if (high & 4) return nullptr;  // transfers another mode's registers
     const bool writesBack = (high & 2) != 0, isLoad = (high & 1) != 0;
     if (high & 16) {
         return high & 8 ? Choose<true, true>(writesBack, isLoad)

@@ -18,7 +18,7 @@ void ReadStatus(Cpu& cpu, uint32_t instruction) {
     cpu.r[d] = cpu.flags | cpu.control;
 }
 
-// Only the flags are a program's own.
+// A program may change only the flags.
 void WriteStatus(Cpu& cpu, uint32_t instruction, uint32_t value) {
     if ((instruction & 0x000FF000) != 0x0008F000) {
         Refuse(cpu, "a change of the processor's mode or state");

@@ -28,7 +28,7 @@ constexpr bool Holds(unsigned condition, unsigned nzcv) {
     return (condition & 1) ? !holds : holds;
 }
 
-// For each condition, a bit for each of the 16 states of the flags.
+// For each condition, a bit mask of the 16 states of the flags in which it holds.
 constexpr auto kHolding = [] {
     std::array<uint16_t, 16> table{};
     for (unsigned condition = 0; condition < 16; ++condition) {

@@ -1,8 +1,8 @@
-// An ARM processor of version 4 of the architecture, in user mode, without Thumb: its registers,
-// and the loop that executes instructions. Guest addresses are addresses of the process.
+// An ARMv4 processor in user mode, without Thumb: its registers, and the loop that executes
+// instructions. Guest addresses are addresses of the process.
 //
-// Nothing here knows a platform. What the architecture of version 4 leaves undefined or
-// unpredictable is refused: a program that needs it does not run on every such processor.
+// Nothing here depends on a platform. What ARMv4 leaves undefined or unpredictable is refused: a
+// program that needs it does not run on every such processor.
 #pragma once
 
 #include <cstdint>
@@ -22,11 +22,11 @@ constexpr uint32_t kUserMode = 0x10;
 
 struct Cpu;
 
-// Why execution cannot go on.
+// Why execution cannot continue.
 struct Refusal {
     const char* reason;
     uint32_t instruction;  // address of the instruction
-    uint32_t address;      // of the memory that it wanted, or where it wanted to go; or 0
+    uint32_t address;      // of the memory access or the jump target, or 0
 };
 
 // Called with what is refused. Must not return.
@@ -35,9 +35,9 @@ using RefusalHandler = void (*)(Cpu&, const Refusal&);
 constexpr unsigned kPageBits = 12;
 constexpr uint32_t kPageCount = 1u << (32 - kPageBits);
 
-// What the guest may write to. Its stack is known exactly, up to the stack pointer; the rest page
-// by page: a page that is not marked is asked for, and a permission may be remembered by marking
-// it.
+// What the guest may write to. Its stack is checked exactly, down to the stack pointer. Other
+// memory is checked by page: `mayWrite` is asked about a page that is not marked, and may mark it
+// to remember the permission.
 struct WriteRules {
     uint32_t stackLow = 0;
     uint32_t stackSize = 0;
@@ -48,14 +48,14 @@ struct WriteRules {
 struct Cpu {
     uint32_t r[16] = {};           // r[kPc]: the address of the instruction in execution, plus 8
     uint32_t next = 0;             // the address of the instruction after it
-    uint32_t flags = 0;            // N Z C V in their places in the status register, other bits 0
+    uint32_t flags = 0;            // N Z C V at their bits in the status register, other bits 0
     uint32_t control = kUserMode;  // the rest of the status register, as a program may read it
-    uint64_t executed = 0;         // instructions, those included whose condition did not hold
+    uint64_t executed = 0;         // instructions, including those whose condition was false
     WriteRules writes;
     RefusalHandler onRefusal = nullptr;
 };
 
-// Executes from cpu.next on, as long as the next instruction lies in `size` bytes from `low`.
+// Executes from cpu.next on while the next instruction lies in the `size` bytes from `low`.
 void Run(Cpu& cpu, uint32_t low, uint32_t size);
 
 // Executes the one instruction at cpu.next.

@@ -1,4 +1,4 @@
-// The sixteen operations on registers: logic, addition, comparison, moving.
+// The sixteen data-processing operations: logic, addition, comparison, moves.
 #include "arm/decode.h"
 #include "arm/operands.h"
 

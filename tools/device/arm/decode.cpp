@@ -7,7 +7,8 @@ namespace {
 
 void Undefined(Cpu& cpu, uint32_t) { Refuse(cpu, kUndefined); }
 
-// Comparisons that set no flags do not exist: their places hold the status register's instructions.
+// Comparisons that set no flags do not exist: their encodings hold the status register's
+// instructions.
 bool IsStatus(unsigned high) { return (high & 0x19) == 0x10; }
 
 Handler HandlerAmongOperations(unsigned high, unsigned low) {
@@ -28,7 +29,7 @@ Handler FindHandler(unsigned high, unsigned low) {
     case 3: return TransferHandler(high, low);
     case 4: return BlockTransferHandler(high);
     case 5: return BranchHandler(high);
-    default: return nullptr;  // coprocessors, calls of an operating system
+    default: return nullptr;  // coprocessor instructions and software interrupts
     }
 }
 

@@ -5,7 +5,7 @@
 namespace arm {
 namespace {
 
-// The carry and the overflow flag are left alone; ARMv4 does not say what becomes of the carry.
+// The carry and overflow flags are unchanged; ARMv4 does not say what becomes of the carry.
 void SetSignAndZero(Cpu& cpu, bool isNegative, bool isZero) {
     cpu.flags =
         (cpu.flags & (kCarry | kOverflow)) | (isNegative ? kNegative : 0) | (isZero ? kZero : 0);

@@ -9,7 +9,7 @@ namespace arm {
 
 constexpr bool BitOf(uint32_t instruction, unsigned bit) { return (instruction >> bit & 1) != 0; }
 
-// The four register fields, by the place of their lowest bit.
+// The four register fields, from the highest bits to the lowest.
 constexpr unsigned FieldN(uint32_t instruction) { return instruction >> 16 & 15; }
 constexpr unsigned FieldD(uint32_t instruction) { return instruction >> 12 & 15; }
 constexpr unsigned FieldS(uint32_t instruction) { return instruction >> 8 & 15; }
@@ -34,7 +34,7 @@ constexpr uint32_t RotateRight(uint32_t value, unsigned by) {
 
 enum ShiftKind : unsigned { kLsl, kLsr, kAsr, kRor };
 
-// By 1 to 255 places.
+// By 1 to 255 bits.
 constexpr Shifted Shift(uint32_t value, unsigned kind, unsigned by) {
     switch (kind) {
     case kLsl:
@@ -55,8 +55,8 @@ constexpr Shifted Shift(uint32_t value, unsigned kind, unsigned by) {
     }
 }
 
-// A register shifted by a number in the instruction. 0 stands for 32, or for a rotation by one
-// through the carry.
+// A register shifted by an immediate. An immediate of 0 means no shift to the left, a shift of 32
+// to the right, or a rotation by one through the carry.
 inline Shifted ShiftByImmediate(const Cpu& cpu, uint32_t instruction) {
     const uint32_t value = cpu.r[FieldM(instruction)];
     const unsigned kind = instruction >> 5 & 3;
@@ -77,7 +77,7 @@ inline Shifted ShiftByRegister(const Cpu& cpu, uint32_t instruction) {
     return Shift(value, instruction >> 5 & 3, by);
 }
 
-// Eight bits, rotated right by an even number.
+// An 8-bit immediate, rotated right by an even number of bits.
 inline Shifted RotatedImmediate(const Cpu& cpu, uint32_t instruction) {
     const unsigned by = (instruction >> 8 & 15) * 2;
     const uint32_t value = RotateRight(instruction & 255, by);

@@ -10,9 +10,9 @@ namespace {
 
 // Bits 24 to 20 of a transfer.
 struct Mode {
-    bool isBefore;  // the offset counts before the access, else after it
+    bool isBefore;  // the offset is applied before the access, else after it
     bool isUp;
-    bool isByte;  // of halfword transfers: the offset is a number in the instruction
+    bool isByte;  // in halfword transfers: the offset is an immediate
     bool writesBack;
     bool isLoad;
 };
@@ -23,7 +23,7 @@ constexpr Mode ModeOf(unsigned bits) {
 
 constexpr bool ChangesBase(Mode mode) { return !mode.isBefore || mode.writesBack; }
 
-// Where to access, and the base register brought up to date.
+// Returns the address to access, and updates the base register.
 template <unsigned bits>
 uint32_t AddressAndBase(Cpu& cpu, uint32_t instruction, uint32_t offset) {
     constexpr Mode mode = ModeOf(bits);
@@ -133,7 +133,8 @@ Handler TransferHandler(unsigned high, unsigned low) {
     return kTransfers[high & 63];
 }
 
-// Signed stores do not exist: their places hold the loads and stores of pairs, which are newer.
+// Signed stores do not exist: their encodings hold the loads and stores of register pairs, which
+// are newer.
 Handler HalfwordHandler(unsigned high, unsigned low) {
     const unsigned kind = low >> 1 & 3;
     if (kind == kHalfword) return kHalfwords[high & 31];

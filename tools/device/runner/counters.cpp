@@ -10,14 +10,14 @@
 namespace device {
 namespace {
 
-Counters alone;  // where there is no shared memory to be had
+Counters alone;  // used when there is no shared memory
 Counters* shared = &alone;
 
-// The helpers' addresses; empty when they are not known.
+// The helpers' address range; empty when it is not known.
 uint32_t softFloatBegin;
 uint32_t softFloatEnd;
 
-// The stretch of code, all helpers or none, that an address lies in.
+// The stretch of code around an address: all of it helpers, or none.
 struct Stretch {
     uint32_t begin, end;
     bool isSoftFloat;

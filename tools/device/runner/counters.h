@@ -8,7 +8,7 @@ namespace device {
 
 Counters& counters();
 
-// Makes the shared memory.
+// Creates the shared memory.
 void PrepareCounters();
 
 // Looks for the block of arithmetic helpers in the image.

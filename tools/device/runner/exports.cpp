@@ -62,8 +62,7 @@ void ConnectExports() {
 
 }  // namespace device
 
-// Each export pushes its ordinal; the words that its caller has pushed lie above the return
-// address.
+// Each export pushes its ordinal; the words that its caller pushed lie above the return address.
 asm(R"(
 _EnterExport:
     popl %eax

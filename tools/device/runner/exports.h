@@ -3,8 +3,8 @@
 
 namespace device {
 
-// Connects each export to the image's one of the same ordinal. A name or ordinal that is not the
-// same on both sides ends the process.
+// Connects each export to the image's export of the same ordinal. A name or ordinal that differs
+// between the two ends the process.
 void ConnectExports();
 
 }  // namespace device

@@ -10,7 +10,7 @@
 namespace device {
 namespace {
 
-// Not through a buffer of the C runtime: the process is about to end.
+// Bypasses the buffers of the C runtime: the process is about to end.
 void Write(const char* text) {
     DWORD written = 0;
     WriteFile(GetStdHandle(STD_ERROR_HANDLE), text, static_cast<DWORD>(lstrlenA(text)), &written,
@@ -25,7 +25,7 @@ void Fail(const char* format, ...) {
     va_start(arguments, format);
     vsnprintf(text, sizeof text, format, arguments);
     va_end(arguments);
-    std::fflush(nullptr);  // what the test program has said so far
+    std::fflush(nullptr);  // the test program's output so far
     Write("device: ");
     Write(text);
     Write("\n");

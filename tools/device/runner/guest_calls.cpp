@@ -18,12 +18,12 @@ namespace {
 
 constexpr uint32_t kStackSize = 1024 * 1024;
 constexpr uint32_t kStackGuard = 64 * 1024;  // without access, below the stack
-constexpr uint32_t kStackHeadroom = 256;     // callees are given words beyond their arguments
+constexpr uint32_t kStackHeadroom = 256;     // callees are passed words beyond their arguments
 constexpr uint32_t kExitsSize = 64 * 1024;
 constexpr uint32_t kPoison = 0xDEAD0000;       // plus the register's number
-constexpr uint32_t kKeptPattern = 0xCAFE0000;  // the same, in registers that a callee must keep
+constexpr uint32_t kKeptPattern = 0xCAFE0000;  // the same, for registers that callees must preserve
 
-uint32_t exits;  // one word for each import, the first for the return from the guest; no access
+uint32_t exits;  // one word per import, after one for the return from the guest; no access
 DWORD thread;    // the only one that the guest runs on
 
 struct Saved {
@@ -43,7 +43,7 @@ void Restore(const Saved& saved) {
     cpu.next = saved.next;
 }
 
-// Registers and flags that a call leaves undefined get values that nobody can want.
+// Registers and flags that a call leaves undefined get values that no code can want.
 void PoisonAfterCall(bool isWide) {
     for (const unsigned i : {2u, 3u, 12u, arm::kLr}) cpu.r[i] = kPoison + i;
     if (!isWide) cpu.r[1] = kPoison + 1;
@@ -60,7 +60,8 @@ void CallImport(unsigned index) {
     cpu.next = back;
 }
 
-// Each second call has a stack that is a multiple of 8, the others one of 4 only, as on the device.
+// Every second call has a stack pointer that is a multiple of 8, the others a multiple of 4 only,
+// as on the device.
 void SetArguments(const uint32_t* words, unsigned count) {
     static uint32_t skew = 0;
     skew ^= 4;

@@ -1,4 +1,4 @@
-// Calls into the guest, from its exports and from the platform, nested as deep as they come.
+// Calls into the guest, from its exports and from the platform, nested to any depth.
 #pragma once
 
 #include "arm/cpu.h"
@@ -9,15 +9,15 @@ namespace device {
 
 extern arm::Cpu cpu;
 
-// Makes the guest's stack and the addresses that stand for the way out. Once, before the rest.
+// Creates the guest's stack and the addresses that stand for the ways out. Called once, before the
+// rest.
 void PrepareGuestCalls();
 
-// Calls guest code with so many words of arguments and returns r0 and r1. `hostFloor`: of the
-// host's stack, nothing below belongs to a caller, and so nothing below may be written by the
-// guest.
+// Calls guest code with `count` words of arguments and returns r0 and r1. `hostFloor` is an address
+// in the host's stack: nothing below it belongs to a caller, so the guest may not write there.
 uint64_t CallGuest(uint32_t function, const uint32_t* words, unsigned count, uint32_t hostFloor);
 
-// An address for the guest's import number `index`: a jump there is a call of it.
+// The address of the guest's import number `index`: a jump there is a call of it.
 uint32_t ImportAddress(unsigned index);
 
 }  // namespace device

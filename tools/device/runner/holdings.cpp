@@ -39,7 +39,7 @@ constexpr Entry kEntries[] = {
     {"ReleaseDC", {Holding::TakesWindowDC}},
 };
 
-std::unordered_map<uint32_t, uint32_t> blocks;  // sizes
+std::unordered_map<uint32_t, uint32_t> blocks;  // sizes in bytes, by address
 std::unordered_multiset<uint32_t> objects;
 
 void ForgetBlock(uint32_t block) {
@@ -50,7 +50,7 @@ void ForgetBlock(uint32_t block) {
 }
 
 void NoteBlock(uint32_t block, uint32_t size) {
-    ForgetBlock(block);  // one that the host has freed
+    ForgetBlock(block);  // a block there that the host has freed
     blocks.emplace(block, size);
     counters().heapBytes += size;
 }

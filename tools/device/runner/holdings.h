@@ -1,6 +1,6 @@
-// What the guest holds of the platform: blocks of memory and GDI objects, by the calls that give
-// and take them. What a host frees for the guest, as a text that a message hands over, is held for
-// ever.
+// What the guest holds of the platform's resources: memory blocks and GDI objects, tracked by the
+// calls that give and take them. What a host frees for the guest, such as a text that a message
+// hands over, counts as held for ever.
 #pragma once
 
 #include <cstdint>
@@ -11,10 +11,10 @@ namespace device {
 // What a function does to the guest's holdings.
 enum class Holding : uint8_t {
     None,
-    GivesBlock,    // of as many bytes as its last argument says
+    GivesBlock,    // its last argument is the size in bytes
     ResizesBlock,  // its first argument, to its second one
     TakesBlock,
-    TakesLocalBlock,      // and answers 0
+    TakesLocalBlock,      // and returns 0
     TakesClipboardBlock,  // its second argument
     GivesObject,
     TakesObject,
@@ -28,7 +28,7 @@ struct HoldingCall {
 
 HoldingCall FindHolding(const std::string& guestName);
 
-// Notes a call that has been made, in the counters.
+// Records a completed call in the counters.
 void NoteHolding(const HoldingCall& call, const uint32_t* words, uint32_t result);
 
 }  // namespace device

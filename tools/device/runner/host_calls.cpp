@@ -1,4 +1,4 @@
-// In assembly, since no C++ function type says "as many words as the callee takes off". See
+// In assembly, since no C++ function type says "as many words as the callee pops". See
 // host_calls.h.
 #include "runner/host_calls.h"
 

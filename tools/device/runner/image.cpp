@@ -11,7 +11,7 @@ GuestImage guest;
 
 namespace {
 
-// The device's word on its loader: a reader for subsystem 9 of Windows CE.
+// The subsystem of images for Windows CE.
 constexpr WORD kWindowsCe = 9;
 
 std::vector<uint8_t> ReadWhole(const std::wstring& path) {
@@ -99,7 +99,7 @@ void Relocate() {
         }
         at += block->SizeOfBlock;
     }
-    // As it would be after the device's loader.
+    // As the device's loader leaves it.
     Headers().OptionalHeader.ImageBase = guest.base;
 }
 

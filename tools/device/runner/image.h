@@ -38,7 +38,7 @@ struct GuestImage {
 // The one guest of the process.
 extern GuestImage guest;
 
-// Reads the file into `guest`, at an address that it does not prefer. All of it can be written
+// Loads the file into `guest`, at an address other than its preferred one. All of it is writable
 // until ProtectImage.
 void LoadImageFile(const std::wstring& path);
 

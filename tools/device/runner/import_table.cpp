@@ -28,8 +28,8 @@ const char* const kDoubleResults[] = {"acos", "asin", "atan",  "atan2", "ceil", 
                                       "exp",  "fabs", "floor", "fmod",  "log",   "log10",
                                       "pow",  "sin",  "sqrt",  "tan",   "wcstod"};
 
-// Of the C runtime. swprintf is one of them since both sides lay out its arguments alike: a double
-// is the next two words.
+// Functions of the C runtime whose arguments are words. swprintf is one of them since both sides
+// lay out its arguments alike: a double is the next two words.
 const char* const kRuntimeOfWords[] = {
     "??2@YAPAXI@Z", "??3@YAXPAX@Z", "_itow",   "_wtol",  "free",    "malloc",
     "memcmp",       "memcpy",       "memmove", "memset", "realloc", "swprintf",
@@ -80,7 +80,7 @@ Value FieldAt(uint32_t address, size_t offset) {
     return *reinterpret_cast<const Value*>(address + offset);
 }
 
-// A property sheet may bring its pages along in an array of structures, whose size they carry.
+// A property sheet may contain its pages as an array of structures, each of which holds its size.
 void AnnouncePages(uint32_t header) {
     const auto& sheet = *reinterpret_cast<const PROPSHEETHEADERW*>(header);
     if (!(sheet.dwFlags & PSH_PROPSHEETPAGE)) return;

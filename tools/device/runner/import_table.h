@@ -1,4 +1,4 @@
-// What has to be known about a platform function that the guest calls, beyond its name.
+// What must be known about a platform function that the guest calls, beyond its name.
 #pragma once
 
 #include "runner/callbacks.h"
@@ -8,7 +8,7 @@
 
 namespace device {
 
-// How a function's words and its result travel.
+// How a function's arguments and result are passed.
 enum class Passing : uint8_t {
     Words,         // as they are: all integers, handles and pointers
     DoubleResult,  // the desktop returns it in a register of its own; the arguments are words
@@ -29,12 +29,12 @@ constexpr int16_t kIsArgument = -1;
 // The desktop's name of a function.
 std::string DesktopName(const std::string& guestName);
 
-// How it is called. False for functions of the C runtime that nobody has looked at.
+// How a function is called. False for functions of the C runtime that nobody has looked at.
 bool FindPassing(const std::string& guestName, const std::string& library, Passing& passing);
 
-// What a function of the C runtime writes: from its first argument on, as many bytes as this
-// argument says. The functions of windows and drawing are not in this list; they know what they are
-// given.
+// What a function of the C runtime writes to: memory from its first argument on, with the length in
+// bytes in argument `lengthArgument`. Window and drawing functions are not in this list; they know
+// what they are given.
 constexpr int kUnknownLength = -1;
 bool FindDestination(const std::string& guestName, int& lengthArgument);
 

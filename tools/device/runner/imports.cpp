@@ -26,23 +26,23 @@ constexpr int kNoImport = -1;
 struct Binding {
     std::string name;  // as the image has it
     Passing passing;
-    int import;         // in the table that tests see, or kNoImport
+    int import;         // index in the table that tests see, or kNoImport
     uint32_t function;  // the host's, where it is in no table
     OwnFunction own;    // with Passing::Own
     bool takesProcedures;
-    bool writes;         // from its first argument on
-    int lengthArgument;  // then; or kUnknownLength
+    bool writes;         // to memory from its first argument on
+    int lengthArgument;  // of such a function; or kUnknownLength
     HoldingCall holding;
 };
 
-std::deque<Binding> bindings;              // references stay good while a call adds one
+std::deque<Binding> bindings;              // references stay valid while a call adds one
 std::map<std::string, int> neededImports;  // of own functions, by name
 
 // The desktop's libraries, by the names that its import libraries have for them.
 const char* const kLibraries[] = {"USER32.dll", "GDI32.dll", "KERNEL32.dll", "COMCTL32.dll",
                                   "msvcrt.dll"};
 
-// The desktop's function of this name; null without one.
+// The desktop's function of this name; 0 when there is none.
 uint32_t FindDesktopFunction(const std::string& name, std::string& library) {
     for (const char* candidate : kLibraries) {
         const auto found =
@@ -90,8 +90,8 @@ struct Words {
     uint32_t values[kHostWords];
 };
 
-// What the runtime writes for the guest must be the guest's: each page of it, or, where the length
-// is not known, the beginning.
+// What the runtime writes for the guest must be the guest's: each page of it or, if the length is
+// not known, its beginning.
 void CheckDestination(arm::Cpu& machine, const Binding& binding, const uint32_t* words) {
     const uint32_t begin = words[0];
     const uint32_t length =

@@ -17,7 +17,7 @@ namespace {
 constexpr uint32_t kSystemColourFlag = 0x40000000;
 
 // Messages to a command bar, whose numbers mean something else to a toolbar of the desktop. The
-// library sends them to nobody else.
+// library sends them to no other window.
 constexpr UINT kAddButtons = WM_USER + 20;
 constexpr UINT kSetToolTips = WM_USER + 81;
 
@@ -37,7 +37,7 @@ uint64_t StockObject(uint32_t target, const uint32_t* words) {
     return CallDesktop("GetSysColorBrush", {words[0] & ~kSystemColourFlag});
 }
 
-// Names of functions are wide. What is found is called through an address of the runner's.
+// Function names are wide. The function that is found is called through an address of the runner.
 uint64_t ProcAddress(uint32_t target, const uint32_t* words) {
     char name[128] = "";
     WideCharToMultiByte(CP_ACP, 0, As<const wchar_t*>(words[1]), -1, name, sizeof name, nullptr,
@@ -46,7 +46,8 @@ uint64_t ProcAddress(uint32_t target, const uint32_t* words) {
     return GuestAddressOf(static_cast<uint32_t>(CallHost(target, arguments)));
 }
 
-// A movable block of the global heap with the bytes of a local one; 0 for none, or without memory.
+// A movable block of the global heap with the bytes of a local one; 0 for 0, or when there is no
+// memory.
 uint32_t MovableCopy(uint32_t block) {
     if (!block) return 0;
     const auto size = CallDesktop("LocalSize", {block});
@@ -58,8 +59,8 @@ uint32_t MovableCopy(uint32_t block) {
     return copy;
 }
 
-// The clipboard takes blocks of the local heap; the desktop's takes movable ones of the global
-// heap. A block that is not taken stays the guest's.
+// The device's clipboard takes blocks of the local heap; the desktop's takes movable ones of the
+// global heap. A block that is not taken stays the guest's.
 uint64_t SetClipboard(uint32_t target, const uint32_t* words) {
     const uint32_t copy = MovableCopy(words[1]);
     uint32_t arguments[kHostWords] = {words[0], copy};

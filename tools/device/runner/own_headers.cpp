@@ -38,7 +38,7 @@ Data* OwnAt(uint32_t offset) {
     return reinterpret_cast<Data*>(OwnBase() + offset);
 }
 
-// Offsets in a module are numbers of 32 bits: with wrapping, any address has one.
+// Offsets in a module have 32 bits: with wrap-round, any address has one.
 uint32_t OffsetOf(const void* place) { return reinterpret_cast<uint32_t>(place) - OwnBase(); }
 
 IMAGE_DATA_DIRECTORY& OwnDirectory(int index) {
@@ -54,7 +54,7 @@ void SetDirectory(int index, const void* place, uint32_t size) {
     VirtualProtect(&directory, sizeof directory, before, &before);
 }
 
-// The runner's own imports that stay in the table. Before it is replaced.
+// The runner's own imports that stay in the table. Must be called before the table is replaced.
 std::vector<IMAGE_IMPORT_DESCRIPTOR> KeptDescriptors() {
     std::vector<IMAGE_IMPORT_DESCRIPTOR> kept;
     const auto& directory = OwnDirectory(IMAGE_DIRECTORY_ENTRY_IMPORT);
@@ -68,7 +68,7 @@ std::vector<IMAGE_IMPORT_DESCRIPTOR> KeptDescriptors() {
     return kept;
 }
 
-// The runner's own slot for a function, where it stays in the table.
+// The runner's own slot for a function that stays in the table, else null.
 uint32_t* KeptSlot(const std::string& wanted) {
     for (const IMAGE_IMPORT_DESCRIPTOR& library : KeptDescriptors()) {
         auto* name = OwnAt<uint32_t>(library.OriginalFirstThunk);
@@ -81,10 +81,10 @@ uint32_t* KeptSlot(const std::string& wanted) {
     return nullptr;
 }
 
-// Inside the module: offsets of names above 2 GB would mean imports by number.
+// Lies inside the module: offsets of names above 2 GB would mean imports by ordinal.
 alignas(16) uint8_t tableRoom[32 * 1024];
 
-// Hands out pieces of it.
+// Allocates pieces of tableRoom.
 class Builder {
 public:
     template <typename Data>
@@ -105,7 +105,7 @@ private:
 
 using Libraries = std::map<std::string, std::vector<Import*>>;
 
-// A name as an import table has it: a number first, of no meaning here.
+// A name as an import table has it: preceded by a hint, which is unused here.
 const char* TakeName(Builder& builder, const std::string& name) {
     auto* entry = builder.take<char>(sizeof(WORD) + name.size() + 1);
     std::strcpy(entry + sizeof(WORD), name.c_str());
@@ -160,8 +160,8 @@ void ShowGuestImports() {
 
 namespace {
 
-// Leads the entries below a resource directory to where the guest's data is, seen from `moved`
-// bytes away.
+// Points the data entries below a resource directory at the guest's data, which lies `moved` bytes
+// away.
 void MoveResources(uint32_t directoryOffset, uint32_t moved) {
     auto* directory =
         reinterpret_cast<IMAGE_RESOURCE_DIRECTORY*>(guest.resources + directoryOffset);

@@ -14,12 +14,12 @@ namespace {
 constexpr wchar_t kVariable[] = L"KORCONTROLS_DEVICE_PROFILE";
 
 std::wstring file;               // empty without a profile
-std::vector<uint64_t> counts;    // by the place of an instruction in the code, in words
-std::vector<uint64_t> onBehalf;  // the same, instructions of helpers by the place of their call
+std::vector<uint64_t> counts;    // by an instruction's word index in the code
+std::vector<uint64_t> onBehalf;  // the same for helpers, by the word index of their call
 
 uint32_t PlaceOf(uint32_t address) { return (address - guest.codeBegin) / 4; }
 
-// Places are written as offsets into the image, as a link map has them without its base.
+// Indexes are written as offsets into the image, like those of a link map without its base.
 void WriteCounts(FILE* out, const char* kind, const std::vector<uint64_t>& of) {
     for (size_t i = 0; i < of.size(); ++i) {
         if (!of[i]) continue;

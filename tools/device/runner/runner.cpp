@@ -1,4 +1,4 @@
-// korcontrols.dll as the tests load it when they run on the device's image: it stands for that
+// korcontrols.dll as the tests load it when they run on the device's image: it stands in for that
 // image, which it interprets. See docs/device-runner.md.
 #include "runner/callbacks.h"
 #include "runner/counters.h"
@@ -23,7 +23,7 @@ std::wstring FolderBeside(HMODULE self) {
 }
 
 // The block of arithmetic helpers as the image contains it, so that they can be counted. Without
-// the file they are not told apart.
+// the file they are not distinguished.
 void ReadSoftFloat(const std::wstring& path) {
     const HANDLE file = CreateFileW(path.c_str(), GENERIC_READ, FILE_SHARE_READ, nullptr,
                                     OPEN_EXISTING, 0, nullptr);

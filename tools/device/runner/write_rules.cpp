@@ -13,7 +13,7 @@ constexpr DWORD kWritable =
 
 uint32_t hostFloor;
 
-// The host's stack, from as far as it may grow down to its base.
+// The host's stack, from the lowest address it may grow to up to its base.
 struct Range {
     uint32_t low, high;
 };
@@ -44,7 +44,7 @@ bool MayWrite(uint32_t address, uint32_t) {
     const bool isKnown =
         VirtualQuery(reinterpret_cast<void*>(address), &memory, sizeof memory) == sizeof memory;
     SetLastError(error);
-    if (!isKnown || memory.State != MEM_COMMIT) return true;  // a fault, should it come to that
+    if (!isKnown || memory.State != MEM_COMMIT) return true;  // the access itself would fault
     if (!(memory.Protect & kWritable)) return false;
     if (memory.Type == MEM_IMAGE && !IsOfProgram(memory)) return false;
     writablePages[address >> arm::kPageBits] = 1;

@@ -15,7 +15,7 @@ extern uint8_t writablePages[arm::kPageCount];
 // the runner's own data among them, and for what cannot be written at all.
 bool MayWrite(uint32_t address, uint32_t size);
 
-// Returns the floor before.
+// Sets the floor of the host's stack and returns the previous one.
 uint32_t SetHostFloor(uint32_t floor);
 
 }  // namespace device

@@ -6,7 +6,7 @@
 
 namespace {
 
-// One page is all there is to print, and the driver makes the copies.
+// There is only one page to print, and the driver makes the copies.
 constexpr DWORD kFlags =
     PD_RETURNDC | PD_NOSELECTION | PD_NOPAGENUMS | PD_USEDEVMODECOPIESANDCOLLATE;
 
