@@ -22,12 +22,21 @@ void GraphTest::create(int width, int height, int left, int top) {
     const auto made = spy.callsOf("CreateCompatibleDC");
     ASSERT_FALSE(made.empty());
     imageDC = reinterpret_cast<HDC>(made.front().result);
-    tip = GetDlgItem(host.window(), KORTOOLTIP_ID);
+    tip = newToolTip();
     ASSERT_NE(tip, nullptr);
     SetPropW(tip, kTestProperty, this);
     tipOriginal_ = reinterpret_cast<WNDPROC>(
         SetWindowLongPtrW(tip, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(&GraphTest::tipProc)));
     settle();
+}
+
+// A further chart has a tooltip of its own in the same host.
+HWND GraphTest::newToolTip() const {
+    for (HWND child = GetWindow(host.window(), GW_CHILD); child;
+         child = GetWindow(child, GW_HWNDNEXT)) {
+        if (GetDlgCtrlID(child) == KORTOOLTIP_ID && !GetPropW(child, kTestProperty)) return child;
+    }
+    return nullptr;
 }
 
 void GraphTest::createPlain(int width, int height) {

@@ -116,6 +116,7 @@ protected:
     std::vector<Invalidation> invalidations;
 
 private:
+    HWND newToolTip() const;
     static LRESULT CALLBACK tipProc(HWND window, UINT message, WPARAM wParam, LPARAM lParam);
     WNDPROC tipOriginal_ = nullptr;
 };

@@ -8,7 +8,7 @@ import pytest
 
 from build_commands import run
 
-SOURCES = ("CMakeLists.txt", "CMakePresets.json", "cmake", "include", "res", "scripts", "src")
+SOURCES = ("CMakeLists.txt", "CMakePresets.json", "cmake", "include", "scripts", "src")
 OUTPUTS = ("bin/korcontrols.dll", "lib/libkorcontrols.dll.a")
 
 
