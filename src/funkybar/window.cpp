@@ -4,6 +4,7 @@
 
 #include "base/gdi_scopes.h"
 #include "base/module.h"
+#include "base/resources.h"
 #include "funkybar/drawing.h"
 #include "funkybar/items.h"
 #include "funkybar/layout.h"
@@ -14,7 +15,6 @@ namespace kor {
 
 namespace {
 
-constexpr int kArrowBitmap = 107;
 constexpr COLORREF kArrowMaskColour = RGB(0, 128, 128);
 constexpr int kFontPoints = 10;
 
@@ -35,7 +35,7 @@ LRESULT OnCreate(HWND hwnd) {
     if (!funkyBar.font) funkyBar.font = CreateBarFont(hwnd);
     if (!funkyBar.arrowImages) {
         funkyBar.arrowImages =
-            ImageList_LoadImageW(moduleInstance, MAKEINTRESOURCEW(kArrowBitmap), kArrowWidth, 1,
+            ImageList_LoadImageW(moduleInstance, MAKEINTRESOURCEW(KOR_BITMAP_ARROW), kArrowWidth, 1,
                                  kArrowMaskColour, IMAGE_BITMAP, 0);
     }
     return 0;

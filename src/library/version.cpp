@@ -1,11 +1,16 @@
 // The version export.
 #include <korcontrols/korcontrols.h>
+#include <korcontrols/version.h>
 
 #include "base/runtime.h"
 
 namespace {
 
-const wchar_t kVersionText[] = L"0049";
+// The digits of a number.
+#define KOR_WIDE_DIGITS_(number) L## #number
+#define KOR_WIDE_DIGITS(number) KOR_WIDE_DIGITS_(number)
+
+const wchar_t kVersionText[] = L"00" KOR_WIDE_DIGITS(KORCONTROLS_VERSION);
 
 }  // namespace
 

@@ -27,6 +27,7 @@ def test_the_library_its_import_library_and_all_headers_are_there(installed, sou
     files = {str(path.relative_to(installed)) for path in installed.rglob("*") if path.is_file()}
     headers = {f"include/korcontrols/{path.name}"
                for path in (source / "include" / "korcontrols").iterdir()}
+    headers.add("include/korcontrols/version.h")  # which is made
     assert files == headers | {"bin/korcontrols.dll", "lib/libkorcontrols.dll.a",
                                "lib/korcontrols.def"}
     assert (installed / "bin" / "korcontrols.dll").read_bytes() == (
@@ -38,7 +39,7 @@ def test_a_host_links_with_it(installed, build, source, tmp_path):
     code.write_text(HOST)
     command = compile_command(build, code, thing)
     # With the installed headers, not the tree's.
-    command = [word for word in command if word not in (f"-I{source}/include", f"-I{source}/src")]
+    command = [word for word in command if word not in (f"-I{source}/include", f"-I{source}/src", f"-I{build}/include")]
     compiled = run(command + [f"-I{installed}/include"], tmp_path)
     assert compiled.returncode == 0, compiled.stderr
 

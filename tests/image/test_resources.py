@@ -11,7 +11,11 @@ BITMAP_FILE_HEADER = 14  # bytes before the picture in a .bmp file, absent in a 
 
 @pytest.fixture(scope="module")
 def script(source):
-    return re.sub(r"//[^\n]*", "", (source / "src" / "library" / "korcontrols.rc").read_text())
+    """The script with the numbers of its identifiers."""
+    names = (source / "src" / "base" / "resources.h").read_text()
+    numbers = dict(re.findall(r"^#define (KOR_\w+) (\d+)$", names, re.MULTILINE))
+    text = re.sub(r"//[^\n]*", "", (source / "src" / "library" / "korcontrols.rc").read_text())
+    return re.sub(r"\bKOR_\w+", lambda name: numbers[name.group()], text)
 
 
 @pytest.fixture(scope="module")

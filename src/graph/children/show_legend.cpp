@@ -6,6 +6,7 @@
 
 #include "base/gdi_scopes.h"
 #include "base/module.h"
+#include "base/resources.h"
 #include "base/windows_helpers.h"
 #include "graph/children/legend.h"
 #include "numbers/truncate.h"
@@ -14,7 +15,6 @@ namespace kor {
 
 namespace {
 
-constexpr UINT kLegendTitleString = 9;
 constexpr int kLegendTitleCapacity = 50;
 constexpr int kBottomGap = 2;
 
@@ -31,7 +31,7 @@ int SnappedHeight(HWND legend) {
 void ShowLegend(GraphRecord& graph, const RECT& place) {
     if (graph.hwndLegend || graph.isMakingLegend) return;
     wchar_t title[kLegendTitleCapacity] = {};
-    LoadStringW(moduleInstance, kLegendTitleString, title, kLegendTitleCapacity);
+    LoadStringW(moduleInstance, KOR_STRING_LEGEND, title, kLegendTitleCapacity);
     RegisterLegendClass(graph.hInstance);
     const int width = place.right - place.left;
     graph.isMakingLegend = true;  // creation sends messages in which a host may ask again

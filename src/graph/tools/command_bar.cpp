@@ -3,6 +3,7 @@
 #include <korcontrols/graph.h>
 
 #include "base/module.h"
+#include "base/resources.h"
 #include "graph/data/choices.h"
 #include "platform/command_bar.h"
 
@@ -10,12 +11,7 @@ namespace kor {
 
 namespace {
 
-constexpr int kButtonImages = 105;
 constexpr int kButtonImageCount = 3;
-
-constexpr UINT kShowGraphString = 1;
-constexpr UINT kFirstToolTipString = 1;
-constexpr UINT kShowGridString = 10;
 
 constexpr int kToolTipCount = 5;
 constexpr int kToolTipCapacity = 80;
@@ -36,7 +32,7 @@ void LoadToolTip(int slot, UINT stringId) {
 
 void HandOverToolTips(HWND bar) {
     for (int slot = 0; slot < kToolTipCount; ++slot) {
-        LoadToolTip(slot, kFirstToolTipString + static_cast<UINT>(slot));
+        LoadToolTip(slot, KOR_STRING_SHOWGRAPH + static_cast<UINT>(slot));
     }
     SetCommandBarToolTips(bar, kToolTipCount, toolTips);
 }
@@ -74,7 +70,7 @@ HWND InsertZoomCombo(HWND bar, HINSTANCE instance, UINT id, int position) {
 }  // namespace
 
 void ReloadShowGraphToolTip(bool isGraphShown) {
-    LoadToolTip(0, isGraphShown ? kShowGridString : kShowGraphString);
+    LoadToolTip(0, isGraphShown ? KOR_STRING_SHOWGRID : KOR_STRING_SHOWGRAPH);
 }
 
 }  // namespace kor
@@ -87,7 +83,7 @@ extern "C" DWORD KORCONTROLS_API SetupGraphCommandBar(HINSTANCE instance, HWND c
                                                       HWND* typeComboOut, UINT typeComboId) {
     if (!commandBar) return 0;
     const int added = buttons && buttonCount > 0 ? static_cast<int>(buttonCount) : 0;
-    AddCommandBarBitmap(commandBar, moduleInstance, kButtonImages, kButtonImageCount);
+    AddCommandBarBitmap(commandBar, moduleInstance, KOR_BITMAP_COMMANDBAR, kButtonImageCount);
     if (added) AddCommandBarButtons(commandBar, buttons, added);
     HWND typeCombo = InsertTypeCombo(commandBar, instance, typeComboId, added);
     if (typeComboOut) *typeComboOut = typeCombo;

@@ -2,19 +2,14 @@
 #include <korcontrols/graph.h>
 
 #include "graph/data/choices.h"
+
+#include "base/resources.h"
 #include "graph/scale/number_format.h"
 #include "graph/tools/pages.h"
 
 namespace kor {
 
 namespace {
-
-constexpr int kYMinEdit = 1005;
-constexpr int kYMaxEdit = 1006;
-constexpr int kXMinEdit = 1007;
-constexpr int kXMaxEdit = 1008;
-constexpr int kTypeCombo = 1010;
-constexpr int kZoomCombo = 1011;
 
 // The selection that was applied last, of either combo box. Compatibility: there is one value for
 // both, so the type and the zoom are sent again on most applies
@@ -37,14 +32,14 @@ void FillCombo(HWND page, int comboId, const wchar_t* const (&texts)[count], int
 
 void InitialisePage(HWND page, LPARAM parameter) {
     HWND graph = TakeGraphOfPage(page, parameter);
-    FillNumber(page, kXMinEdit, GraphXMin(graph));
-    FillNumber(page, kXMaxEdit, GraphXMax(graph));
-    FillNumber(page, kYMinEdit, GraphYMin(graph));
-    FillNumber(page, kYMaxEdit, GraphYMax(graph));
-    FillCombo(page, kTypeCombo, kTypeChoices, KorGraph_GetType(graph));
-    FillCombo(page, kZoomCombo, kZoomChoices, PlaceOfZoom(GraphZoom(graph)));
-    SetFocus(GetDlgItem(page, kTypeCombo));
-    SetFocus(GetDlgItem(page, kZoomCombo));
+    FillNumber(page, KOR_EDIT_XMIN, GraphXMin(graph));
+    FillNumber(page, KOR_EDIT_XMAX, GraphXMax(graph));
+    FillNumber(page, KOR_EDIT_YMIN, GraphYMin(graph));
+    FillNumber(page, KOR_EDIT_YMAX, GraphYMax(graph));
+    FillCombo(page, KOR_COMBO_TYPE, kTypeChoices, KorGraph_GetType(graph));
+    FillCombo(page, KOR_COMBO_ZOOM, kZoomChoices, PlaceOfZoom(GraphZoom(graph)));
+    SetFocus(GetDlgItem(page, KOR_COMBO_TYPE));
+    SetFocus(GetDlgItem(page, KOR_COMBO_ZOOM));
 }
 
 double NumberIn(HWND page, int editId) {
@@ -81,11 +76,11 @@ bool ApplyChoice(HWND page, HWND graph, int comboId, UINT setter) {
 
 void Apply(HWND page) {
     HWND graph = GraphOfPage(page);
-    bool isChanged = ApplyRange(page, graph, KORGRAPH_X, kXMinEdit, kXMaxEdit);
-    isChanged |= ApplyRange(page, graph, KORGRAPH_Y, kYMinEdit, kYMaxEdit);
+    bool isChanged = ApplyRange(page, graph, KORGRAPH_X, KOR_EDIT_XMIN, KOR_EDIT_XMAX);
+    isChanged |= ApplyRange(page, graph, KORGRAPH_Y, KOR_EDIT_YMIN, KOR_EDIT_YMAX);
     if (!IsWindow(page)) return;  // destroyed while a message box was open
-    isChanged |= ApplyChoice(page, graph, kTypeCombo, GM_SETTYPE);
-    isChanged |= ApplyChoice(page, graph, kZoomCombo, GM_SETZOOM);
+    isChanged |= ApplyChoice(page, graph, KOR_COMBO_TYPE, GM_SETTYPE);
+    isChanged |= ApplyChoice(page, graph, KOR_COMBO_ZOOM, GM_SETZOOM);
     if (isChanged) KorGraph_Redraw(graph);
 }
 

@@ -8,15 +8,13 @@
 
 #include "base/module.h"
 #include "base/records.h"
+#include "base/resources.h"
 #include "graph/data/choices.h"
 #include "platform/input_panel.h"
 
 namespace kor {
 
 namespace {
-
-constexpr int kTitlesDialog = 3000;
-constexpr int kDataDialog = 3001;
 
 GraphRange RangeOf(HWND graph, LONG axis) {
     GraphRange range = {};
@@ -61,8 +59,8 @@ bool IsApply(LPARAM notification) {
 }  // namespace
 
 void RunGraphProperties(HWND graph) {
-    HPROPSHEETPAGE pages[] = {CreatePage(kTitlesDialog, L"Titles", TitlesPageProc, graph),
-                              CreatePage(kDataDialog, L"Ranges", DataPageProc, graph)};
+    HPROPSHEETPAGE pages[] = {CreatePage(KOR_DIALOG_TITLES, L"Titles", TitlesPageProc, graph),
+                              CreatePage(KOR_DIALOG_DATA, L"Ranges", DataPageProc, graph)};
     if (pages[0] && pages[1]) {
         RunSheet(graph, pages);  // which frees them
         return;

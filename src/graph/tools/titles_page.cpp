@@ -2,6 +2,7 @@
 #include <korcontrols/graph.h>
 
 #include "base/gdi_scopes.h"
+#include "base/resources.h"
 #include "graph/tools/pages.h"
 
 namespace kor {
@@ -14,9 +15,9 @@ struct TitleEdit {
     UINT setter;
 };
 
-constexpr TitleEdit kTitleEdits[] = {{1002, GM_GETTITLE, GM_SETTITLE},
-                                     {1003, GM_GETXTITLE, GM_SETXTITLE},
-                                     {1004, GM_GETYTITLE, GM_SETYTITLE}};
+constexpr TitleEdit kTitleEdits[] = {{KOR_EDIT_TITLE, GM_GETTITLE, GM_SETTITLE},
+                                     {KOR_EDIT_XTITLE, GM_GETXTITLE, GM_SETXTITLE},
+                                     {KOR_EDIT_YTITLE, GM_GETYTITLE, GM_SETYTITLE}};
 
 constexpr WPARAM kTypedCharacters = 20;  // at most; a longer title set by the host is shown whole
 

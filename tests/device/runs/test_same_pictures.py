@@ -24,7 +24,7 @@ def picture(workbook):
     """What its window shows, with the text caret where there is one (it blinks)."""
     window = workbook.view().main.rect
     shown = workbook.settle().crop(window)
-    if workbook.view().mode == "Ready":
+    if workbook.view().mode == "Ready" and not workbook.dialog():
         return shown
     blinked = wait_until(
         lambda: [other for other in [workbook.desktop.picture().crop(window)] if other != shown],
