@@ -42,7 +42,7 @@ struct RecordLife {
 // One procedure's use of a record, which may be null. Nearly every system call that a procedure
 // makes sends messages, and a host may destroy the window inside any of them, while the procedure
 // still needs its record. So FreeRecord(Record*) frees a retired record when its outermost use
-// ends. Every window procedure begins with a use, WM_CREATE's included.
+// ends. A window procedure begins with a use as soon as its window has a record.
 template <typename Record>
 class RecordUse {
 public:

@@ -118,8 +118,8 @@ void DrawXAxis(GraphRecord& graph, HDC dc) {
 
 void DrawYAxis(GraphRecord& graph, HDC dc) {
     const RECT plot = PlotArea(graph);
-    // The margin is added on the right, not taken off: an axis whose zero lies right of the plot is
-    // drawn in the right margin or at the surface's edge.
+    // Compatibility: the margin is added on the right, not subtracted, so an axis whose zero lies
+    // far to the right is out of sight (GraphYAxis.IsOutOfSightBeyondTheRightMarginAddedToTheEdge).
     const int rightmost = graph.rcPlot.right + graph.marginRight;
     int x = xPixel(graph, 0);
     if (x < plot.left) x = plot.left;

@@ -40,8 +40,8 @@ SliceEdge MakeSliceEdge(double degrees);
 // follow one another from 0 to 360 degrees, every pixel of the disc belongs to exactly one of them.
 SliceRow SliceOnRow(const SliceEdge& start, const SliceEdge& end, int dy, int halfWidth);
 
-// Column of the last pixel on the near side of an edge where it crosses the row `dy`, which must
-// lie within the edge's half of the disc: the slope times the row, rounded half away from zero.
+// Column in which an edge crosses the row `dy`, which must lie within the edge's half of the disc:
+// the slope times the row, rounded half away from zero.
 int CrossingOf(const SliceEdge& edge, int dy);
 
 }  // namespace kor
