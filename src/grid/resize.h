@@ -5,8 +5,8 @@
 
 namespace kor {
 
-// HCN_ITEMRESIZING: draws the tracking line. `position` is where the item
-// would end along the strip.
+// HCN_ITEMRESIZING: draws the tracking line. `position` is where the item would end,
+// along the strip.
 LRESULT OnHeaderResizing(HWND header, int position);
 
 // HCN_ITEMRESIZED: stores the new size, redraws what moved and notifies the parent. `item` counts

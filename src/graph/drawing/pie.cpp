@@ -178,11 +178,6 @@ void DrawPercentages(const GraphRecord& graph, const Slices& slices, HDC dc, int
 
 }  // namespace
 
-POINT SurfaceCentre(const GraphRecord& graph) {
-    const RECT& surface = graph.rcPlot;
-    return {(surface.left + surface.right) >> 1, (surface.top + surface.bottom) >> 1};
-}
-
 void DrawPieChart(GraphRecord& graph, HDC dc) {
     FillBackground(graph, dc);
     DrawGraphTitle(graph, dc);
